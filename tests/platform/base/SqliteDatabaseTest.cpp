@@ -1,0 +1,140 @@
+#include "DataDir.h"
+#include "SqliteDatabase.h"
+#include "SqliteFaultInjector.h"
+#include "TempDataDir.h"
+
+#include <gtest/gtest.h>
+
+#include <fstream>
+#include <iterator>
+#include <string>
+
+using ct::db::Database;
+using ct::db::FaultInjector;
+using ct::db::ScopedWriteFailure;
+using ct::db::Transaction;
+
+namespace {
+
+std::string readFile(const std::string& path)
+{
+	std::ifstream in(path, std::ios::binary);
+	return {std::istreambuf_iterator<char>(in), std::istreambuf_iterator<char>()};
+}
+
+int countRows(Database& db)
+{
+	auto st = db.prepare("SELECT count(*) FROM t");
+	return st.step() == SQLITE_ROW ? st.columnInt(0) : -1;
+}
+
+int insertTwoRows(Database& db)
+{
+	Transaction tx(db);
+	if (tx.status() != SQLITE_OK)
+		return tx.status();
+	for (const char* text : {"first", "second"}) {
+		auto st = db.prepare("INSERT INTO t(v) VALUES(?)");
+		st.bind(1, text);
+		if (int rc = st.run(); rc != SQLITE_DONE)
+			return rc;
+	}
+	return tx.commit();
+}
+
+} // namespace
+
+TEST(SqliteDatabase, BindsTextLiterallyAndPersistsAcrossReopen)
+{
+	ct::test::TempDataDir dir;
+	const std::string path = dir.file("t.db");
+	{
+		Database db;
+		ASSERT_EQ(SQLITE_OK, db.open(path));
+		ASSERT_EQ(SQLITE_OK, db.exec("CREATE TABLE t(v TEXT)"));
+		auto st = db.prepare("INSERT INTO t(v) VALUES(?)");
+		st.bind(1, "x'); DROP TABLE t; --");
+		EXPECT_EQ(SQLITE_DONE, st.run());
+		st.reset();
+		st.bind(1, static_cast<const char*>(nullptr));
+		EXPECT_EQ(SQLITE_DONE, st.run());
+	}
+	Database db;
+	ASSERT_EQ(SQLITE_OK, db.open(path, ct::db::OpenMode::ReadOnly));
+	auto st = db.prepare("SELECT v FROM t ORDER BY rowid");
+	ASSERT_EQ(SQLITE_ROW, st.step());
+	EXPECT_EQ("x'); DROP TABLE t; --", st.columnText(0));
+	ASSERT_EQ(SQLITE_ROW, st.step());
+	EXPECT_TRUE(st.columnIsNull(0));
+	EXPECT_EQ(nullptr, st.columnTextPtr(0));
+	EXPECT_EQ(SQLITE_DONE, st.step());
+	EXPECT_FALSE(db.prepare("SELECT nonsense FROM").valid());
+}
+
+TEST(SqliteDatabase, ForeignFilesAndBadPathsAreReportedNotOverwritten)
+{
+	ct::test::TempDataDir dir;
+	const std::string garbage = dir.file("garbage.db");
+	std::string content(8192, 'z');
+	std::ofstream(garbage, std::ios::binary) << content;
+
+	Database db;
+	EXPECT_NE(SQLITE_OK, db.open(garbage));
+	EXPECT_FALSE(db.isOpen());
+	EXPECT_EQ(content, readFile(garbage));
+
+	const std::string notADir = dir.file("plain");
+	std::ofstream(notADir) << "x";
+	int rc = db.open(notADir + "/t.db");
+	EXPECT_NE(SQLITE_OK, rc);
+	EXPECT_EQ(-13, ct::db::toErrno(rc));
+	EXPECT_NE(0, ct::platform::makeDirectories(notADir + "/sub"));
+	EXPECT_EQ(-28, ct::db::toErrno(SQLITE_FULL));
+	EXPECT_EQ(-16, ct::db::toErrno(SQLITE_BUSY));
+	EXPECT_EQ(0, ct::db::toErrno(SQLITE_DONE));
+}
+
+TEST(SqliteDatabase, EveryFailedWriteLeavesTheTableAsItWas)
+{
+	ct::test::TempDataDir dir;
+	Database db;
+	ASSERT_EQ(SQLITE_OK, db.open(dir.file("t.db")));
+	ASSERT_EQ(SQLITE_OK, db.exec("CREATE TABLE t(v TEXT)"));
+	ASSERT_EQ(SQLITE_OK, insertTwoRows(db));
+
+	FaultInjector::resetCount();
+	ASSERT_EQ(SQLITE_OK, insertTwoRows(db));
+	const int writesPerSave = FaultInjector::writeCount();
+	ASSERT_GT(writesPerSave, 0);
+
+	int expected = 4;
+	int failures = 0;
+	for (int n = 1; n <= writesPerSave + 1; ++n) {
+		int rc;
+		{
+			ScopedWriteFailure failure(n);
+			rc = insertTwoRows(db);
+		}
+		if (rc == SQLITE_OK) {
+			expected += 2;
+		} else {
+			++failures;
+			EXPECT_EQ(SQLITE_FULL, rc) << "write " << n;
+		}
+		EXPECT_EQ(expected, countRows(db)) << "write " << n;
+	}
+	EXPECT_EQ(writesPerSave, failures);
+	EXPECT_EQ(SQLITE_OK, insertTwoRows(db));
+	Database reopened;
+	ASSERT_EQ(SQLITE_OK, reopened.open(dir.file("t.db")));
+	EXPECT_EQ(expected + 2, countRows(reopened));
+}
+
+TEST(DataDir, FollowsTheEnvironment)
+{
+	ct::test::TempDataDir dir;
+	EXPECT_EQ(dir.path(), ct::platform::dataDir());
+	EXPECT_EQ(dir.path() + "/x.db", ct::platform::dataPath("x.db"));
+	setenv("CONTACTS_DATA_DIR", (dir.path() + "/a/b/c").c_str(), 1);
+	EXPECT_EQ(dir.path() + "/a/b/c", ct::platform::dataDir());
+}

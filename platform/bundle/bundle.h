@@ -43,7 +43,7 @@ int bundle_add_str(bundle *b, const char *key, const char *str);
 int bundle_get_str(bundle *b, const char *key, char **str);
 /* Adds a copy of `len` strings (null entries are stored as ""). */
 int bundle_add_str_array(bundle *b, const char *key, const char **str_array, const int len);
-/* Borrowed array and strings; NULL (and get_last_result() set) when missing. */
+/* Borrowed array and strings; NULL when missing or not an array. */
 const char **bundle_get_str_array(bundle *b, const char *key, int *len);
 int bundle_del(bundle *b, const char *key);
 
@@ -67,9 +67,6 @@ int bundle_encode(bundle *b, bundle_raw **r, int *len);
 int bundle_free_encoded_rawdata(bundle_raw **r);
 /* Rebuilds a bundle from bundle_encode() output; NULL for malformed data. */
 bundle *bundle_decode(const bundle_raw *r, const int len);
-
-/* The result of the last bundle call on this thread. */
-int get_last_result(void);
 
 #ifdef __cplusplus
 }

@@ -43,28 +43,28 @@ bool isValidKey(const char* key)
 
 int addEntry(bundle* b, const char* key, int type, std::vector<std::string> values)
 {
-	WPRET_VM(!b || !isValidKey(key), (BUNDLE_ERROR_INVALID_PARAMETER), "invalid bundle or key");
+	WPRET_VM(!b || !isValidKey(key), BUNDLE_ERROR_INVALID_PARAMETER, "invalid bundle or key");
 	if (b->entries.count(key))
-		return (BUNDLE_ERROR_KEY_EXISTS);
+		return BUNDLE_ERROR_KEY_EXISTS;
 	keyval_t entry;
 	entry.type = type;
 	entry.setValues(std::move(values));
 	b->entries.emplace(key, std::move(entry));
-	return (BUNDLE_ERROR_NONE);
+	return BUNDLE_ERROR_NONE;
 }
 
 keyval_t* findEntry(bundle* b, const char* key, int* result)
 {
 	if (!b || !isValidKey(key)) {
-		*result = (BUNDLE_ERROR_INVALID_PARAMETER);
+		*result = BUNDLE_ERROR_INVALID_PARAMETER;
 		return nullptr;
 	}
 	auto it = b->entries.find(key);
 	if (it == b->entries.end()) {
-		*result = (BUNDLE_ERROR_KEY_NOT_AVAILABLE);
+		*result = BUNDLE_ERROR_KEY_NOT_AVAILABLE;
 		return nullptr;
 	}
-	*result = (BUNDLE_ERROR_NONE);
+	*result = BUNDLE_ERROR_NONE;
 	return &it->second;
 }
 
@@ -141,41 +141,39 @@ extern "C" {
 
 bundle* bundle_create(void)
 {
-	bundle* b = new (std::nothrow) _bundle_t;
-	(b ? BUNDLE_ERROR_NONE : BUNDLE_ERROR_OUT_OF_MEMORY);
-	return b;
+	return new (std::nothrow) _bundle_t;
 }
 
 int bundle_free(bundle* b)
 {
-	WPRET_VM(!b, (BUNDLE_ERROR_INVALID_PARAMETER), "bundle is null");
+	WPRET_VM(!b, BUNDLE_ERROR_INVALID_PARAMETER, "bundle is null");
 	delete b;
-	return (BUNDLE_ERROR_NONE);
+	return BUNDLE_ERROR_NONE;
 }
 
 int bundle_add_str(bundle* b, const char* key, const char* str)
 {
-	WPRET_VM(!str, (BUNDLE_ERROR_INVALID_PARAMETER), "value is null");
+	WPRET_VM(!str, BUNDLE_ERROR_INVALID_PARAMETER, "value is null");
 	return addEntry(b, key, BUNDLE_TYPE_STR, {str});
 }
 
 int bundle_get_str(bundle* b, const char* key, char** str)
 {
-	WPRET_VM(!str, (BUNDLE_ERROR_INVALID_PARAMETER), "out pointer is null");
+	WPRET_VM(!str, BUNDLE_ERROR_INVALID_PARAMETER, "out pointer is null");
 	*str = nullptr;
 	int result = BUNDLE_ERROR_NONE;
 	keyval_t* entry = findEntry(b, key, &result);
 	if (!entry)
 		return result;
 	if (entry->type != BUNDLE_TYPE_STR)
-		return (BUNDLE_ERROR_INVALID_PARAMETER);
+		return BUNDLE_ERROR_INVALID_PARAMETER;
 	*str = const_cast<char*>(entry->pointers[0]);
 	return result;
 }
 
 int bundle_add_str_array(bundle* b, const char* key, const char** str_array, const int len)
 {
-	WPRET_VM(len < 0 || (len > 0 && !str_array), (BUNDLE_ERROR_INVALID_PARAMETER),
+	WPRET_VM(len < 0 || (len > 0 && !str_array), BUNDLE_ERROR_INVALID_PARAMETER,
 		"invalid array (len %d)", len);
 	std::vector<std::string> values;
 	values.reserve(len);
@@ -192,10 +190,8 @@ const char** bundle_get_str_array(bundle* b, const char* key, int* len)
 	keyval_t* entry = findEntry(b, key, &result);
 	if (!entry)
 		return nullptr;
-	if (entry->type != BUNDLE_TYPE_STR_ARRAY) {
-		(BUNDLE_ERROR_INVALID_PARAMETER);
+	if (entry->type != BUNDLE_TYPE_STR_ARRAY)
 		return nullptr;
-	}
 	if (len)
 		*len = static_cast<int>(entry->values.size());
 	return entry->pointers.empty() ? nullptr : entry->pointers.data();
@@ -207,7 +203,7 @@ int bundle_del(bundle* b, const char* key)
 	if (!findEntry(b, key, &result))
 		return result;
 	b->entries.erase(key);
-	return (BUNDLE_ERROR_NONE);
+	return BUNDLE_ERROR_NONE;
 }
 
 int bundle_get_count(bundle* b)
@@ -224,15 +220,12 @@ int bundle_get_type(bundle* b, const char* key)
 
 bundle* bundle_dup(bundle* b_from)
 {
-	WPRET_VM(!b_from, ((BUNDLE_ERROR_INVALID_PARAMETER), nullptr), "bundle is null");
+	WPRET_VM(!b_from, nullptr, "bundle is null");
 	bundle* copy = new (std::nothrow) _bundle_t;
-	if (!copy) {
-		(BUNDLE_ERROR_OUT_OF_MEMORY);
+	if (!copy)
 		return nullptr;
-	}
 	for (const auto& [key, entry] : b_from->entries)
 		addEntry(copy, key.c_str(), entry.type, entry.values);
-	(BUNDLE_ERROR_NONE);
 	return copy;
 }
 
@@ -280,7 +273,7 @@ int bundle_keyval_get_array_val(bundle_keyval_t* kv, void*** array_val,
 
 int bundle_encode(bundle* b, bundle_raw** r, int* len)
 {
-	WPRET_VM(!b || !r || !len, (BUNDLE_ERROR_INVALID_PARAMETER), "invalid argument");
+	WPRET_VM(!b || !r || !len, BUNDLE_ERROR_INVALID_PARAMETER, "invalid argument");
 	std::string raw;
 	for (const auto& [key, entry] : b->entries) {
 		appendU32(raw, static_cast<uint32_t>(entry.type));
@@ -307,7 +300,7 @@ int bundle_free_encoded_rawdata(bundle_raw** r)
 
 bundle* bundle_decode(const bundle_raw* r, const int len)
 {
-	WPRET_VM(!r || len < 0, ((BUNDLE_ERROR_INVALID_PARAMETER), nullptr), "invalid data");
+	WPRET_VM(!r || len < 0, nullptr, "invalid data");
 	std::string text(reinterpret_cast<const char*>(r), len);
 	gsize size = 0;
 	guchar* raw = g_base64_decode(text.c_str(), &size);
@@ -320,10 +313,8 @@ bundle* bundle_decode(const bundle_raw* r, const int len)
 	if (!ok) {
 		WERROR("malformed bundle data (%d bytes)", len);
 		delete b;
-		(BUNDLE_ERROR_INVALID_PARAMETER);
 		return nullptr;
 	}
-	(BUNDLE_ERROR_NONE);
 	return b;
 }
 

@@ -1,6 +1,5 @@
 #include "CtRegistryMgr.h"
 #include "LogSink.h"
-#include "TempDataDir.h"
 
 #include <Ecore.h>
 #include <gtest/gtest.h>
@@ -35,7 +34,6 @@ class CtRegistryMgrTest : public ::testing::Test {
 protected:
 	void SetUp() override { ecore_init(); }
 	void TearDown() override { ecore_shutdown(); }
-	ct::test::TempDataDir m_dir;
 };
 
 } // namespace

@@ -1,6 +1,5 @@
 #include "CtSimMgr.h"
 #include "CtThread.h"
-#include "TempDataDir.h"
 
 #include <Ecore.h>
 #include <gtest/gtest.h>
@@ -29,7 +28,6 @@ class CtSimMgrTest : public ::testing::Test {
 protected:
 	void SetUp() override { ecore_init(); }
 	void TearDown() override { ecore_shutdown(); }
-	ct::test::TempDataDir m_dir;
 };
 
 } // namespace

@@ -1,0 +1,108 @@
+#include "AppControlRouter.h"
+#include "ContactsAppControlLauncher.h"
+
+#include <Elementary.h>
+#include <gtest/gtest.h>
+
+namespace {
+
+template <typename Pred>
+bool pumpUntil(Pred done, double seconds)
+{
+	double end = ecore_time_get() + seconds;
+	while (!done() && ecore_time_get() < end)
+		ecore_main_loop_iterate();
+	return done();
+}
+
+struct Received {
+	int replies = 0;
+	app_control_result_e result = APP_CONTROL_RESULT_FAILED;
+};
+
+void onReply(app_control_h, app_control_h, app_control_result_e result, void* data)
+{
+	auto* received = static_cast<Received*>(data);
+	++received->replies;
+	received->result = result;
+}
+
+app_control_h makeRequest(const char* appId)
+{
+	app_control_h request = nullptr;
+	app_control_create(&request);
+	app_control_set_app_id(request, appId);
+	return request;
+}
+
+class ContactsAppControlLauncherTest : public ::testing::Test {
+protected:
+	void SetUp() override
+	{
+		elm_init(0, nullptr);
+		m_window = elm_win_add(nullptr, "launcher", ELM_WIN_BASIC);
+	}
+	void TearDown() override
+	{
+		evas_object_del(m_window);
+		elm_shutdown();
+	}
+	Evas_Object* m_window = nullptr;
+};
+
+} // namespace
+
+TEST_F(ContactsAppControlLauncherTest, SendsRepliesAndTerminates)
+{
+	auto* launcher = ContactsAppControlLauncher::getInstance();
+	int terminated = 0;
+	auto registration = ct::appcontrol::registerAppHandler("org.test.gallery",
+		[](app_control_h, const ct::appcontrol::Reply& reply) {
+			reply(nullptr, APP_CONTROL_RESULT_SUCCEEDED);
+			return 0;
+		},
+		[&] { ++terminated; });
+
+	app_control_h request = makeRequest("org.test.gallery");
+	EXPECT_TRUE(launcher->sendLaunchRequest(request));
+	Received received;
+	EXPECT_TRUE(launcher->sendAsyncLaunchRequest(request, onReply, &received, m_window));
+	EXPECT_EQ(0, received.replies);
+	EXPECT_TRUE(pumpUntil([&] { return received.replies > 0; }, 2.0));
+	EXPECT_EQ(APP_CONTROL_RESULT_SUCCEEDED, received.result);
+
+	app_control_destroy(request);
+
+	auto running = ct::appcontrol::registerAppHandler("org.test.player",
+		[](app_control_h, const ct::appcontrol::Reply&) { return 0; }, [&] { ++terminated; });
+	app_control_h play = makeRequest("org.test.player");
+	ASSERT_TRUE(launcher->sendLaunchRequest(play));
+	app_control_destroy(play);
+	launcher->terminate();
+	launcher->terminate();
+	EXPECT_EQ(1, terminated);
+
+	app_control_h nobody = makeRequest("org.test.nobody");
+	EXPECT_FALSE(launcher->sendLaunchRequest(nobody));
+	EXPECT_FALSE(launcher->sendLaunchRequest(nullptr));
+	app_control_destroy(nobody);
+}
+
+TEST_F(ContactsAppControlLauncherTest, ReplyIsDroppedWhenTheOwnerObjectDies)
+{
+	ct::appcontrol::Reply later;
+	auto registration = ct::appcontrol::registerAppHandler("org.test.camera",
+		[&](app_control_h, const ct::appcontrol::Reply& reply) {
+			later = reply;
+			return 0;
+		});
+	Evas_Object* owner = elm_layout_add(m_window);
+	app_control_h request = makeRequest("org.test.camera");
+	Received received;
+	ASSERT_TRUE(ContactsAppControlLauncher::getInstance()->sendAsyncLaunchRequest(request, onReply, &received, owner));
+	evas_object_del(owner);
+	later(nullptr, APP_CONTROL_RESULT_SUCCEEDED);
+	pumpUntil([] { return false; }, 0.2);
+	EXPECT_EQ(0, received.replies);
+	app_control_destroy(request);
+}

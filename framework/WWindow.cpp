@@ -1,0 +1,61 @@
+#include "WWindow.h"
+
+#include "ContactsDebug.h"
+
+namespace app_assist {
+
+WWindow::WWindow(const char* name, int width, int height)
+{
+	m_win = elm_win_add(nullptr, name ? name : "contacts", ELM_WIN_BASIC);
+	WPRET_M(!m_win, "elm_win_add() failed");
+	elm_win_title_set(m_win, name ? name : "contacts");
+	elm_win_autodel_set(m_win, EINA_FALSE);
+	evas_object_event_callback_add(m_win, EVAS_CALLBACK_DEL, __winDelCb, this);
+
+	Evas_Object* bg = elm_bg_add(m_win);
+	evas_object_size_hint_weight_set(bg, EVAS_HINT_EXPAND, EVAS_HINT_EXPAND);
+	elm_win_resize_object_add(m_win, bg);
+	evas_object_show(bg);
+
+	m_conformant = elm_conformant_add(m_win);
+	evas_object_size_hint_weight_set(m_conformant, EVAS_HINT_EXPAND, EVAS_HINT_EXPAND);
+	elm_win_resize_object_add(m_win, m_conformant);
+	evas_object_show(m_conformant);
+
+	m_baseLayout = elm_layout_add(m_conformant);
+	elm_layout_theme_set(m_baseLayout, "layout", "application", "default");
+	evas_object_size_hint_weight_set(m_baseLayout, EVAS_HINT_EXPAND, EVAS_HINT_EXPAND);
+	elm_object_content_set(m_conformant, m_baseLayout);
+	evas_object_show(m_baseLayout);
+
+	if (width > 0 && height > 0)
+		evas_object_resize(m_win, width, height);
+	evas_object_show(m_win);
+}
+
+WWindow::~WWindow()
+{
+	if (m_win) {
+		evas_object_event_callback_del_full(m_win, EVAS_CALLBACK_DEL, __winDelCb, this);
+		evas_object_del(m_win);
+	}
+}
+
+void WWindow::setContent(Evas_Object* content)
+{
+	WPRET_M(!m_baseLayout, "window has no base layout");
+	Evas_Object* old = elm_object_part_content_unset(m_baseLayout, "elm.swallow.content");
+	if (old && old != content)
+		evas_object_del(old);
+	elm_object_part_content_set(m_baseLayout, "elm.swallow.content", content);
+}
+
+void WWindow::__winDelCb(void* data, Evas*, Evas_Object*, void*)
+{
+	auto* self = static_cast<WWindow*>(data);
+	self->m_win = nullptr;
+	self->m_conformant = nullptr;
+	self->m_baseLayout = nullptr;
+}
+
+} // namespace app_assist

@@ -6,6 +6,8 @@
 
 #include <phonenumbers/phonenumberutil.h>
 
+#include <libintl.h>
+
 #include <cctype>
 #include <cstdlib>
 #include <cstring>
@@ -18,6 +20,7 @@ using i18n::phonenumbers::PhoneNumberUtil;
 namespace {
 
 constexpr size_t kMaxNumberBytes = 1024;
+constexpr const char* kTextDomain = "contacts";
 constexpr const char* kInstalledResDir = "/usr/share/contacts-details/res";
 
 bool fileExists(const std::string& path)
@@ -159,6 +162,25 @@ std::string ContactsCommon::removeNumberDashes(const char* number)
 		if (*p != '-')
 			out += *p;
 	return out;
+}
+
+void ContactsCommon::bindTextDomain()
+{
+	static std::string boundDir;
+	std::string dir = getLocaleDir();
+	if (dir == boundDir)
+		return;
+	bindtextdomain(kTextDomain, dir.c_str());
+	bind_textdomain_codeset(kTextDomain, "UTF-8");
+	boundDir = dir;
+}
+
+const char* ContactsCommon::translate(const char* textId)
+{
+	if (!textId)
+		return "";
+	bindTextDomain();
+	return dgettext(kTextDomain, textId);
 }
 
 bool ContactsCommon::checkCallManagerReady()

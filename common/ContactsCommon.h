@@ -29,6 +29,13 @@ public:
 	// else of "db/csc/country_iso", else "US".
 	static std::string getRegionCode();
 
+	// Binds the text domain "contacts" to the compiled catalogues (again when
+	// the resource folder changed). Idempotent.
+	static void bindTextDomain();
+	// The text of a translation id in the current language (the id itself
+	// when the catalogue has none). Borrowed; valid until the language changes.
+	static const char* translate(const char* textId);
+
 	// Whether the call manager takes calls now.
 	static bool checkCallManagerReady();
 };

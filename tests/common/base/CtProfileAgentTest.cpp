@@ -1,0 +1,113 @@
+#include "CtContactsAgentMgr.h"
+#include "CtContactsAgentUtil.h"
+#include "CtRegistryMgr.h"
+#include "TempDataDir.h"
+
+#include <app_preference.h>
+
+#include <Ecore.h>
+#include <gtest/gtest.h>
+
+#include <cstdlib>
+#include <vector>
+
+namespace {
+
+template <typename Pred>
+bool pumpUntil(Pred done, double seconds)
+{
+	double end = ecore_time_get() + seconds;
+	while (!done() && ecore_time_get() < end)
+		ecore_main_loop_iterate();
+	return done();
+}
+
+class CtProfileAgentTest : public ::testing::Test {
+protected:
+	void SetUp() override { ecore_init(); }
+	void TearDown() override { ecore_shutdown(); }
+	ct::test::TempDataDir m_dir;
+};
+
+void countSync(int result, void* data)
+{
+	if (result == 0)
+		++*static_cast<int*>(data);
+}
+
+} // namespace
+
+TEST_F(CtProfileAgentTest, SettingsPersistAndDefaultsHold)
+{
+	auto* agent = CtContactsAgentMgr::getInstance();
+	EXPECT_EQ(1, agent->getPrivacyLevel());
+	EXPECT_EQ(0, agent->getProfileType());
+	EXPECT_FALSE(agent->getProfileProperty(CT_PROFILE_PROPERTY_ADDRESS));
+
+	std::vector<std::pair<int, int>> signals;
+	int id = CtRegistryMgr::getInstance()->addChangeListener(
+		[&](ctRegistryKey key, int value) { signals.emplace_back(key, value); });
+	EXPECT_TRUE(agent->setPrivacyLevel(3));
+	EXPECT_FALSE(agent->setPrivacyLevel(4));
+	EXPECT_TRUE(agent->setProfileType(1));
+	EXPECT_FALSE(agent->setProfileType(7));
+	EXPECT_TRUE(agent->setProfileProperty(CT_PROFILE_PROPERTY_ADDRESS, true));
+	EXPECT_FALSE(agent->setProfileProperty(CT_PROFILE_PROPERTY_MAX, true));
+	CtRegistryMgr::getInstance()->removeChangeListener(id);
+
+	EXPECT_EQ(3, CtContactsAgentUtil::getPreferenceProfilePrivacyLevel());
+	EXPECT_EQ(1, CtContactsAgentUtil::getPreferenceProfileType());
+	EXPECT_TRUE(agent->getProfileProperty(CT_PROFILE_PROPERTY_ADDRESS));
+	EXPECT_EQ(2u, signals.size());
+	for (const auto& s : signals)
+		EXPECT_EQ(std::make_pair(14, 2), s);
+}
+
+TEST_F(CtProfileAgentTest, ShareWithListRoundTripsAndMarksTheChoice)
+{
+	int* ids = nullptr;
+	EXPECT_EQ(0, CtContactsAgentUtil::getPreferenceSelectedContactsList(&ids));
+	EXPECT_EQ(nullptr, ids);
+	EXPECT_EQ(0, CtContactsAgentUtil::getPreferenceSelectedContactsList(nullptr));
+
+	const int chosen[] = {12, 5, 99};
+	ASSERT_TRUE(CtContactsAgentMgr::getInstance()->setPermittedList(chosen, 3));
+	bool set = false;
+	EXPECT_EQ(0, preference_get_boolean("my_profile_sharing_selected_contacts_set", &set));
+	EXPECT_TRUE(set);
+	ASSERT_EQ(3, CtContactsAgentUtil::getPreferenceSelectedContactsList(&ids));
+	EXPECT_EQ(12, ids[0]);
+	EXPECT_EQ(99, ids[2]);
+	free(ids);
+
+	// A damaged stored list gives the ids it still holds.
+	ASSERT_EQ(0, preference_set_string("profile_sharing_permitted_list", "7,x,-3,,8"));
+	ASSERT_EQ(2, CtContactsAgentUtil::getPreferenceSelectedContactsList(&ids));
+	EXPECT_EQ(8, ids[1]);
+	free(ids);
+	EXPECT_FALSE(CtContactsAgentMgr::getInstance()->setPermittedList(nullptr, 2));
+	EXPECT_TRUE(CtContactsAgentMgr::getInstance()->setPermittedList(nullptr, 0));
+	EXPECT_EQ(0, CtContactsAgentUtil::getPreferenceSelectedContactsList(&ids));
+}
+
+TEST_F(CtProfileAgentTest, SyncsAreRecordedAndCallBackUnlessCancelled)
+{
+	auto* agent = CtContactsAgentMgr::getInstance();
+	agent->clearSyncRequests();
+	int done = 0, cancelled = 0;
+	EXPECT_EQ(0, agent->syncStart(countSync, &done));
+	EXPECT_EQ(0, agent->syncDataStart(42, countSync, &cancelled));
+	EXPECT_NE(0, agent->syncDataStart(0));
+	EXPECT_EQ(0, agent->syncStartForProfile());
+	agent->cancelCallbacks(&cancelled);
+	EXPECT_EQ(0, done);
+	EXPECT_TRUE(pumpUntil([&] { return done > 0; }, 1.0));
+	pumpUntil([] { return false; }, 0.1);
+	EXPECT_EQ(0, cancelled);
+
+	const auto& requests = agent->getSyncRequests();
+	ASSERT_EQ(3u, requests.size());
+	EXPECT_EQ(CtContactsAgentMgr::SyncKind::PersonData, requests[1].kind);
+	EXPECT_EQ(42, requests[1].personId);
+	EXPECT_EQ(CtContactsAgentMgr::SyncKind::Profile, requests[2].kind);
+}

@@ -1,0 +1,92 @@
+#include "CtView.h"
+#include "LogSink.h"
+#include "TempDataDir.h"
+
+#include <vconf.h>
+
+#include <Elementary.h>
+#include <gtest/gtest.h>
+
+#include <memory>
+
+namespace {
+
+template <typename Pred>
+bool pumpUntil(Pred done, double seconds)
+{
+	double end = ecore_time_get() + seconds;
+	while (!done() && ecore_time_get() < end)
+		ecore_main_loop_iterate();
+	return done();
+}
+
+class CountingView : public CtView {
+public:
+	explicit CountingView(std::unique_ptr<CountingView>* closeOnChange = nullptr)
+		: m_closeOnChange(closeOnChange) {}
+	void onLanguageChanged() override
+	{
+		++changes;
+		if (m_closeOnChange)
+			m_closeOnChange->reset();
+	}
+	int changes = 0;
+
+private:
+	std::unique_ptr<CountingView>* m_closeOnChange;
+};
+
+class CtViewTest : public ::testing::Test {
+protected:
+	void SetUp() override
+	{
+		elm_init(0, nullptr);
+		m_window = elm_win_add(nullptr, "ctview", ELM_WIN_BASIC);
+	}
+	void TearDown() override
+	{
+		evas_object_del(m_window);
+		elm_shutdown();
+	}
+	Evas_Object* m_window = nullptr;
+};
+
+} // namespace
+
+TEST_F(CtViewTest, LanguageChangeReachesEveryOpenScreen)
+{
+	auto first = std::make_unique<CountingView>();
+	std::unique_ptr<CountingView> closed = std::make_unique<CountingView>();
+	CountingView closer(&closed);
+	EXPECT_EQ(3, CtView::getOpenViewCount());
+
+	CtView::changeLanguage("de_DE.UTF-8");
+	EXPECT_EQ(1, first->changes);
+	EXPECT_EQ(1, closer.changes);
+	EXPECT_FALSE(closed) << "closed by another screen while re-translating";
+	EXPECT_EQ(2, CtView::getOpenViewCount());
+
+	ASSERT_EQ(0, vconf_set_str(VCONFKEY_LANGSET, "en_US.UTF-8"));
+	EXPECT_TRUE(pumpUntil([&] { return first->changes == 2; }, 2.0));
+	first.reset();
+	EXPECT_EQ(1, CtView::getOpenViewCount());
+	CtView::changeLanguage(nullptr);
+	EXPECT_EQ(2, closer.changes);
+}
+
+TEST_F(CtViewTest, BaseLayoutFailsCleanlyWithoutItsResources)
+{
+	ct::test::TempDataDir dir;
+	const char* previous = getenv("CONTACTS_RES_DIR");
+	std::string saved = previous ? previous : "";
+	setenv("CONTACTS_RES_DIR", dir.path().c_str(), 1);
+
+	CountingView view;
+	ct::log::clear();
+	EXPECT_EQ(nullptr, view.createBaseLayout(m_window, nullptr, nullptr));
+	EXPECT_TRUE(ct::log::contains("* Critical * ctCommonCreateLayout() is fail"));
+	EXPECT_EQ(nullptr, view.createBaseLayout(nullptr, nullptr, nullptr));
+	EXPECT_EQ(nullptr, view.createBaseLayout(m_window, "contacts/detail_layout.edj", "no/such/group"));
+
+	setenv("CONTACTS_RES_DIR", saved.c_str(), 1);
+}

@@ -1,0 +1,17 @@
+// Starts the toolkit once for the whole program: repeated elm_init/shutdown
+// cycles are not something the toolkit promises to survive.
+#include <Elementary.h>
+#include <gtest/gtest.h>
+
+namespace {
+
+class ToolkitEnvironment : public testing::Environment {
+public:
+	void SetUp() override { elm_init(0, nullptr); }
+	void TearDown() override { elm_shutdown(); }
+};
+
+const testing::Environment* const registered =
+	testing::AddGlobalTestEnvironment(new ToolkitEnvironment);
+
+} // namespace

@@ -72,7 +72,7 @@ TEST(ItemStyleShot, PlainRowsKeepTheirHeightsAndWrapLongTexts)
 		{"prediction.2line.top", {{"elm.text.main.left.top", "<match>Ann</match>ika Holm"},
 			{"elm.text.sub.left.bottom", "+46 70 123 45 67"}}},
 	};
-	Shot shot = shoot("items_plain", rows);
+	Shot shot = shoot("items_plain", rows, 900);
 	EXPECT_TRUE(shot.saved);
 	ASSERT_EQ(shot.heights.size(), rows.size());
 	EXPECT_EQ(shot.heights[0], 56);

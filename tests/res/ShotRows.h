@@ -32,6 +32,8 @@ struct ShotRow {
 	std::map<std::string, ContentMaker> contents;
 	bool disabled = false;
 	bool selected = false;
+	// Edje signals sent to the row once it is realized, as the screens do.
+	std::vector<std::string> signals;
 };
 
 // Appends the rows to a compress-mode genlist; the rows must outlive it.

@@ -5,8 +5,10 @@
 #include <Ecore_Evas.h>
 #include <Ecore_File.h>
 #include <Edje.h>
+#include <Elementary.h>
 #include <gtest/gtest.h>
 
+#include <filesystem>
 #include <string>
 #include <vector>
 
@@ -273,4 +275,36 @@ TEST(ThemeGroups, SwitchesOfTheScreensReachTheirParts)
 	EXPECT_EQ(stateAfter(shareWith, "btn.disable", "touch.event.area", "touch.event.area"), "disabled");
 	EXPECT_EQ(stateAfter(shareWith, "btn.enable", "touch.event.area", "touch.event.area"), "default");
 	evas_object_del(shareWith);
+}
+
+TEST(ThemeGroups, EveryImageOfTheSourceTreeIsAlsoAnImageGroup)
+{
+	int images = 0;
+	for (const auto& entry : std::filesystem::directory_iterator(sourceRoot() + "/res/images")) {
+		if (entry.path().extension() != ".png")
+			continue;
+		++images;
+		std::string name = entry.path().filename().string();
+		EXPECT_TRUE(edje_file_group_exists(edjePath("image_layout.edj").c_str(), name.c_str())) << name;
+	}
+	EXPECT_GE(images, static_cast<int>(namedImages.size()));
+}
+
+TEST(ThemeGroups, FavouriteStarFollowsTheCheckState)
+{
+	elm_theme_extension_add(nullptr, edjePath("detail_layout.edj").c_str());
+	Evas_Object* win = elm_win_add(nullptr, "star", ELM_WIN_BASIC);
+	Evas_Object* star = elm_check_add(win);
+	EXPECT_TRUE(elm_object_style_set(star, "favorite_contact"));
+	Evas_Object* edje = elm_layout_edje_get(star);
+	ASSERT_NE(edje, nullptr);
+	double value = 0;
+	elm_check_state_set(star, EINA_TRUE);
+	edje_object_message_signal_process(edje);
+	EXPECT_STREQ(edje_object_part_state_get(edje, "star", &value), "on");
+	elm_check_state_set(star, EINA_FALSE);
+	edje_object_message_signal_process(edje);
+	EXPECT_STREQ(edje_object_part_state_get(edje, "star", &value), "default");
+	evas_object_del(win);
+	elm_theme_extension_del(nullptr, edjePath("detail_layout.edj").c_str());
 }

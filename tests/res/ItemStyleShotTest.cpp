@@ -6,6 +6,10 @@
 
 #include <gtest/gtest.h>
 
+#include <cstdarg>
+#include <cstdio>
+#include <cstring>
+
 #include <string>
 #include <vector>
 
@@ -20,10 +24,34 @@ const std::string longText =
 struct Shot {
 	std::vector<int> heights;
 	bool saved = false;
+	std::vector<std::string> missingStyles;
+};
+
+// Collects the toolkit's complaints about item styles it could not find
+// while it is installed.
+class MissingStyleLog {
+public:
+	MissingStyleLog() { eina_log_print_cb_set(&MissingStyleLog::printCb, this); }
+	~MissingStyleLog() { eina_log_print_cb_set(eina_log_print_cb_stderr, nullptr); }
+	MissingStyleLog(const MissingStyleLog&) = delete;
+	MissingStyleLog& operator=(const MissingStyleLog&) = delete;
+
+	std::vector<std::string> lines;
+
+private:
+	static void printCb(const Eina_Log_Domain*, Eina_Log_Level, const char*, const char*, int,
+		const char* fmt, void* data, va_list args)
+	{
+		char text[512];
+		vsnprintf(text, sizeof(text), fmt, args);
+		if (strstr(text, "not a valid genlist item style"))
+			static_cast<MissingStyleLog*>(data)->lines.emplace_back(text);
+	}
 };
 
 Shot shoot(const std::string& name, std::vector<ShotRow>& rows, int height = 640)
 {
+	MissingStyleLog log;
 	ThemeShot canvas(360, height);
 	Evas_Object* genlist = elm_genlist_add(canvas.box());
 	elm_genlist_mode_set(genlist, ELM_LIST_COMPRESS);
@@ -48,6 +76,7 @@ Shot shoot(const std::string& name, std::vector<ShotRow>& rows, int height = 640
 		shot.heights.push_back(h);
 	}
 	shot.saved = canvas.save(outputDir() + "/" + name + ".png");
+	shot.missingStyles = log.lines;
 	return shot;
 }
 
@@ -78,6 +107,7 @@ TEST(ItemStyleShot, PlainRowsKeepTheirHeightsAndWrapLongTexts)
 	};
 	Shot shot = shoot("items_plain", rows, 900);
 	EXPECT_TRUE(shot.saved);
+	EXPECT_TRUE(shot.missingStyles.empty()) << shot.missingStyles.front();
 	ASSERT_EQ(shot.heights.size(), rows.size());
 	EXPECT_EQ(shot.heights[0], 56);
 	EXPECT_EQ(shot.heights[1], 56);
@@ -131,6 +161,7 @@ TEST(ItemStyleShot, InputRowsHoldTheirFieldsAndGrowWithThem)
 	};
 	Shot shot = shoot("items_input", rows, 720);
 	EXPECT_TRUE(shot.saved);
+	EXPECT_TRUE(shot.missingStyles.empty()) << shot.missingStyles.front();
 	ASSERT_EQ(shot.heights.size(), rows.size());
 	EXPECT_GE(shot.heights[0], 120) << "two name fields and the picture fit";
 	for (size_t i = 1; i <= 4; ++i)
@@ -172,6 +203,7 @@ TEST(ItemStyleShot, DetailRowsShowLabelValueAndActions)
 	};
 	Shot shot = shoot("items_detail", rows, 1000);
 	EXPECT_TRUE(shot.saved);
+	EXPECT_TRUE(shot.missingStyles.empty()) << shot.missingStyles.front();
 	ASSERT_EQ(shot.heights.size(), rows.size());
 	EXPECT_EQ(shot.heights[0], 270);
 	EXPECT_EQ(shot.heights[1], 72);
@@ -202,6 +234,7 @@ TEST(ItemStyleShot, ProfileAndShareRows)
 	rows[0].signals = {"show,2icon", "hide,bg"};
 	Shot shot = shoot("items_profile", rows, 720);
 	EXPECT_TRUE(shot.saved);
+	EXPECT_TRUE(shot.missingStyles.empty()) << shot.missingStyles.front();
 	ASSERT_EQ(shot.heights.size(), rows.size());
 	EXPECT_EQ(shot.heights[0], 288);
 	EXPECT_GE(shot.heights[1], shot.heights[2]);

@@ -3,11 +3,18 @@
 #include <Elementary.h>
 #include <gtest/gtest.h>
 
+#include <cstdlib>
+
 namespace {
 
 class ToolkitEnvironment : public testing::Environment {
 public:
-	void SetUp() override { elm_init(0, nullptr); }
+	void SetUp() override
+	{
+		if (!getenv("CONTACTS_RES_DIR"))
+			ADD_FAILURE() << "CONTACTS_RES_DIR must name the build's resource folder (ctest sets it)";
+		elm_init(0, nullptr);
+	}
 	void TearDown() override { elm_shutdown(); }
 };
 

@@ -237,6 +237,7 @@ TEST(ThemeGroups, ItemsShowSelectionDisablingAndHiddenDivider)
 	EXPECT_EQ(stateAfter(row, "elm,state,disabled", "elm", "clip"), "disabled");
 	EXPECT_EQ(stateAfter(row, "elm,state,enabled", "elm", "clip"), "default");
 	EXPECT_EQ(stateAfter(row, "elm,state,bottomline,hide", "", "bottomline"), "hidden");
+	EXPECT_EQ(stateAfter(row, "play_sound", "", "base"), "selected") << "a tap flashes the row";
 	evas_object_del(row);
 }
 

@@ -196,12 +196,15 @@ TEST(ItemStyleShot, DetailRowsShowLabelValueAndActions)
 			{{"elm.icon.right", action("contacts_btn_ic_map.png")}}},
 		{"detail/multiline_main.sub", {{"elm.text.sub", "Notes"},
 			{"elm.text.multiline", "Met at the spring fair."}}},
+		{"detail.multi.image/low", {}, {{"elm.icon", layout("detail_layout.edj",
+			"layout/detail/contact_image/low_resolution", {{"elm.swallow.content",
+				icon("contacts_caller_id_default_02.png", 96)}})}}},
 		{"linked.1text.8icon", {{"elm.text", "Linked contacts"}},
 			{{"elm.icon.1", icon("contacts_list_ic_device.png")},
 			{"elm.icon.2", icon("logs_icon_sim_1_62.png")},
 			{"elm.icon.8", icon("contacts_ic_linked.png")}}},
 	};
-	Shot shot = shoot("items_detail", rows, 1000);
+	Shot shot = shoot("items_detail", rows, 1300);
 	EXPECT_TRUE(shot.saved);
 	EXPECT_TRUE(shot.missingStyles.empty()) << shot.missingStyles.front();
 	ASSERT_EQ(shot.heights.size(), rows.size());
@@ -209,6 +212,7 @@ TEST(ItemStyleShot, DetailRowsShowLabelValueAndActions)
 	EXPECT_EQ(shot.heights[1], 72);
 	EXPECT_EQ(shot.heights[2], 72) << "the block mark and the backing keep the row height";
 	EXPECT_GT(shot.heights[5], shot.heights[6]) << "a long address wraps";
+	EXPECT_EQ(shot.heights[7], 270) << "a small picture keeps the picture row height";
 }
 
 TEST(ItemStyleShot, ProfileAndShareRows)

@@ -17,6 +17,7 @@ namespace ct::feature {
 namespace {
 
 const int kMaxFileBytes = 1 << 20;
+const time_t kRacySeconds = 2;
 
 std::string trim(const std::string& text)
 {
@@ -91,7 +92,9 @@ void FeatureFlags::__reloadIfChanged()
 	std::string path = ct::platform::dataPath("features.conf");
 	struct stat st {};
 	bool exists = !path.empty() && stat(path.c_str(), &st) == 0;
-	bool same = path == m_path && exists == m_exists
+	// A file changed twice within the clock's granularity keeps its mtime:
+	// while the last load saw a fresh mtime, read the file again.
+	bool same = !m_racy && path == m_path && exists == m_exists
 		&& (!exists || (st.st_mtim.tv_sec == m_mtime.tv_sec && st.st_mtim.tv_nsec == m_mtime.tv_nsec
 			&& st.st_size == m_size && st.st_ino == m_inode));
 	if (same)
@@ -101,12 +104,14 @@ void FeatureFlags::__reloadIfChanged()
 	m_mtime = exists ? st.st_mtim : timespec{};
 	m_size = exists ? st.st_size : 0;
 	m_inode = exists ? st.st_ino : 0;
+	m_racy = exists && time(nullptr) - st.st_mtim.tv_sec < kRacySeconds;
 	m_fileFlags.clear();
 	if (exists && st.st_size > kMaxFileBytes)
 		WERROR("%s is larger than %d bytes; ignored", path.c_str(), kMaxFileBytes);
 	else if (exists)
 		m_fileFlags = parseFile(readFile(path));
-	WINFO("feature flags reloaded from %s (%zu set)", path.c_str(), m_fileFlags.size());
+	if (!m_racy)
+		WINFO("feature flags reloaded from %s (%zu set)", path.c_str(), m_fileFlags.size());
 }
 
 std::map<int, bool> FeatureFlags::parseFile(const std::string& text)

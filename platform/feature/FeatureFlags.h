@@ -36,6 +36,7 @@ private:
 	timespec m_mtime{};
 	off_t m_size = 0;
 	ino_t m_inode = 0;
+	bool m_racy = false;
 	std::map<int, bool> m_fileFlags;
 };
 

@@ -14,6 +14,7 @@ SharedStore::~SharedStore() = default;
 KeyValueStore* SharedStore::get(int* error)
 {
 	std::string path = ct::platform::dataPath(m_fileName);
+	std::lock_guard<std::mutex> lock(m_mutex);
 	if (m_store && m_store->path() == path)
 		return m_store.get();
 	auto store = std::make_unique<KeyValueStore>();
@@ -28,6 +29,7 @@ KeyValueStore* SharedStore::get(int* error)
 
 void SharedStore::close()
 {
+	std::lock_guard<std::mutex> lock(m_mutex);
 	m_store.reset();
 }
 

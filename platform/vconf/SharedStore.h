@@ -6,6 +6,7 @@
 #include "KeyValueStore.h"
 
 #include <memory>
+#include <mutex>
 #include <string>
 
 namespace ct::kv {
@@ -25,6 +26,7 @@ public:
 
 private:
 	std::string m_fileName;
+	std::mutex m_mutex;
 	std::unique_ptr<KeyValueStore> m_store;
 };
 

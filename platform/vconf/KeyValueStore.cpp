@@ -190,6 +190,17 @@ void KeyValueStore::addObserver(const std::string& key, const void* tag, Observe
 	__ensureWatcher();
 }
 
+void KeyValueStore::takeObserversFrom(KeyValueStore& other)
+{
+	for (auto& [key, list] : other.m_observers) {
+		for (auto& registration : list)
+			addObserver(key, registration->tag, registration->observer);
+		for (auto& registration : list)
+			registration->active = false;
+	}
+	other.m_observers.clear();
+}
+
 bool KeyValueStore::removeObserver(const std::string& key, const void* tag)
 {
 	auto found = m_observers.find(key);

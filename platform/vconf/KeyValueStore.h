@@ -75,6 +75,9 @@ public:
 	void addObserver(const std::string& key, const void* tag, Observer observer);
 	// True when there was such an observer.
 	bool removeObserver(const std::string& key, const void* tag);
+	// Takes over every observer of `other` (which keeps none), so listeners
+	// survive the store being reopened elsewhere.
+	void takeObserversFrom(KeyValueStore& other);
 
 	// kOk when `key` is non-empty UTF-8 of at most kMaxKeyBytes; else kInvalid.
 	static int validateKey(const char* key);

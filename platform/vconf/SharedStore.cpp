@@ -23,6 +23,8 @@ KeyValueStore* SharedStore::get(int* error)
 		*error = rc;
 	if (rc != kOk)
 		return nullptr;
+	if (m_store)
+		store->takeObserversFrom(*m_store);
 	m_store = std::move(store);
 	return m_store.get();
 }

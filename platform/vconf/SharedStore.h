@@ -1,6 +1,6 @@
 // The process-wide KeyValueStore behind a C interface (vconf, preferences):
-// opened on first use in the current data folder and reopened when the data
-// folder changes.
+// opened on first use in the current data folder and reopened, with its
+// observers, when the data folder changes.
 #pragma once
 
 #include "KeyValueStore.h"

@@ -230,6 +230,18 @@ TEST_F(Vconf, CallbacksSeeOwnChangesOnTheMainLoop)
 	EXPECT_EQ(2u, second.names.size());
 }
 
+TEST_F(Vconf, CallbacksFollowTheStoreToANewDataFolder)
+{
+	Recorder recorder;
+	ASSERT_EQ(VCONF_OK, vconf_notify_key_changed(VCONFKEY_SETAPPL_PSMODE, recordCb, &recorder));
+	ct::test::TempDataDir other;
+	EXPECT_EQ(0, getInt(VCONFKEY_SETAPPL_PSMODE)) << "the new folder starts from the defaults";
+	ASSERT_EQ(VCONF_OK, vconf_set_int(VCONFKEY_SETAPPL_PSMODE, 1));
+	ASSERT_TRUE(ct::test::pumpUntil([&] { return !recorder.ints.empty(); }));
+	EXPECT_EQ(1, recorder.ints[0]);
+	EXPECT_EQ(VCONF_OK, vconf_ignore_key_changed(VCONFKEY_SETAPPL_PSMODE, recordCb));
+}
+
 namespace {
 
 struct RemovingRecorder {

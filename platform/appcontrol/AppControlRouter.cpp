@@ -209,6 +209,16 @@ public:
 		return dropped;
 	}
 
+	size_t pendingFor(void* userData) const
+	{
+		size_t count = 0;
+		for (const auto& entry : m_launches)
+			count += entry.second.replyCb && entry.second.userData == userData ? 1 : 0;
+		for (const Delivery& delivery : m_deliveries)
+			count += delivery.userData == userData ? 1 : 0;
+		return count;
+	}
+
 	std::vector<LaunchRecord> records() const
 	{
 		std::vector<LaunchRecord> out;
@@ -417,6 +427,11 @@ std::string LaunchRecord::extra(const std::string& key) const
 {
 	auto it = extras.find(key);
 	return it == extras.end() || it->second.empty() ? std::string() : it->second.front();
+}
+
+size_t pendingReplies(void* userData)
+{
+	return Router::instance().pendingFor(userData);
 }
 
 std::vector<LaunchRecord> launches()

@@ -124,8 +124,13 @@ int LaunchRouter::terminate(app_control_h h)
 			hooks.push_back(std::move(it->second.onTerminate));
 		it = m_launches.erase(it);
 	}
-	for (auto& hook : hooks)
-		hook();
+	for (auto& hook : hooks) {
+		try {
+			hook();
+		} catch (...) {
+			WERROR("terminate hook threw");
+		}
+	}
 	return APP_CONTROL_ERROR_NONE;
 }
 

@@ -8,6 +8,7 @@
 #define CT_HAS_NOTIFICATION_LOG 1
 #endif
 
+#include <cctype>
 #include <cstring>
 #include <functional>
 
@@ -21,20 +22,19 @@ const bool kEflRegistered = EflEnvironment::registerOnce();
 constexpr double kFrame = 1.0 / 60.0;
 constexpr int kQuietFramesForIdle = 3;
 
+// Class names read "elm_genlist", "Elm_Genlist" or "Elm.Genlist" depending on
+// the API that made the object.
+std::string normalizedType(const char* name)
+{
+	std::string type(name ? name : "");
+	for (char& c : type)
+		c = c == '.' ? '_' : static_cast<char>(tolower(static_cast<unsigned char>(c)));
+	return type;
+}
+
 bool isType(Evas_Object* obj, const char* type)
 {
-	const char* name = evas_object_type_get(obj);
-	if (!name)
-		return false;
-	if (strcmp(name, type) == 0)
-		return true;
-	// Classes are named "Elm.Genlist" or "Elm_Genlist" depending on the API used.
-	std::string dotted(type);
-	for (char& c : dotted) {
-		if (c == '_')
-			c = '.';
-	}
-	return dotted == name;
+	return normalizedType(evas_object_type_get(obj)) == normalizedType(type);
 }
 
 bool isShown(Evas_Object* obj)

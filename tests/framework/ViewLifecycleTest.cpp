@@ -121,6 +121,7 @@ TEST(ViewLifecycle, ViewsDestroyedInOnPopOrTwiceEndOnce)
 
 TEST(ViewLifecycle, BadInputIsRefusedAndLogged)
 {
+	EventLog log;
 	ScreenHarness screen;
 	ct::log::clear();
 	EXPECT_FALSE(screen.naviframe()->push(nullptr));
@@ -131,7 +132,6 @@ TEST(ViewLifecycle, BadInputIsRefusedAndLogged)
 	screen.sendBackKey();
 	EXPECT_TRUE(ct::log::contains("back on an empty naviframe"));
 
-	EventLog log;
 	auto* orphan = new RecordingView(log, "o");
 	EXPECT_FALSE(orphan->create(nullptr, nullptr));
 	EXPECT_TRUE(ct::log::contains("parent is null"));

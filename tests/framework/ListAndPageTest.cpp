@@ -73,6 +73,8 @@ TEST(GenlistItem, RowsAreReadSelectedAndDeletedWithTheirItems)
 		auto rows = ScreenHarness::rowsOf<CountingRow>(genlist);
 		ASSERT_EQ(rows.size(), 5u);
 		EXPECT_EQ(rows[2]->index(), 2);
+		auto even = ScreenHarness::rowsWhere<CountingRow>(genlist, [](CountingRow* r) { return r->index() % 2 == 0; });
+		EXPECT_EQ(even.size(), 3u);
 		Elm_Object_Item* third = rows[2]->getElmObjectItem();
 		EXPECT_EQ(ScreenHarness::itemStyle(third), "default");
 		EXPECT_EQ(ScreenHarness::itemText(third, "elm.text"), "Row 2");

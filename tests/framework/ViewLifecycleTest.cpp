@@ -24,6 +24,8 @@ TEST(ViewLifecycle, PushThenBackRunsEveryStepInOrder)
 		EXPECT_EQ(WView_getWindowBaseLayoutEvasObj(view), screen.window().getBaseLayoutEvasObj());
 		EXPECT_EQ(view->getNaviframe(), screen.naviframe());
 		EXPECT_NE(view->getNaviItem(), nullptr);
+		view->setTitle("Details");
+		EXPECT_EQ(ScreenHarness::naviText(view), "Details");
 
 		screen.sendBackKey();
 		EXPECT_EQ(screen.viewCount(), 0);

@@ -58,6 +58,31 @@ private:
 	int* m_live;
 };
 
+// A row class whose del function deletes the row itself, as row classes do.
+class PlainDeleteRow : public app_assist::WGenlistItem {
+public:
+	explicit PlainDeleteRow(int* live)
+		: m_live(live)
+	{
+		++*m_live;
+	}
+	~PlainDeleteRow() override { --*m_live; }
+	Elm_Genlist_Item_Class* getItemClassStatic() override
+	{
+		static Elm_Genlist_Item_Class itc = [] {
+			Elm_Genlist_Item_Class c = {};
+			c.version = ELM_GENLIST_ITEM_CLASS_VERSION;
+			c.item_style = "default";
+			c.func.del = [](void* data, Evas_Object*) { delete static_cast<PlainDeleteRow*>(data); };
+			return c;
+		}();
+		return &itc;
+	}
+
+private:
+	int* m_live;
+};
+
 } // namespace
 
 TEST(GenlistItem, RowsAreReadSelectedAndDeletedWithTheirItems)
@@ -89,6 +114,10 @@ TEST(GenlistItem, RowsAreReadSelectedAndDeletedWithTheirItems)
 		auto* row = new SelfDeletingRow(&selfLive);
 		row->setElmObjectItem(elm_genlist_item_append(genlist, row->getItemClass(), row, nullptr,
 			ELM_GENLIST_ITEM_NONE, row->getSelectCb(), nullptr));
+		auto* plain = new PlainDeleteRow(&selfLive);
+		plain->setElmObjectItem(elm_genlist_item_append(genlist, plain->getItemClass(), plain, nullptr,
+			ELM_GENLIST_ITEM_NONE, plain->getSelectCb(), nullptr));
+		EXPECT_EQ(selfLive, 2);
 		elm_genlist_clear(genlist);
 		EXPECT_EQ(selfLive, 0);
 		EXPECT_EQ(live, 0);

@@ -81,6 +81,10 @@ double vconf_keynode_get_dbl(keynode_t *node);
 /* Borrowed; valid only during the callback. */
 char *vconf_keynode_get_str(keynode_t *node);
 
+/* Closes the store file and drops every change callback; the next call
+ * reopens it. For tools and tests that reopen the store. */
+void vconf_close_store(void);
+
 #ifdef __cplusplus
 }
 #endif

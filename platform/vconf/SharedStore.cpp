@@ -1,0 +1,34 @@
+#include "SharedStore.h"
+
+#include "DataDir.h"
+
+namespace ct::kv {
+
+SharedStore::SharedStore(std::string fileName)
+	: m_fileName(std::move(fileName))
+{
+}
+
+SharedStore::~SharedStore() = default;
+
+KeyValueStore* SharedStore::get(int* error)
+{
+	std::string path = ct::platform::dataPath(m_fileName);
+	if (m_store && m_store->path() == path)
+		return m_store.get();
+	auto store = std::make_unique<KeyValueStore>();
+	int rc = store->open(path);
+	if (error)
+		*error = rc;
+	if (rc != kOk)
+		return nullptr;
+	m_store = std::move(store);
+	return m_store.get();
+}
+
+void SharedStore::close()
+{
+	m_store.reset();
+}
+
+} // namespace ct::kv

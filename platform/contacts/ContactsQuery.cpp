@@ -68,12 +68,15 @@ std::string ftsPhrase(const std::string& text)
 }
 
 // Trigram index lookup for "person display name contains", which narrows the
-// rows before the exact test; texts under 3 characters cannot use it.
+// rows before the exact test. Texts under 3 characters cannot use it; very
+// long ones would build huge index queries and are tested by scanning.
+constexpr size_t kMaxIndexedSearchBytes = 256;
+
 bool usesTrigramIndex(const contacts_filter_s::Item& item, const ViewInfo& view)
 {
 	return item.match == CONTACTS_MATCH_CONTAINS && view.number == (_contacts_person.id >> 16)
 		&& item.propertyId == _contacts_person.display_name
-		&& g_utf8_strlen(item.value.text.c_str(), -1) >= 3;
+		&& g_utf8_strlen(item.value.text.c_str(), -1) >= 3 && item.value.text.size() <= kMaxIndexedSearchBytes;
 }
 
 void stringCondition(const contacts_filter_s::Item& item, const ViewInfo& view, const std::string& col,

@@ -95,8 +95,20 @@ int ContactsReader::readRecord(const ViewInfo& view, int id, contacts_record_s**
 	return CONTACTS_ERROR_NONE;
 }
 
+contacts_filter_s::IndexChoice ContactsReader::__indexChoiceForLimit(int limit)
+{
+	if (limit <= 0)
+		return nullptr;
+	return [this](const std::string& text) {
+		const int kRareMatches = 500;
+		CachedStatement st(m_conn.statement("SELECT count(*) FROM (SELECT rowid FROM persons_fts WHERE persons_fts "
+			"MATCH ? LIMIT 501)"));
+		return st->bind(1, ftsPhrase(text)).step() == SQLITE_ROW && st->columnInt(0) < kRareMatches;
+	};
+}
+
 int ContactsReader::__where(const ViewInfo& view, const contacts_query_s* query, std::string& sql,
-	std::vector<SqlParam>& params)
+	std::vector<SqlParam>& params, const contacts_filter_s::IndexChoice& useIndex)
 {
 	bool hasBase = view.baseWhere != nullptr;
 	bool hasFilter = query && query->filter;
@@ -107,7 +119,7 @@ int ContactsReader::__where(const ViewInfo& view, const contacts_query_s* query,
 		sql += view.baseWhere;
 	if (hasBase && hasFilter)
 		sql += " AND ";
-	return hasFilter ? query->filter->toSql(sql, params) : CONTACTS_ERROR_NONE;
+	return hasFilter ? query->filter->toSql(sql, params, useIndex) : CONTACTS_ERROR_NONE;
 }
 
 int ContactsReader::readList(const ViewInfo& view, const contacts_query_s* query, int offset, int limit,
@@ -124,7 +136,7 @@ int ContactsReader::readList(const ViewInfo& view, const contacts_query_s* query
 	std::string sql = std::string("SELECT ") + (query && query->distinct ? "DISTINCT " : "") + cols + " FROM "
 		+ view.readSource;
 	std::vector<SqlParam> params;
-	int err = __where(view, query, sql, params);
+	int err = __where(view, query, sql, params, __indexChoiceForLimit(limit));
 	if (err != CONTACTS_ERROR_NONE)
 		return err;
 	if (query && !query->sort.empty()) {

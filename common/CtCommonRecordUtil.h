@@ -59,5 +59,13 @@ const char* CtCommonGetMessengerTypeStr(int type, const char* customLabel);
 const char* CtCommonGetUrlTypeStr(int type, const char* customLabel);
 const char* CtCommonGetRelationshipTypeStr(int type, const char* customLabel);
 const char* CtCommonGetEventTypeStr(int type, const char* customLabel);
+// The same, with the custom label read from the child record (may be null).
+const char* CtCommonGetNumberTypeStr(contacts_record_h record, int type);
+const char* CtCommonGetEmailTypeStr(contacts_record_h record, int type);
+const char* CtCommonGetAddressTypeStr(contacts_record_h record, int type);
+const char* CtCommonGetMessengerTypeStr(contacts_record_h record, int type);
+const char* CtCommonGetUrlTypeStr(contacts_record_h record, int type);
+const char* CtCommonGetRelationshipTypeStr(contacts_record_h record, int type);
+const char* CtCommonGetEventTypeStr(contacts_record_h record, int type);
 
 #endif

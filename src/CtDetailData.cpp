@@ -382,7 +382,9 @@ void CtDetailData::__onDbChangedCb(const char* viewUri, void* data)
 		return;
 	}
 	bool changed = self->__isPersonChanged();
-	changed = self->__hasContactChangedSinceVersion() || changed;
+	// Without contacts (no person, GAL entry) there is nothing to match.
+	if (self->m_contactsList)
+		changed = self->__hasContactChangedSinceVersion() || changed;
 	// The listener may delete this object: nothing may follow the call.
 	if (changed && self->m_listener)
 		self->m_listener->onDbChanged(viewUri);

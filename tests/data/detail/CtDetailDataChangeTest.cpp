@@ -195,3 +195,20 @@ TEST_F(CtDetailDataChangeTest, NullListenerIsRefusedAndDetachedListenerHearsNoth
 	settle(1.0);
 	EXPECT_TRUE(m_listener.uris.empty());
 }
+
+TEST_F(CtDetailDataChangeTest, GalEntryAndMissingPersonNeverNotify)
+{
+	CtGalSearchData entry = {nullptr, nullptr, "Gal", "1", nullptr, nullptr, nullptr, nullptr};
+	CtDetailData gal(&entry);
+	RecordingListener galListener;
+	gal.attachListener(&galListener);
+	CtDetailData nobody(0);
+	RecordingListener nobodyListener;
+	nobody.attachListener(&nobodyListener);
+
+	addNumberToStoredContact(m_otherContact, "1");
+	addNumberToStoredContact(m_contactA, "2");
+	EXPECT_EQ(1u, callsAfterSettling());
+	EXPECT_TRUE(galListener.uris.empty());
+	EXPECT_TRUE(nobodyListener.uris.empty());
+}

@@ -4,14 +4,10 @@
 #include "ContactsDebug.h"
 #include "CtCommonAddressbookUtil.h"
 
-#include <unicode/ucal.h>
-#include <unicode/udatpg.h>
-#include <unicode/ustring.h>
-#include <vconf.h>
+#include "RegionDateFormat.h"
 
 #include <cstdlib>
 #include <cstring>
-#include <memory>
 #include <vector>
 
 namespace {
@@ -73,44 +69,6 @@ std::string phoneticNameOf(contacts_record_h name)
 	for (const char* part : parts)
 		appendPart(out, part, " ");
 	return out;
-}
-
-// "en_US.UTF-8" -> "en_US"; the default locale when unset.
-std::string regionLocale()
-{
-	std::unique_ptr<char, decltype(&free)> value(vconf_get_str(VCONFKEY_REGIONFORMAT), free);
-	std::string locale = value ? value.get() : "";
-	size_t dot = locale.find('.');
-	if (dot != std::string::npos)
-		locale.erase(dot);
-	return locale.empty() ? "en_US" : locale;
-}
-
-UDateFormat* openFormatter(const char* skeletonText)
-{
-	std::string locale = regionLocale();
-	UErrorCode status = U_ZERO_ERROR;
-	UDateTimePatternGenerator* generator = udatpg_open(locale.c_str(), &status);
-	if (U_FAILURE(status)) {
-		WFAILED("udatpg_open", status);
-		return nullptr;
-	}
-	UChar skeleton[32];
-	u_uastrcpy(skeleton, skeletonText);
-	UChar pattern[128];
-	int32_t length = udatpg_getBestPattern(generator, skeleton, -1, pattern, 128, &status);
-	udatpg_close(generator);
-	if (U_FAILURE(status)) {
-		WFAILED("udatpg_getBestPattern", status);
-		return nullptr;
-	}
-	static const UChar kUtc[] = {'U', 'T', 'C', 0};
-	UDateFormat* formatter = udat_open(UDAT_PATTERN, UDAT_PATTERN, locale.c_str(), kUtc, -1, pattern, length, &status);
-	if (U_FAILURE(status)) {
-		WFAILED("udat_open", status);
-		return nullptr;
-	}
-	return formatter;
 }
 
 void appendChildLines(std::string& out, contacts_record_h contact, unsigned int childProperty, unsigned int textProperty)
@@ -289,38 +247,20 @@ char* CtCommonGetShareText(int personId)
 	return strdup(text.c_str());
 }
 
-UDateFormat* CtCommonGetTimeFormatter()
+i18n_udate_h CtCommonGetTimeFormatter()
 {
-	return openFormatter("yMMMd");
+	return ct::i18n::createEventDateFormatter(ct::i18n::Year::Shown);
 }
 
-UDateFormat* CtCommonGetTimeFormatterWithoutYear()
+i18n_udate_h CtCommonGetTimeFormatterWithoutYear()
 {
-	return openFormatter("MMMd");
+	return ct::i18n::createEventDateFormatter(ct::i18n::Year::Hidden);
 }
 
-std::string CtCommonGetDatetimeStr(UDateFormat* formatter, int year, int month, int day)
+std::string CtCommonGetDatetimeStr(i18n_udate_h formatter, int year, int month, int day)
 {
 	WPRET_VM(!formatter, "", "Invalid param : formatter");
-	UErrorCode status = U_ZERO_ERROR;
-	UCalendar* calendar = ucal_open(u"UTC", -1, "en_US", UCAL_GREGORIAN, &status);
-	if (U_FAILURE(status)) {
-		WFAILED("ucal_open", status);
-		return "";
-	}
-	ucal_clear(calendar);
-	ucal_setDate(calendar, year > 0 ? year : 2000, month - 1, day, &status);
-	UDate date = ucal_getMillis(calendar, &status);
-	ucal_close(calendar);
-	UChar buffer[128];
-	udat_format(formatter, date, buffer, 128, nullptr, &status);
-	if (U_FAILURE(status)) {
-		WFAILED("udat_format", status);
-		return "";
-	}
-	char out[512];
-	u_strToUTF8(out, sizeof(out), nullptr, buffer, -1, &status);
-	return U_SUCCESS(status) ? out : "";
+	return ct::i18n::formatEventDate(formatter, year * 10000 + month * 100 + day);
 }
 
 std::string ctCommonGetGroupNames(Eina_List* contacts)

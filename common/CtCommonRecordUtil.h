@@ -3,7 +3,7 @@
 
 #include <Eina.h>
 #include <contacts.h>
-#include <unicode/udat.h>
+#include <utils_i18n.h>
 
 #include <string>
 
@@ -39,11 +39,13 @@ char* ctCommonRemoveNewline(const char* text);
 char* CtCommonGetShareText(int personId);
 
 // Date formatters of the current region format ("db/menu_widget/regionformat")
-// with and without the year. The caller closes them with udat_close.
-UDateFormat* CtCommonGetTimeFormatter();
-UDateFormat* CtCommonGetTimeFormatterWithoutYear();
-// The date (YYYYMMDD, year 0 without year) formatted with `formatter`.
-std::string CtCommonGetDatetimeStr(UDateFormat* formatter, int year, int month, int day);
+// with and without the year; null on failure. The caller destroys them with
+// i18n_udate_destroy.
+i18n_udate_h CtCommonGetTimeFormatter();
+i18n_udate_h CtCommonGetTimeFormatterWithoutYear();
+// The day (year 0: no year) formatted with `formatter`; "" for an
+// impossible date or a null formatter.
+std::string CtCommonGetDatetimeStr(i18n_udate_h formatter, int year, int month, int day);
 
 // Names of every group of the contacts, in first-seen order without
 // repeats, joined by ", "; empty when there are none.

@@ -3,7 +3,7 @@
 
 #include <Eina.h>
 #include <contacts.h>
-#include <unicode/udat.h>
+#include <utils_i18n.h>
 
 #include <string>
 
@@ -59,8 +59,8 @@ public:
 	virtual int getEvent(contacts_record_h record) = 0;
 	virtual Eina_List* getNoteList() = 0;
 	virtual const char* getNote(contacts_record_h record) = 0;
-	virtual UDateFormat* getTimeFormatter() = 0;
-	virtual UDateFormat* getTimeFormatterWithoutYear() = 0;
+	virtual i18n_udate_h getTimeFormatter() = 0;
+	virtual i18n_udate_h getTimeFormatterWithoutYear() = 0;
 	virtual bool getReadOnlyMode() = 0;
 	virtual Eina_List* getNameList() = 0;
 	virtual Eina_List* getImageList() = 0;

@@ -2,8 +2,7 @@
 #define _CT_LAUNCH_REQUEST_H_
 
 #include <app_control.h>
-
-typedef struct ui_gadget_s* ui_gadget_h;
+#include <ui-gadget.h>
 
 // The host's launch request. Owned by the host and alive for the whole life
 // of the view that keeps a pointer to it; any member may be null.

@@ -195,9 +195,9 @@ void CtDetailData::deInit()
 	if (m_personRecord)
 		contacts_record_destroy(m_personRecord, true);
 	if (m_timeFormatter)
-		udat_close(m_timeFormatter);
+		i18n_udate_destroy(m_timeFormatter);
 	if (m_timeFormatterWithoutYear)
-		udat_close(m_timeFormatterWithoutYear);
+		i18n_udate_destroy(m_timeFormatterWithoutYear);
 	if (m_connected) {
 		int err = contacts_disconnect();
 		if (err != CONTACTS_ERROR_NONE)

@@ -77,8 +77,8 @@ public: // CtDetailDataBase
 	int getEvent(contacts_record_h record) override;
 	Eina_List* getNoteList() override { return m_noteList; }
 	const char* getNote(contacts_record_h record) override;
-	UDateFormat* getTimeFormatter() override { return m_timeFormatter; }
-	UDateFormat* getTimeFormatterWithoutYear() override { return m_timeFormatterWithoutYear; }
+	i18n_udate_h getTimeFormatter() override { return m_timeFormatter; }
+	i18n_udate_h getTimeFormatterWithoutYear() override { return m_timeFormatterWithoutYear; }
 	bool getReadOnlyMode() override;
 	Eina_List* getNameList() override { return m_nameList; }
 	Eina_List* getImageList() override { return m_imageList; }
@@ -134,8 +134,8 @@ private:
 	Eina_List* m_noteList = nullptr;
 	Eina_List* m_nameList = nullptr;
 	Eina_List* m_imageList = nullptr;
-	UDateFormat* m_timeFormatter = nullptr;
-	UDateFormat* m_timeFormatterWithoutYear = nullptr;
+	i18n_udate_h m_timeFormatter = nullptr;
+	i18n_udate_h m_timeFormatterWithoutYear = nullptr;
 	ICtChangeListener* m_listener = nullptr;
 	const CtGalSearchData* m_galData = nullptr;
 	std::string m_groupNames;

@@ -267,22 +267,22 @@ TEST_F(CtCommonRecordUtilTest, TypeLabelsCoverEveryTypeAndCustomLabels)
 
 TEST_F(CtCommonRecordUtilTest, DateFormattersFollowTheRegionFormat)
 {
-	UDateFormat* withYear = CtCommonGetTimeFormatter();
-	UDateFormat* withoutYear = CtCommonGetTimeFormatterWithoutYear();
+	i18n_udate_h withYear = CtCommonGetTimeFormatter();
+	i18n_udate_h withoutYear = CtCommonGetTimeFormatterWithoutYear();
 	ASSERT_NE(nullptr, withYear);
 	ASSERT_NE(nullptr, withoutYear);
 	EXPECT_EQ("Dec 31, 1999", CtCommonGetDatetimeStr(withYear, 1999, 12, 31));
 	EXPECT_EQ("Feb 29", CtCommonGetDatetimeStr(withoutYear, 0, 2, 29));
 	EXPECT_EQ("", CtCommonGetDatetimeStr(nullptr, 1999, 1, 1));
-	udat_close(withYear);
-	udat_close(withoutYear);
+	i18n_udate_destroy(withYear);
+	i18n_udate_destroy(withoutYear);
 
 	ASSERT_EQ(0, vconf_set_str(VCONFKEY_REGIONFORMAT, "de_DE.UTF-8"));
-	UDateFormat* german = CtCommonGetTimeFormatter();
+	i18n_udate_h german = CtCommonGetTimeFormatter();
 	ASSERT_NE(nullptr, german);
 	std::string date = CtCommonGetDatetimeStr(german, 1999, 12, 31);
 	EXPECT_EQ(0u, date.find("31.")) << date;
 	EXPECT_NE(std::string::npos, date.find("1999")) << date;
-	udat_close(german);
+	i18n_udate_destroy(german);
 	vconf_set_str(VCONFKEY_REGIONFORMAT, "en_US.UTF-8");
 }

@@ -10,7 +10,6 @@
 #include "SqliteFaultInjector.h"
 #include "TempDataDir.h"
 
-#include <unicode/udat.h>
 
 #include <cstdio>
 #include <fstream>

@@ -11,6 +11,8 @@
 #include "TempDataDir.h"
 
 
+#include <glib.h>
+
 #include <cstdio>
 #include <fstream>
 #include <memory>
@@ -337,6 +339,15 @@ TEST_F(CtDetailDataLoadTest, GalEntryBuildsInMemoryRecordsAndStoresNothing)
 		EXPECT_EQ(64, data.getDataType(number, _contacts_number.type));
 		EXPECT_EQ(nullptr, data.getEmailList());
 		EXPECT_EQ(nullptr, data.getDisplayName());
+	}
+	CtGalSearchData broken = {nullptr, nullptr, "Bad\xff name", "\xfe\xff", "200", nullptr, "\xc3", "Co\xffrp"};
+	{
+		CtDetailData data(&broken);
+		EXPECT_EQ((std::vector<std::string>{"200"}), numbersOf(data));
+		EXPECT_EQ(nullptr, data.getEmailList());
+		ASSERT_NE(nullptr, data.getDisplayName());
+		EXPECT_TRUE(g_utf8_validate(data.getDisplayName(), -1, nullptr));
+		EXPECT_TRUE(g_utf8_validate(data.getCompany(), -1, nullptr));
 	}
 	CtGalSearchData empty = {};
 	CtDetailData blank(&empty);

@@ -8,6 +8,7 @@
 #include <gtest/gtest.h>
 
 #include <cstdlib>
+#include <filesystem>
 #include <memory>
 #include <string>
 #include <vector>
@@ -181,6 +182,23 @@ TEST_F(Vconf, UnusableDataFolderIsAnErrorNotACrash)
 	EXPECT_EQ(VCONF_ERROR_FILE_PERM, vconf_get_int(VCONFKEY_SETAPPL_PSMODE, &value));
 	EXPECT_EQ(nullptr, vconf_get_str(VCONFKEY_REGIONFORMAT));
 	setenv("CONTACTS_DATA_DIR", m_dir.path().c_str(), 1);
+}
+
+TEST_F(Vconf, GarbageStoreFileIsAnErrorAndLeftAlone)
+{
+	std::string path = m_dir.file("vconf.db");
+	FILE* file = fopen(path.c_str(), "w");
+	ASSERT_NE(nullptr, file);
+	std::string garbage(8192, 'g');
+	fwrite(garbage.data(), 1, garbage.size(), file);
+	fclose(file);
+
+	int value = 0;
+	ct::log::clear();
+	EXPECT_EQ(VCONF_ERROR, vconf_get_int(VCONFKEY_SETAPPL_PSMODE, &value));
+	EXPECT_EQ(VCONF_ERROR, vconf_set_int(VCONFKEY_SETAPPL_PSMODE, 1));
+	EXPECT_TRUE(ct::log::contains("vconf store unavailable", DLOG_ERROR));
+	EXPECT_EQ(garbage.size(), std::filesystem::file_size(path));
 }
 
 TEST_F(Vconf, CallbacksSeeOwnChangesOnTheMainLoop)

@@ -115,6 +115,23 @@ private:
 	size_t m_pos = 0;
 };
 
+// g_base64_decode skips characters outside the alphabet; refuse them instead.
+bool isBase64(const std::string& text)
+{
+	if (text.size() % 4 != 0)
+		return false;
+	size_t padding = text.find('=');
+	if (padding != std::string::npos && padding + 2 < text.size())
+		return false;
+	for (size_t i = 0; i < text.size(); ++i) {
+		char c = text[i];
+		bool inAlphabet = g_ascii_isalnum(c) || c == '+' || c == '/';
+		if (!inAlphabet && !(c == '=' && i >= padding))
+			return false;
+	}
+	return true;
+}
+
 bool decodeEntry(Reader& reader, bundle* b)
 {
 	uint32_t type = 0, count = 0;
@@ -302,6 +319,7 @@ bundle* bundle_decode(const bundle_raw* r, const int len)
 {
 	WPRET_VM(!r || len < 0, nullptr, "invalid data");
 	std::string text(reinterpret_cast<const char*>(r), len);
+	WPRET_VM(!isBase64(text), nullptr, "bundle data is not base64 (%d bytes)", len);
 	gsize size = 0;
 	guchar* raw = g_base64_decode(text.c_str(), &size);
 	bundle* b = new _bundle_t;

@@ -1,6 +1,7 @@
 #include "ContactsQuery.h"
 
 #include "ContactsDebug.h"
+#include "ContactsRawValue.h"
 #include "contacts_query.h"
 #include "contacts_views.h"
 
@@ -227,9 +228,10 @@ int contacts_filter_destroy(contacts_filter_h filter)
 int contacts_filter_add_str(contacts_filter_h filter, unsigned int property_id, contacts_match_str_flag_e match,
 	const char* match_value)
 {
-	WPRET_VM(match < CONTACTS_MATCH_EXACTLY || match > CONTACTS_MATCH_EXISTS, CONTACTS_ERROR_INVALID_PARAMETER,
-		"Invalid param : match %d", match);
-	WPRET_VM(!match_value && match != CONTACTS_MATCH_EXISTS, CONTACTS_ERROR_INVALID_PARAMETER,
+	int m = ct::contacts::rawValue(match);
+	WPRET_VM(m < CONTACTS_MATCH_EXACTLY || m > CONTACTS_MATCH_EXISTS, CONTACTS_ERROR_INVALID_PARAMETER,
+		"Invalid param : match %d", m);
+	WPRET_VM(!match_value && m != CONTACTS_MATCH_EXISTS, CONTACTS_ERROR_INVALID_PARAMETER,
 		"Invalid param : match_value");
 	WPRET_VM(match_value && !g_utf8_validate(match_value, -1, nullptr), CONTACTS_ERROR_INVALID_PARAMETER,
 		"match_value is not valid UTF-8");
@@ -237,7 +239,7 @@ int contacts_filter_add_str(contacts_filter_h filter, unsigned int property_id, 
 	auto* item = newCondition(filter, property_id, PropType::Str, err);
 	if (!item)
 		return err;
-	item->match = match;
+	item->match = m;
 	item->value = textParam(match_value ? match_value : "");
 	return CONTACTS_ERROR_NONE;
 }
@@ -245,13 +247,13 @@ int contacts_filter_add_str(contacts_filter_h filter, unsigned int property_id, 
 int contacts_filter_add_int(contacts_filter_h filter, unsigned int property_id, contacts_match_int_flag_e match,
 	int match_value)
 {
-	return addNumberCondition(filter, property_id, PropType::Int, match, intParam(match_value));
+	return addNumberCondition(filter, property_id, PropType::Int, ct::contacts::rawValue(match), intParam(match_value));
 }
 
 int contacts_filter_add_lli(contacts_filter_h filter, unsigned int property_id, contacts_match_int_flag_e match,
 	long long int match_value)
 {
-	return addNumberCondition(filter, property_id, PropType::Lli, match, intParam(match_value));
+	return addNumberCondition(filter, property_id, PropType::Lli, ct::contacts::rawValue(match), intParam(match_value));
 }
 
 int contacts_filter_add_double(contacts_filter_h filter, unsigned int property_id, contacts_match_int_flag_e match,
@@ -260,7 +262,7 @@ int contacts_filter_add_double(contacts_filter_h filter, unsigned int property_i
 	SqlParam p;
 	p.kind = SqlParam::Kind::Double;
 	p.d = match_value;
-	return addNumberCondition(filter, property_id, PropType::Double, match, p);
+	return addNumberCondition(filter, property_id, PropType::Double, ct::contacts::rawValue(match), p);
 }
 
 int contacts_filter_add_bool(contacts_filter_h filter, unsigned int property_id, bool match_value)
@@ -271,13 +273,14 @@ int contacts_filter_add_bool(contacts_filter_h filter, unsigned int property_id,
 int contacts_filter_add_operator(contacts_filter_h filter, contacts_filter_operator_e operator_type)
 {
 	WPRET_VM(!filter, CONTACTS_ERROR_INVALID_PARAMETER, "Invalid param : filter");
-	WPRET_VM(operator_type != CONTACTS_FILTER_OPERATOR_AND && operator_type != CONTACTS_FILTER_OPERATOR_OR,
-		CONTACTS_ERROR_INVALID_PARAMETER, "Invalid param : operator %d", operator_type);
+	int op = ct::contacts::rawValue(operator_type);
+	WPRET_VM(op != CONTACTS_FILTER_OPERATOR_AND && op != CONTACTS_FILTER_OPERATOR_OR,
+		CONTACTS_ERROR_INVALID_PARAMETER, "Invalid param : operator %d", op);
 	WPRET_VM(filter->items.empty() || filter->items.back().kind == contacts_filter_s::Item::Kind::Operator,
 		CONTACTS_ERROR_INVALID_PARAMETER, "an operator must follow a condition");
 	filter->items.emplace_back();
 	filter->items.back().kind = contacts_filter_s::Item::Kind::Operator;
-	filter->items.back().op = operator_type;
+	filter->items.back().op = op == CONTACTS_FILTER_OPERATOR_AND ? CONTACTS_FILTER_OPERATOR_AND : CONTACTS_FILTER_OPERATOR_OR;
 	return CONTACTS_ERROR_NONE;
 }
 

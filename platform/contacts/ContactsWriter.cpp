@@ -620,7 +620,7 @@ int ContactsWriter::unlinkContact(int personId, int contactId, int* newPersonId)
 	return err;
 }
 
-int ContactsWriter::setDefaultProperty(contacts_person_property_e property, int personId, int id)
+int ContactsWriter::setDefaultProperty(int property, int personId, int id)
 {
 	std::vector<int> contacts = m_reader.contactIdsOfPerson(personId);
 	if (contacts.empty())

@@ -40,10 +40,3 @@ app_control_h newHandle();
 app_control_h copyHandle(const app_control_s& source);
 
 } // namespace ct::appcontrol
-
-namespace ct::appcontrol {
-
-// Drops what the router keeps for a destroyed sender handle.
-void forgetSender(uint64_t serial);
-
-} // namespace ct::appcontrol

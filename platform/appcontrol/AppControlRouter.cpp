@@ -11,7 +11,6 @@
 #include <cstring>
 #include <deque>
 #include <memory>
-#include <set>
 
 namespace ct::appcontrol {
 namespace {
@@ -49,6 +48,7 @@ struct Delivery {
 };
 
 const size_t kMaxRecords = 1000;
+const size_t kMaxUnawaitedLaunches = 1000;
 
 // One pending ecore job, holding the main loop up while it waits.
 class MainLoopJob {
@@ -141,7 +141,6 @@ public:
 			return err;
 		}
 		h->sent = true;
-		m_aliveSenders.insert(h->serial);
 		__record(launchId, *h, replyCb != nullptr);
 		return APP_CONTROL_ERROR_NONE;
 	}
@@ -191,15 +190,13 @@ public:
 	int cancel(void* userData)
 	{
 		int dropped = 0;
-		for (auto it = m_launches.begin(); it != m_launches.end();) {
-			Launch& launch = it->second;
-			if (!launch.replyCb || launch.userData != userData) {
-				++it;
-				continue;
+		for (auto& entry : m_launches) {
+			Launch& launch = entry.second;
+			if (launch.replyCb && launch.userData == userData) {
+				++dropped;
+				launch.replyCb = nullptr;
+				launch.request.reset();
 			}
-			++dropped;
-			launch.replyCb = nullptr;
-			it = m_aliveSenders.count(launch.senderSerial) ? std::next(it) : m_launches.erase(it);
 		}
 		for (auto it = m_deliveries.begin(); it != m_deliveries.end();) {
 			if (it->userData == userData) {
@@ -210,18 +207,6 @@ public:
 			}
 		}
 		return dropped;
-	}
-
-	// A destroyed sender can no longer terminate; launches nobody waits for end here.
-	void forgetSender(uint64_t serial)
-	{
-		m_aliveSenders.erase(serial);
-		for (auto it = m_launches.begin(); it != m_launches.end();) {
-			if (it->second.senderSerial == serial && !it->second.replyCb)
-				it = m_launches.erase(it);
-			else
-				++it;
-		}
 	}
 
 	std::vector<LaunchRecord> records() const
@@ -259,10 +244,29 @@ private:
 		launch.senderSerial = h.serial;
 		launch.replyCb = replyCb;
 		launch.userData = userData;
-		launch.request.reset(copyHandle(h));
+		if (replyCb)
+			launch.request.reset(copyHandle(h));
 		launch.onTerminate = onTerminate;
 		m_launches.emplace(launchId, std::move(launch));
+		__trimUnawaitedLaunches();
 		return launchId;
+	}
+
+	// Launches nobody waits for stay answerable and terminable, but only the
+	// newest of them are kept so handlers that never answer cannot grow this.
+	void __trimUnawaitedLaunches()
+	{
+		size_t unawaited = 0;
+		for (const auto& entry : m_launches)
+			unawaited += entry.second.replyCb ? 0 : 1;
+		for (auto it = m_launches.begin(); unawaited > kMaxUnawaitedLaunches && it != m_launches.end();) {
+			if (it->second.replyCb) {
+				++it;
+				continue;
+			}
+			it = m_launches.erase(it);
+			--unawaited;
+		}
 	}
 
 	int __runHandler(const Handler& handler, app_control_h received, uint64_t launchId)
@@ -343,7 +347,6 @@ private:
 	std::vector<HandlerEntry> m_handlers;
 	std::map<uint64_t, Launch> m_launches;
 	std::deque<Delivery> m_deliveries;
-	std::set<uint64_t> m_aliveSenders;
 	std::map<uint64_t, LaunchRecord> m_records;
 	std::unique_ptr<MainLoopJob> m_job;
 	std::string m_ownAppId = CONTACTS_APP_ID;
@@ -429,11 +432,6 @@ void clearLaunches()
 void setOwnAppId(const std::string& appId)
 {
 	Router::instance().setOwnAppId(appId);
-}
-
-void forgetSender(uint64_t serial)
-{
-	Router::instance().forgetSender(serial);
 }
 
 } // namespace ct::appcontrol

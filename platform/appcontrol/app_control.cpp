@@ -135,8 +135,6 @@ int app_control_create(app_control_h* app_control)
 int app_control_destroy(app_control_h app_control)
 {
 	WPRET_VM(!app_control, APP_CONTROL_ERROR_INVALID_PARAMETER, "Invalid param : app_control");
-	if (app_control->sent)
-		ct::appcontrol::forgetSender(app_control->serial);
 	delete app_control;
 	return APP_CONTROL_ERROR_NONE;
 }

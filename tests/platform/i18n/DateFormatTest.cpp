@@ -1,0 +1,140 @@
+// ICU date formatters and event dates in several region formats.
+#include "RegionDateFormat.h"
+#include "utils_i18n.h"
+#include "vconf.h"
+
+#include "LogSink.h"
+#include "TempDataDir.h"
+
+#include <gtest/gtest.h>
+
+#include <cstdlib>
+#include <string>
+
+using namespace ct::i18n;
+
+namespace {
+
+std::string eventText(Year year, const char* locale, int yyyymmdd)
+{
+	i18n_udate_h formatter = createEventDateFormatter(year, locale);
+	if (!formatter)
+		return "<no formatter>";
+	std::string text = formatEventDate(formatter, yyyymmdd);
+	i18n_udate_destroy(formatter);
+	return text;
+}
+
+std::string patternOf(i18n_udate_h formatter)
+{
+	char* pattern = nullptr;
+	i18n_udate_get_pattern(formatter, &pattern);
+	std::string out = pattern ? pattern : "";
+	free(pattern);
+	return out;
+}
+
+} // namespace
+
+TEST(DateFormat, EventDatesFollowTheLocaleWithAndWithoutYear)
+{
+	EXPECT_EQ("Mar 7, 1985", eventText(Year::Shown, "en_US", 19850307));
+	EXPECT_EQ("Mar 7", eventText(Year::Hidden, "en_US", 19850307));
+	EXPECT_EQ("7 Mar 1985", eventText(Year::Shown, "en_GB", 19850307));
+	EXPECT_EQ("7. März 1985", eventText(Year::Shown, "de_DE", 19850307));
+	EXPECT_EQ("7. März", eventText(Year::Hidden, "de_DE", 19850307));
+	EXPECT_EQ("1985년 3월 7일", eventText(Year::Shown, "ko_KR", 19850307));
+	EXPECT_EQ("3월 7일", eventText(Year::Hidden, "ko_KR", 19850307));
+	// An encoding suffix as some systems write it is ignored.
+	EXPECT_EQ("Mar 7, 1985", eventText(Year::Shown, "en_US.UTF-8", 19850307));
+}
+
+TEST(DateFormat, YearlessDatesKeepTheLeapDayAndImpossibleDatesGiveNothing)
+{
+	EXPECT_EQ("Feb 29", eventText(Year::Hidden, "en_US", 229));
+	EXPECT_EQ("Dec 31", eventText(Year::Hidden, "en_US", 1231));
+	EXPECT_EQ("Feb 29, 2024", eventText(Year::Shown, "en_US", 20240229));
+	EXPECT_EQ("Jan 1, 1902", eventText(Year::Shown, "en_US", 19020101));
+
+	ct::log::clear();
+	EXPECT_EQ("", eventText(Year::Shown, "en_US", 20230229));
+	EXPECT_EQ("", eventText(Year::Shown, "en_US", 19851301));
+	EXPECT_EQ("", eventText(Year::Shown, "en_US", 19850400));
+	EXPECT_EQ("", eventText(Year::Shown, "en_US", 19850431));
+	EXPECT_EQ("", eventText(Year::Shown, "en_US", -5));
+	EXPECT_TRUE(ct::log::contains("* Critical * Invalid date", DLOG_ERROR));
+	EXPECT_EQ("", formatEventDate(nullptr, 19850307));
+}
+
+TEST(DateFormat, RegionFormatComesFromSettingsAndFallsBackToEnUs)
+{
+	ct::test::TempDataDir dir;
+	EXPECT_EQ("en_US", regionFormat());
+	ASSERT_EQ(0, vconf_set_str(VCONFKEY_REGIONFORMAT, "de_DE.UTF-8"));
+	EXPECT_EQ("de_DE", regionFormat());
+	EXPECT_EQ("7. März", eventText(Year::Hidden, "", 19850307));
+	ASSERT_EQ(0, vconf_set_str(VCONFKEY_REGIONFORMAT, "ko_KR"));
+	EXPECT_EQ("3월 7일", eventText(Year::Hidden, "", 19850307));
+
+	ASSERT_EQ(0, vconf_set_str(VCONFKEY_REGIONFORMAT, "'; DROP TABLE x; --"));
+	EXPECT_EQ("en_US", regionFormat());
+	ASSERT_EQ(0, vconf_set_int(VCONFKEY_REGIONFORMAT, 5));
+	EXPECT_EQ("en_US", regionFormat());
+}
+
+TEST(DateFormat, FormatterFromPatternAndUtf16Output)
+{
+	i18n_udate_h formatter = nullptr;
+	ASSERT_EQ(I18N_ERROR_NONE, i18n_udate_create_from_pattern("yyyy-MM-dd HH:mm", "en_US", "UTC", &formatter));
+	EXPECT_EQ("yyyy-MM-dd HH:mm", patternOf(formatter));
+	char* text = nullptr;
+	ASSERT_EQ(I18N_ERROR_NONE, i18n_udate_format_date_utf8(formatter, 0.0, &text));
+	EXPECT_STREQ("1970-01-01 00:00", text);
+	free(text);
+
+	i18n_uchar small[4];
+	int32_t needed = 0;
+	EXPECT_EQ(I18N_ERROR_BUFFER_OVERFLOW, i18n_udate_format_date(formatter, 0.0, small, 4, &needed));
+	EXPECT_EQ(16, needed);
+	i18n_uchar exact[17];
+	ASSERT_EQ(I18N_ERROR_NONE, i18n_udate_format_date(formatter, 0.0, exact, 17, &needed));
+	EXPECT_EQ(u'1', exact[0]);
+	EXPECT_EQ(u'0', exact[15]);
+	EXPECT_EQ(0, exact[16]);
+	EXPECT_EQ(I18N_ERROR_BUFFER_OVERFLOW, i18n_udate_format_date(formatter, 0.0, nullptr, 0, &needed));
+	i18n_udate_destroy(formatter);
+
+	ASSERT_EQ(I18N_ERROR_NONE, i18n_udate_create_from_pattern("HH:mm", "en_US", "Asia/Seoul", &formatter));
+	ASSERT_EQ(I18N_ERROR_NONE, i18n_udate_format_date_utf8(formatter, 0.0, &text));
+	EXPECT_STREQ("09:00", text);
+	free(text);
+	i18n_udate_destroy(formatter);
+
+	ASSERT_EQ(I18N_ERROR_NONE, i18n_udate_create_from_skeleton("MMMd", "en_US", nullptr, &formatter));
+	EXPECT_EQ("MMM d", patternOf(formatter));
+	i18n_udate_destroy(formatter);
+}
+
+TEST(DateFormat, BadArgumentsAreRefusedWithALogLine)
+{
+	ct::log::clear();
+	i18n_udate_h formatter = reinterpret_cast<i18n_udate_h>(1);
+	EXPECT_EQ(I18N_ERROR_INVALID_PARAMETER, i18n_udate_create_from_skeleton(nullptr, "en_US", nullptr, &formatter));
+	EXPECT_EQ(nullptr, formatter);
+	EXPECT_EQ(I18N_ERROR_INVALID_PARAMETER, i18n_udate_create_from_skeleton("yMMMd", "", nullptr, &formatter));
+	EXPECT_EQ(I18N_ERROR_INVALID_PARAMETER, i18n_udate_create_from_skeleton("yMMMd", "en\xFF", nullptr, &formatter));
+	std::string huge(I18N_MAX_ARGUMENT_LENGTH + 1, 'y');
+	EXPECT_EQ(I18N_ERROR_INVALID_PARAMETER, i18n_udate_create_from_skeleton(huge.c_str(), "en_US", nullptr, &formatter));
+	EXPECT_EQ(I18N_ERROR_INVALID_PARAMETER, i18n_udate_create_from_pattern("yyyy", "en_US", "Mars/Olympus", &formatter));
+	EXPECT_EQ(I18N_ERROR_INVALID_PARAMETER, i18n_udate_create_from_pattern("yyyy", "en_US", nullptr, nullptr));
+	EXPECT_EQ(nullptr, formatter);
+	EXPECT_EQ(I18N_ERROR_INVALID_PARAMETER, i18n_udate_destroy(nullptr));
+	char* text = nullptr;
+	EXPECT_EQ(I18N_ERROR_INVALID_PARAMETER, i18n_udate_format_date_utf8(nullptr, 0.0, &text));
+	int32_t needed = 0;
+	EXPECT_EQ(I18N_ERROR_INVALID_PARAMETER, i18n_udate_format_date(nullptr, 0.0, nullptr, 0, &needed));
+	EXPECT_TRUE(ct::log::contains("* Critical * Invalid param", DLOG_ERROR));
+
+	// An unknown locale still formats (ICU's root data), rather than failing.
+	EXPECT_FALSE(eventText(Year::Shown, "xx_YY", 19850307).empty());
+}

@@ -1,0 +1,29 @@
+#include "EflEnvironment.h"
+
+#include <Elementary.h>
+
+namespace ct::test {
+
+void EflEnvironment::SetUp()
+{
+	elm_init(0, nullptr);
+	// Transitions still run through the main loop, just without waiting.
+	elm_config_transition_duration_factor_set(0.0);
+	elm_config_scale_set(1.0);
+}
+
+void EflEnvironment::TearDown()
+{
+	elm_shutdown();
+}
+
+bool EflEnvironment::registerOnce()
+{
+	static bool registered = [] {
+		testing::AddGlobalTestEnvironment(new EflEnvironment());
+		return true;
+	}();
+	return registered;
+}
+
+} // namespace ct::test

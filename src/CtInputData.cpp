@@ -9,6 +9,7 @@
 #include "ICtChangeListener.h"
 
 #include <app_preference.h>
+#include <glib.h>
 #include <vconf.h>
 
 #include <cerrno>
@@ -683,6 +684,7 @@ const char* CtInputData::__getNamePart(unsigned int property)
 int CtInputData::separateFullName(contacts_record_h nameRecord, const char* fullName)
 {
 	WPRET_VM(!nameRecord || !fullName, -1, "Invalid param : nameRecord or fullName");
+	WPRET_VM(!g_utf8_validate(fullName, -1, nullptr), CONTACTS_ERROR_INVALID_PARAMETER, "name is not UTF-8");
 	std::string text = boundedText(fullName);
 	size_t comma = text.find(',');
 	const char* suffix = nullptr;
@@ -719,6 +721,8 @@ int CtInputData::separateFullName(contacts_record_h nameRecord, const char* full
 int CtInputData::separatePhoneticFullName(contacts_record_h nameRecord, const char* fullName)
 {
 	WPRET_VM(!nameRecord, -1, "Invalid param : nameRecord");
+	WPRET_VM(fullName && !g_utf8_validate(fullName, -1, nullptr), CONTACTS_ERROR_INVALID_PARAMETER,
+		"name is not UTF-8");
 	std::string first, middle, last;
 	if (fullName) {
 		std::string text = boundedText(fullName);

@@ -1353,8 +1353,10 @@ int CtInputData::insertContact(int* outId)
 	}
 	if (outId)
 		*outId = id;
+	// The contact (with its ringtone path) is stored: a failed ringtone-info
+	// write is logged but not reported, or a retry would store it twice.
 	if (getRingtone())
-		return __saveRingtoneInfo(id);
+		__saveRingtoneInfo(id);
 	return err;
 }
 

@@ -1422,8 +1422,9 @@ void CtInputData::__updatePrimaryRecord()
 	}
 }
 
-int CtInputData::__convertSIMRecord()
+int CtInputData::__convertSIMRecord(contacts_record_h* converted)
 {
+	*converted = nullptr;
 	contacts_record_h sim = nullptr;
 	int err = contacts_record_create(_contacts_contact._uri, &sim);
 	if (err != CONTACTS_ERROR_NONE) {
@@ -1463,8 +1464,7 @@ int CtInputData::__convertSIMRecord()
 		contacts_record_destroy(sim, true);
 		return err;
 	}
-	contacts_record_destroy(m_contactRecord, true);
-	m_contactRecord = sim;
+	*converted = sim;
 	return CONTACTS_ERROR_NONE;
 }
 
@@ -1472,15 +1472,20 @@ int CtInputData::insertSIMContact(int* outId)
 {
 	WENTER();
 	WPRET_VM(!m_contactRecord, CONTACTS_ERROR_INVALID_PARAMETER, "Invalid param : contact record");
-	int err = __convertSIMRecord();
+	contacts_record_h sim = nullptr;
+	int err = __convertSIMRecord(&sim);
 	if (err != CONTACTS_ERROR_NONE)
-		return err;
+		return err; // nothing is written after a failed conversion
 	int id = 0;
-	err = contacts_sim_insert(m_contactRecord, &id);
+	err = contacts_sim_insert(sim, &id);
 	if (err != CONTACTS_ERROR_NONE) {
+		// The full contact stays held, so it can still be saved elsewhere.
 		WFAILED("contacts_sim_insert", err);
+		contacts_record_destroy(sim, true);
 		return err;
 	}
+	contacts_record_destroy(m_contactRecord, true);
+	m_contactRecord = sim;
 	if (outId)
 		*outId = id;
 	return err;

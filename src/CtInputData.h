@@ -205,7 +205,8 @@ private:
 	bool __ringtoneChanged();
 	int __saveRingtoneInfo(int contactId);
 	void __updatePrimaryRecord();
-	int __convertSIMRecord();
+	// The SIM form of the contact as a new record the caller owns.
+	int __convertSIMRecord(contacts_record_h* converted);
 	int __simSlot();
 	static void __onPersonChanged(const char* viewUri, void* data);
 	void __handlePersonChanged(const char* viewUri);

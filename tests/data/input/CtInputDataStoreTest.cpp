@@ -382,8 +382,46 @@ TEST_F(CtInputDataStoreTest, SimThatIsOffOrFullRefusesTheSave)
 
 	vconf_set_int("db/telephony/sim_power_state1", 1);
 	ASSERT_EQ(simContact("First")->insertSIMContact(&id), 0);
-	EXPECT_EQ(simContact("Second")->insertSIMContact(&id), CONTACTS_ERROR_FILE_NO_SPACE);
+	auto second = simContact("Second Person");
+	second->addNote("kept");
+	EXPECT_EQ(second->insertSIMContact(&id), CONTACTS_ERROR_FILE_NO_SPACE);
 	EXPECT_EQ(countContacts(), before + 1);
+
+	// The refused contact is whole and can go to the phone instead.
+	second->setAddressbookInfo(0);
+	ASSERT_EQ(second->insertContact(&id), 0);
+	contacts_record_h stored = readContact(id);
+	EXPECT_EQ(textOf(childAt(stored, _contacts_contact.name, 0), _contacts_name.last), "Person");
+	EXPECT_EQ(textOf(childAt(stored, _contacts_contact.note, 0), _contacts_note.note), "kept");
+	contacts_record_destroy(stored, true);
+}
+
+TEST_F(CtInputDataStoreTest, SimWithoutTextLimitsGetsTheDefaultLength)
+{
+	std::ofstream(m_dir.file("sim.conf")) << "[SIM1]\nname_max=0\nnumber_max=0\nemail_max=0\n";
+	reopen();
+	CtInputData data(nullptr);
+	data.setAddressbookInfo(addressbookIdByName("SIM1"));
+	EXPECT_EQ(data.getSimFieldTextMaxLen(CONTACTS_SIM_FIELD_NAME), 20);
+	EXPECT_EQ(data.getSimFieldTextMaxLen(CONTACTS_SIM_FIELD_NUMBER), 20);
+	EXPECT_EQ(data.getSimFieldTextMaxLen(CONTACTS_SIM_FIELD_EMAIL), 0);
+}
+
+TEST_F(CtInputDataStoreTest, SimWithoutRoomForEmailsStoresNone)
+{
+	std::ofstream(m_dir.file("sim.conf")) << "[SIM1]\nemail_max=0\n";
+	reopen();
+	CtInputData data(nullptr);
+	data.setAddressbookInfo(addressbookIdByName("SIM1"));
+	data.setFullName("Mail Less");
+	data.addNumber("12");
+	data.addEmail("dropped@x");
+	int id = 0;
+	ASSERT_EQ(data.insertSIMContact(&id), 0);
+	contacts_record_h stored = readContact(id);
+	EXPECT_EQ(childCount(stored, _contacts_contact.email), 0);
+	EXPECT_EQ(childCount(stored, _contacts_contact.number), 1);
+	contacts_record_destroy(stored, true);
 }
 
 TEST_F(CtInputDataStoreTest, RingtoneInfoIsWrittenOnlyWhenItChanged)

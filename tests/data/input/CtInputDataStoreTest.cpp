@@ -5,6 +5,7 @@
 #include "ICtChangeListener.h"
 #include "InputTestStore.h"
 
+#include "LogSink.h"
 #include "SqliteFaultInjector.h"
 
 #include <sys/wait.h>
@@ -120,8 +121,10 @@ TEST_F(CtInputDataStoreTest, LaunchRequestsWithBadOrMissingIdsGiveANewContact)
 		EXPECT_EQ(data.getContactId(), 0) << badId;
 		EXPECT_EQ(data.getFullName(), "") << badId;
 	}
-	Request unknown("http://velmora.org/appcontrol/operation/pick", {{"name", "Nobody"}});
+	Request unknown(APP_CONTROL_OPERATION_PICK, {{"name", "Nobody"}});
+	ct::log::clear();
 	CtInputData data(nullptr, unknown.get());
+	EXPECT_TRUE(ct::log::contains("* Critical * wrong operation requested " APP_CONTROL_OPERATION_PICK));
 	EXPECT_EQ(data.getContactId(), 0);
 	EXPECT_EQ(data.getFullName(), "");
 	CtInputData noRequest(nullptr, nullptr);

@@ -76,6 +76,10 @@ private:
 	void* m_userData;
 };
 
+// Replies still to come to `userData`: unanswered launches and answers
+// queued for the main loop. A dying sender must leave 0 after cancelling.
+size_t pendingReplies(void* userData);
+
 // What was sent, for tests and diagnostics.
 struct LaunchRecord {
 	std::string appId;

@@ -9,8 +9,11 @@
 #include <unicode/timezone.h>
 
 #include <cstring>
+#include <map>
 #include <memory>
+#include <mutex>
 #include <string>
+#include <utility>
 
 struct i18n_udate_s {
 	std::unique_ptr<icu::SimpleDateFormat> format;
@@ -66,6 +69,36 @@ int makeFormatter(const icu::UnicodeString& pattern, const icu::Locale& locale, 
 	return I18N_ERROR_NONE;
 }
 
+// The locale's pattern for a skeleton. Making a pattern generator costs most of
+// a millisecond and screens rebuild their formatters often, so patterns are
+// kept per (locale, skeleton); the number of pairs in use is small.
+bool bestPattern(const icu::Locale& locale, const char* skeleton, icu::UnicodeString* pattern)
+{
+	static std::mutex mutex;
+	static auto* cache = new std::map<std::pair<std::string, std::string>, icu::UnicodeString>;
+	const size_t maxCached = 64;
+	std::pair<std::string, std::string> key(locale.getName(), skeleton);
+	std::lock_guard<std::mutex> lock(mutex);
+	auto it = cache->find(key);
+	if (it != cache->end()) {
+		*pattern = it->second;
+		return true;
+	}
+	UErrorCode status = U_ZERO_ERROR;
+	std::unique_ptr<icu::DateTimePatternGenerator> generator(
+			icu::DateTimePatternGenerator::createInstance(locale, status));
+	if (U_SUCCESS(status))
+		*pattern = generator->getBestPattern(icu::UnicodeString::fromUTF8(skeleton), status);
+	if (U_FAILURE(status)) {
+		WWARNING("getBestPattern() Failed(%s)", u_errorName(status));
+		return false;
+	}
+	if (cache->size() >= maxCached)
+		cache->clear();
+	cache->emplace(key, *pattern);
+	return true;
+}
+
 template <typename Body>
 int guarded(Body body)
 {
@@ -95,16 +128,9 @@ int i18n_udate_create_from_skeleton(const char* skeleton, const char* locale, co
 			I18N_ERROR_INVALID_PARAMETER, "Invalid param : skeleton, locale or tz_id");
 	return guarded([&] {
 		icu::Locale loc = toLocale(locale);
-		UErrorCode status = U_ZERO_ERROR;
-		std::unique_ptr<icu::DateTimePatternGenerator> generator(
-				icu::DateTimePatternGenerator::createInstance(loc, status));
 		icu::UnicodeString pattern;
-		if (U_SUCCESS(status))
-			pattern = generator->getBestPattern(icu::UnicodeString::fromUTF8(skeleton), status);
-		if (U_FAILURE(status)) {
-			WWARNING("getBestPattern() Failed(%s)", u_errorName(status));
+		if (!bestPattern(loc, skeleton, &pattern))
 			return (int)I18N_ERROR_INVALID_PARAMETER;
-		}
 		return makeFormatter(pattern, loc, tz_id, formatter);
 	});
 }

@@ -39,10 +39,6 @@ UiGadget::~UiGadget()
 {
 	liveGadgets().erase(m_handle);
 	delete m_handle;
-	if (m_destroyJob) {
-		ecore_job_del(m_destroyJob);
-		ecore_shutdown();
-	}
 	for (app_control_h result : m_results)
 		app_control_destroy(result);
 }
@@ -80,20 +76,15 @@ int UiGadget::requestDestroy()
 	if (m_destroyRequested)
 		return UG_ERROR_NONE;
 	m_destroyRequested = true;
-	// Held while the job waits, so the job can always be removed safely.
-	ecore_init();
-	m_destroyJob = ecore_job_add(&UiGadget::__destroyJobCb, this);
+	m_destroyJob = std::make_unique<appcontrol::MainLoopJob>([this] { __onDestroyJob(); });
 	return UG_ERROR_NONE;
 }
 
-void UiGadget::__destroyJobCb(void* data)
+void UiGadget::__onDestroyJob()
 {
-	auto* self = static_cast<UiGadget*>(data);
-	self->m_destroyJob = nullptr;
-	self->m_destroyed = true;
-	ecore_shutdown();
-	// The host usually deletes the gadget here, so `self` is not used after.
-	DestroyCallback onDestroy = self->m_onDestroy;
+	m_destroyed = true;
+	// The host usually deletes the gadget here, so `this` is not used after.
+	DestroyCallback onDestroy = m_onDestroy;
 	if (onDestroy)
 		onDestroy();
 }

@@ -4,9 +4,10 @@
 
 #include "ui-gadget.h"
 
-#include <Ecore.h>
+#include "MainLoopJob.h"
 
 #include <functional>
+#include <memory>
 #include <string>
 #include <vector>
 
@@ -41,14 +42,14 @@ public:
 	int requestDestroy();
 
 private:
-	static void __destroyJobCb(void* data);
+	void __onDestroyJob();
 
 	std::string m_name;
 	ResultCallback m_onResult;
 	DestroyCallback m_onDestroy;
 	ui_gadget_h m_handle = nullptr;
 	std::vector<app_control_h> m_results;
-	Ecore_Job* m_destroyJob = nullptr;
+	std::unique_ptr<appcontrol::MainLoopJob> m_destroyJob;
 	bool m_destroyRequested = false;
 	bool m_destroyed = false;
 };

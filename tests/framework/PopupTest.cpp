@@ -5,6 +5,7 @@
 #include "WMenuPopup.h"
 #include "WPopup.h"
 #include "WToastPopup.h"
+#include "notification.h"
 
 #include <gtest/gtest.h>
 
@@ -201,4 +202,17 @@ TEST(ToastPopup, ClosesItselfAfterItsTimeout)
 	EXPECT_STREQ(elm_object_text_get(toast->getEvasObj()), "Saved");
 	screen.pumpFor(0.5);
 	EXPECT_TRUE(alive.expired());
+}
+
+TEST(Harness, ReadsPostedNoticesAndLogLines)
+{
+	ScreenHarness screen;
+	ScreenHarness::clearNotices();
+	EXPECT_EQ(notification_status_message_post("Saved"), 0);
+	EXPECT_EQ(ScreenHarness::notices(), (std::vector<std::string> { "Saved" }));
+	ScreenHarness::clearNotices();
+	EXPECT_TRUE(ScreenHarness::notices().empty());
+	ct::log::clear();
+	EXPECT_FALSE(screen.naviframe()->pop());
+	EXPECT_TRUE(ScreenHarness::logContains("naviframe is empty"));
 }

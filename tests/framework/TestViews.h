@@ -36,7 +36,7 @@ protected:
 	{
 		m_log.push_back(m_tag + ":onCreate");
 		layout = elm_layout_add(parent);
-		elm_layout_theme_set(layout, "layout", "application", "default");
+		elm_layout_theme_set(layout, "layout", "application", "content-back");
 		return layout;
 	}
 	void onCreated() override { m_log.push_back(m_tag + ":onCreated"); }

@@ -24,6 +24,8 @@ TEST(ViewLifecycle, PushThenBackRunsEveryStepInOrder)
 		EXPECT_EQ(WView_getWindowBaseLayoutEvasObj(view), screen.window().getBaseLayoutEvasObj());
 		EXPECT_EQ(view->getNaviframe(), screen.naviframe());
 		EXPECT_NE(view->getNaviItem(), nullptr);
+		view->setTitle("Details");
+		EXPECT_EQ(ScreenHarness::naviText(view), "Details");
 
 		screen.sendBackKey();
 		EXPECT_EQ(screen.viewCount(), 0);
@@ -121,6 +123,7 @@ TEST(ViewLifecycle, ViewsDestroyedInOnPopOrTwiceEndOnce)
 
 TEST(ViewLifecycle, BadInputIsRefusedAndLogged)
 {
+	EventLog log;
 	ScreenHarness screen;
 	ct::log::clear();
 	EXPECT_FALSE(screen.naviframe()->push(nullptr));
@@ -131,7 +134,6 @@ TEST(ViewLifecycle, BadInputIsRefusedAndLogged)
 	screen.sendBackKey();
 	EXPECT_TRUE(ct::log::contains("back on an empty naviframe"));
 
-	EventLog log;
 	auto* orphan = new RecordingView(log, "o");
 	EXPECT_FALSE(orphan->create(nullptr, nullptr));
 	EXPECT_TRUE(ct::log::contains("parent is null"));

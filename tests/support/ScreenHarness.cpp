@@ -91,11 +91,17 @@ ScreenHarness::ScreenHarness(int width, int height)
 	} else {
 		m_naviframe = nullptr;
 	}
+#ifdef CT_HAS_NOTIFICATION_LOG
+	ct::notification::setToastWindow(win());
+#endif
 	pumpUntilIdle(1.0);
 }
 
 ScreenHarness::~ScreenHarness()
 {
+#ifdef CT_HAS_NOTIFICATION_LOG
+	ct::notification::setToastWindow(nullptr);
+#endif
 	if (auto naviframe = m_naviframeAlive.lock())
 		naviframe->destroy();
 	pumpFor(kFrame);
@@ -252,6 +258,13 @@ void ScreenHarness::selectItem(Elm_Object_Item* item)
 		return;
 	elm_genlist_item_selected_set(item, EINA_FALSE);
 	elm_genlist_item_selected_set(item, EINA_TRUE);
+}
+
+std::string ScreenHarness::naviText(app_assist::WView* view, const char* part)
+{
+	Elm_Object_Item* item = view ? view->getNaviItem() : nullptr;
+	const char* text = item ? elm_object_item_part_text_get(item, part) : nullptr;
+	return text ? text : "";
 }
 
 std::string ScreenHarness::buttonLabel(Evas_Object* button)

@@ -59,10 +59,16 @@ public:
 	// Rows of class `Row` (or derived), in list order.
 	template <class Row>
 	static std::vector<Row*> rowsOf(Evas_Object* genlist);
+	// Rows of class `Row` for which `pred(row)` holds, e.g. rows of one kind.
+	template <class Row, class Pred>
+	static std::vector<Row*> rowsWhere(Evas_Object* genlist, Pred pred);
 	static std::string itemStyle(Elm_Object_Item* item);
 	// The item class's text for `part`, realized or not ("" when none).
 	static std::string itemText(Elm_Object_Item* item, const char* part);
 	static void selectItem(Elm_Object_Item* item);
+
+	// A text part of a view's naviframe item ("elm.text.title" is its title).
+	static std::string naviText(app_assist::WView* view, const char* part = "elm.text.title");
 
 	static std::string buttonLabel(Evas_Object* button);
 	static bool isDisabled(Evas_Object* obj);
@@ -94,6 +100,17 @@ std::vector<Row*> ScreenHarness::rowsOf(Evas_Object* genlist)
 	for (Elm_Object_Item* item : genlistItems(genlist)) {
 		auto* base = static_cast<app_assist::WGenlistItem*>(elm_object_item_data_get(item));
 		if (auto* row = dynamic_cast<Row*>(base))
+			rows.push_back(row);
+	}
+	return rows;
+}
+
+template <class Row, class Pred>
+std::vector<Row*> ScreenHarness::rowsWhere(Evas_Object* genlist, Pred pred)
+{
+	std::vector<Row*> rows;
+	for (Row* row : rowsOf<Row>(genlist)) {
+		if (pred(row))
 			rows.push_back(row);
 	}
 	return rows;

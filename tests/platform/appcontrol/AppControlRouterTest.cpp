@@ -212,10 +212,12 @@ TEST_F(AppControlRouterTest, LateReplyAfterTheSenderCancelledIsNeverDelivered)
 	ASSERT_EQ(APP_CONTROL_ERROR_NONE, sendFrom(*other, h));
 	app_control_destroy(h);
 
+	EXPECT_EQ(1u, pendingReplies(sender.get()));
 	{
 		// The view that sent the first request dies before the answer.
 		ScopedReplyCancel dying(sender.get());
 	}
+	EXPECT_EQ(0u, pendingReplies(sender.get()));
 	sender.reset();
 	app_control_h answer = nullptr;
 	app_control_create(&answer);
@@ -247,7 +249,9 @@ TEST_F(AppControlRouterTest, CancelAfterReplyButBeforeTheMainLoopDropsTheQueuedR
 	sendFrom(b, h);
 	sendFrom(a, h);
 	app_control_destroy(h);
+	EXPECT_EQ(2u, pendingReplies(&a));
 	EXPECT_EQ(2, app_control_cancel_replies(&a));
+	EXPECT_EQ(0u, pendingReplies(&a));
 	EXPECT_EQ(0, app_control_cancel_replies(&a));
 	pump();
 	EXPECT_TRUE(a.received.empty());
@@ -386,4 +390,21 @@ TEST_F(AppControlRouterTest, HandlerMayReplyLaterFromTheMainLoop)
 		ecore_main_loop_iterate();
 	EXPECT_EQ(1, got.calls);
 	EXPECT_EQ("/tmp/p.jpg", got.path);
+}
+
+TEST_F(AppControlRouterTest, HandlersThatNeverAnswerCannotGrowTheRouterWithoutBound)
+{
+	std::vector<Reply> replies;
+	Registration reg = registerOperationHandler(APP_CONTROL_OPERATION_CALL, [&](app_control_h, const Reply& reply) {
+		replies.push_back(reply);
+		return APP_CONTROL_ERROR_NONE;
+	});
+	app_control_h h = makeRequest(nullptr, APP_CONTROL_OPERATION_CALL);
+	for (int i = 0; i < 1100; ++i)
+		ASSERT_EQ(APP_CONTROL_ERROR_NONE, app_control_send_launch_request(h, nullptr, nullptr));
+	app_control_destroy(h);
+	EXPECT_FALSE(replies.front().isPending());
+	EXPECT_TRUE(replies.back().isPending());
+	EXPECT_EQ(APP_CONTROL_ERROR_NONE, replies.back()(nullptr, APP_CONTROL_RESULT_SUCCEEDED));
+	EXPECT_EQ(1000u, launches().size());
 }

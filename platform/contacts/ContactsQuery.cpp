@@ -43,6 +43,17 @@ std::string quoted(const char* identifier)
 	return std::string("\"") + identifier + "\"";
 }
 
+std::string ftsPhrase(const std::string& text)
+{
+	std::string out = "\"";
+	for (char c : text) {
+		if (c == '"')
+			out += '"';
+		out += c;
+	}
+	return out + "\"";
+}
+
 } // namespace ct::contacts
 
 namespace {
@@ -55,29 +66,20 @@ SqlParam textParam(const std::string& text)
 	return p;
 }
 
-// The FTS5 phrase that matches `text` literally.
-std::string ftsPhrase(const std::string& text)
-{
-	std::string out = "\"";
-	for (char c : text) {
-		if (c == '"')
-			out += '"';
-		out += c;
-	}
-	return out + "\"";
-}
-
 // Trigram index lookup for "person display name contains", which narrows the
-// rows before the exact test; texts under 3 characters cannot use it.
+// rows before the exact test. Texts under 3 characters cannot use it; very
+// long ones would build huge index queries and are tested by scanning.
+constexpr size_t kMaxIndexedSearchBytes = 256;
+
 bool usesTrigramIndex(const contacts_filter_s::Item& item, const ViewInfo& view)
 {
 	return item.match == CONTACTS_MATCH_CONTAINS && view.number == (_contacts_person.id >> 16)
 		&& item.propertyId == _contacts_person.display_name
-		&& g_utf8_strlen(item.value.text.c_str(), -1) >= 3;
+		&& g_utf8_strlen(item.value.text.c_str(), -1) >= 3 && item.value.text.size() <= kMaxIndexedSearchBytes;
 }
 
 void stringCondition(const contacts_filter_s::Item& item, const ViewInfo& view, const std::string& col,
-	std::string& sql, std::vector<SqlParam>& params)
+	std::string& sql, std::vector<SqlParam>& params, const contacts_filter_s::IndexChoice& useIndex)
 {
 	const std::string& v = item.value.text;
 	switch (item.match) {
@@ -90,9 +92,9 @@ void stringCondition(const contacts_filter_s::Item& item, const ViewInfo& view, 
 		params.push_back(textParam(v));
 		break;
 	case CONTACTS_MATCH_CONTAINS:
-		if (usesTrigramIndex(item, view)) {
+		if (usesTrigramIndex(item, view) && (!useIndex || useIndex(v))) {
 			sql += "\"id\" IN (SELECT rowid FROM persons_fts WHERE persons_fts MATCH ?) AND ";
-			params.push_back(textParam(ftsPhrase(v)));
+			params.push_back(textParam(ct::contacts::ftsPhrase(v)));
 		}
 		sql += "instr(lower(" + col + "), lower(?)) > 0";
 		params.push_back(textParam(v));
@@ -127,12 +129,12 @@ const char* comparison(int match)
 }
 
 void condition(const contacts_filter_s::Item& item, const ViewInfo& view, std::string& sql,
-	std::vector<SqlParam>& params)
+	std::vector<SqlParam>& params, const contacts_filter_s::IndexChoice& useIndex)
 {
 	const PropertyInfo* p = view.find(item.propertyId);
 	std::string col = ct::contacts::quoted(p->name);
 	if (item.type == PropType::Str) {
-		stringCondition(item, view, col, sql, params);
+		stringCondition(item, view, col, sql, params, useIndex);
 	} else if (item.type != PropType::Bool && item.match == CONTACTS_MATCH_NONE) {
 		sql += col + " IS NULL";
 	} else {
@@ -180,7 +182,7 @@ SqlParam intParam(int64_t v)
 
 } // namespace
 
-int contacts_filter_s::toSql(std::string& sql, std::vector<SqlParam>& params) const
+int contacts_filter_s::toSql(std::string& sql, std::vector<SqlParam>& params, const IndexChoice& useIndex) const
 {
 	WPRET_VM(items.empty(), CONTACTS_ERROR_INVALID_PARAMETER, "empty filter");
 	WPRET_VM(items.back().kind == Item::Kind::Operator, CONTACTS_ERROR_INVALID_PARAMETER,
@@ -190,12 +192,12 @@ int contacts_filter_s::toSql(std::string& sql, std::vector<SqlParam>& params) co
 		if (item.kind == Item::Kind::Operator) {
 			sql += item.op == CONTACTS_FILTER_OPERATOR_AND ? " AND " : " OR ";
 		} else if (item.kind == Item::Kind::Filter) {
-			int err = item.filter->toSql(sql, params);
+			int err = item.filter->toSql(sql, params, useIndex);
 			if (err != CONTACTS_ERROR_NONE)
 				return err;
 		} else {
 			sql += "(";
-			condition(item, *view, sql, params);
+			condition(item, *view, sql, params, useIndex);
 			sql += ")";
 		}
 	}

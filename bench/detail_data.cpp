@@ -124,6 +124,7 @@ BENCHMARK(BM_UnrelatedContactChange)->UseManualTime()->Unit(benchmark::kMicrosec
 
 int main(int argc, char** argv)
 {
+	setenv("CONTACTS_LOG_LEVEL", "error", 0);
 	const char* env = getenv("CONTACTS_BENCH_PERSONS");
 	int persons = env ? atoi(env) : 100000;
 	g_db = ct::bench::ensureDatabase(persons > 0 ? persons : 100000);

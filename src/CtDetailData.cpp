@@ -4,9 +4,12 @@
 #include "ContactsDebug.h"
 #include "CtCommonAddressbookUtil.h"
 #include "CtCommonRecordUtil.h"
+#include "CtContactsAgentMgr.h"
 #include "CtDbChangeSubscription.h"
+#include "CtEsuAgentMgr.h"
 #include "CtRegistryMgr.h"
 
+#include <glib.h>
 #include <unistd.h>
 
 #include <cstdlib>
@@ -27,6 +30,17 @@ char* dupOrNull(const char* text)
 bool isEmpty(const char* text)
 {
 	return !text || !*text;
+}
+
+// A copy with invalid UTF-8 sequences replaced; null for null. The caller frees it.
+char* validUtf8OrNull(const char* text)
+{
+	if (!text)
+		return nullptr;
+	gchar* valid = g_utf8_make_valid(text, -1);
+	char* copy = strdup(valid);
+	g_free(valid);
+	return copy;
 }
 
 void freeText(char*& text)
@@ -330,9 +344,11 @@ void CtDetailData::__loadGal(const CtGalSearchData* galData)
 	m_personId = kGalPersonId;
 	m_galData = galData;
 	WPRET_M(!galData, "Invalid param : galData");
-	m_displayName = ctCommonRemoveNewline(galData->displayName);
+	char* displayName = validUtf8OrNull(galData->displayName);
+	m_displayName = ctCommonRemoveNewline(displayName);
+	free(displayName);
 	m_thumbnailPath = dupOrNull(galData->imagePath);
-	m_company = dupOrNull(galData->company);
+	m_company = validUtf8OrNull(galData->company);
 	__addGalNumber(galData->phone1, CONTACTS_NUMBER_TYPE_WORK);
 	__addGalNumber(galData->phone2, CONTACTS_NUMBER_TYPE_CELL);
 	__addGalNumber(galData->phone3, CONTACTS_NUMBER_TYPE_HOME);
@@ -351,8 +367,11 @@ void CtDetailData::__addGalNumber(const char* number, int type)
 	}
 	contacts_record_set_int(record, _contacts_number.type, type);
 	err = contacts_record_set_str(record, _contacts_number.number, number);
-	if (err != CONTACTS_ERROR_NONE)
+	if (err != CONTACTS_ERROR_NONE) {
 		WFAILED("contacts_record_set_str", err);
+		contacts_record_destroy(record, true);
+		return;
+	}
 	m_numberList = eina_list_append(m_numberList, record);
 }
 
@@ -368,8 +387,11 @@ void CtDetailData::__addGalEmail(const char* email)
 	}
 	contacts_record_set_int(record, _contacts_email.type, CONTACTS_EMAIL_TYPE_WORK);
 	err = contacts_record_set_str(record, _contacts_email.email, email);
-	if (err != CONTACTS_ERROR_NONE)
+	if (err != CONTACTS_ERROR_NONE) {
 		WFAILED("contacts_record_set_str", err);
+		contacts_record_destroy(record, true);
+		return;
+	}
 	m_emailList = eina_list_append(m_emailList, record);
 }
 
@@ -468,6 +490,8 @@ void CtDetailData::setFavorite(bool isFavorite)
 		return;
 	}
 	m_isFavorite = isFavorite;
+	if (CtEsuAgentMgr::getInstance()->getEasySignUpCscFeatureEnabled())
+		CtContactsAgentMgr::getInstance()->syncDataStart(m_personId, nullptr, nullptr);
 }
 
 void CtDetailData::setRingtone(const char* path)

@@ -67,7 +67,7 @@ KeyValueStore::KeyValueStore() = default;
 
 KeyValueStore::~KeyValueStore()
 {
-	*m_alive = false;
+	*m_self = nullptr;
 }
 
 int KeyValueStore::open(const std::string& path)
@@ -126,8 +126,7 @@ int KeyValueStore::set(const std::string& key, const Value& value)
 		rc = tx.commit();
 	if (rc != SQLITE_OK)
 		return storageError(m_db, "write", rc);
-	if (m_watcher)
-		m_watcher->notifyLocalChange();
+	__announceLocalChange();
 	return kOk;
 }
 
@@ -165,8 +164,7 @@ int KeyValueStore::removeAll()
 		rc = tx.commit();
 	if (rc != SQLITE_OK)
 		return storageError(m_db, "remove all", rc);
-	if (m_watcher)
-		m_watcher->notifyLocalChange();
+	__announceLocalChange();
 	return kOk;
 }
 
@@ -192,6 +190,17 @@ void KeyValueStore::addObserver(const std::string& key, const void* tag, Observe
 	__ensureWatcher();
 }
 
+void KeyValueStore::takeObserversFrom(KeyValueStore& other)
+{
+	for (auto& [key, list] : other.m_observers) {
+		for (auto& registration : list)
+			addObserver(key, registration->tag, registration->observer);
+		for (auto& registration : list)
+			registration->active = false;
+	}
+	other.m_observers.clear();
+}
+
 bool KeyValueStore::removeObserver(const std::string& key, const void* tag)
 {
 	auto found = m_observers.find(key);
@@ -215,6 +224,28 @@ void KeyValueStore::__ensureWatcher()
 		return;
 	m_deliveredSequence = __maxSequence();
 	m_watcher = std::make_unique<ct::db::StoreChangeWatcher>(m_db, [this] { __onDatabaseChanged(); });
+	m_watching = true;
+}
+
+void KeyValueStore::__announceLocalChange()
+{
+	if (!m_watching)
+		return;
+	if (eina_main_loop_is()) {
+		m_watcher->notifyLocalChange();
+		return;
+	}
+	// The watcher belongs to the main loop: hand the news over to it.
+	auto* self = new std::weak_ptr<KeyValueStore*>(m_self);
+	ecore_main_loop_thread_safe_call_async(__announceFromThreadCb, self);
+}
+
+void KeyValueStore::__announceFromThreadCb(void* data)
+{
+	std::unique_ptr<std::weak_ptr<KeyValueStore*>> weak(static_cast<std::weak_ptr<KeyValueStore*>*>(data));
+	std::shared_ptr<KeyValueStore*> self = weak->lock();
+	if (self && *self && (*self)->m_watcher)
+		(*self)->m_watcher->notifyLocalChange();
 }
 
 void KeyValueStore::__onDatabaseChanged()
@@ -226,9 +257,9 @@ void KeyValueStore::__onDatabaseChanged()
 		changes.emplace_back(st.columnText(0), readValue(st, 1, 2));
 		m_deliveredSequence = std::max(m_deliveredSequence, st.columnInt64(3));
 	}
-	std::shared_ptr<bool> alive = m_alive;
+	std::shared_ptr<KeyValueStore*> self = m_self;
 	for (const auto& [key, value] : changes) {
-		if (!*alive)
+		if (!*self)
 			return;
 		__notify(key, value);
 	}
@@ -241,9 +272,9 @@ void KeyValueStore::__notify(const std::string& key, const Value& value)
 		return;
 	// A snapshot: observers may add or remove registrations while we call them.
 	auto snapshot = found->second;
-	std::shared_ptr<bool> alive = m_alive;
+	std::shared_ptr<KeyValueStore*> self = m_self;
 	for (const auto& registration : snapshot) {
-		if (!*alive)
+		if (!*self)
 			return;
 		if (registration->active)
 			registration->observer(key, value);

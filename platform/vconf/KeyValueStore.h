@@ -6,6 +6,7 @@
 #include "SqliteDatabase.h"
 #include "StoreChangeWatcher.h"
 
+#include <atomic>
 #include <cstdint>
 #include <functional>
 #include <map>
@@ -68,10 +69,15 @@ public:
 	// Keys holding a value, sorted.
 	std::vector<std::string> keys() const;
 
+	// Values may be read and written from any thread; observers are added,
+	// removed and called on the main loop.
 	// One observer per (key, tag); adding it again replaces the function.
 	void addObserver(const std::string& key, const void* tag, Observer observer);
 	// True when there was such an observer.
 	bool removeObserver(const std::string& key, const void* tag);
+	// Takes over every observer of `other` (which keeps none), so listeners
+	// survive the store being reopened elsewhere.
+	void takeObserversFrom(KeyValueStore& other);
 
 	// kOk when `key` is non-empty UTF-8 of at most kMaxKeyBytes; else kInvalid.
 	static int validateKey(const char* key);
@@ -89,15 +95,19 @@ private:
 	int64_t __maxSequence() const;
 	int __writeRow(const std::string& key, const Value& value);
 	void __ensureWatcher();
+	void __announceLocalChange();
+	static void __announceFromThreadCb(void* data);
 	void __onDatabaseChanged();
 	void __notify(const std::string& key, const Value& value);
 
 	ct::db::Database m_db;
 	std::unique_ptr<ct::db::StoreChangeWatcher> m_watcher;
 	std::map<std::string, std::vector<std::shared_ptr<Registration>>> m_observers;
+	std::atomic<bool> m_watching{false};
 	int64_t m_deliveredSequence = 0;
-	// Cleared on destruction so a delivery in progress can tell the store died.
-	std::shared_ptr<bool> m_alive = std::make_shared<bool>(true);
+	// Cleared on destruction, so that a delivery in progress or a change
+	// announced from another thread can tell the store died.
+	std::shared_ptr<KeyValueStore*> m_self = std::make_shared<KeyValueStore*>(this);
 };
 
 } // namespace ct::kv

@@ -1,11 +1,12 @@
 // The process-wide KeyValueStore behind a C interface (vconf, preferences):
-// opened on first use in the current data folder and reopened when the data
-// folder changes.
+// opened on first use in the current data folder and reopened, with its
+// observers, when the data folder changes.
 #pragma once
 
 #include "KeyValueStore.h"
 
 #include <memory>
+#include <mutex>
 #include <string>
 
 namespace ct::kv {
@@ -25,6 +26,7 @@ public:
 
 private:
 	std::string m_fileName;
+	std::mutex m_mutex;
 	std::unique_ptr<KeyValueStore> m_store;
 };
 

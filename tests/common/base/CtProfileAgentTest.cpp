@@ -1,5 +1,7 @@
+#include "AppControlRouter.h"
 #include "CtContactsAgentMgr.h"
 #include "CtContactsAgentUtil.h"
+#include "CtEsuAgentMgr.h"
 #include "CtRegistryMgr.h"
 #include "TempDataDir.h"
 
@@ -33,6 +35,18 @@ void countSync(int result, void* data)
 {
 	if (result == 0)
 		++*static_cast<int*>(data);
+}
+
+struct SignUp {
+	int calls = 0;
+	app_control_result_e result = APP_CONTROL_RESULT_FAILED;
+};
+
+void onSignUp(app_control_h, app_control_h, app_control_result_e result, void* data)
+{
+	auto* signUp = static_cast<SignUp*>(data);
+	++signUp->calls;
+	signUp->result = result;
 }
 
 } // namespace
@@ -110,4 +124,56 @@ TEST_F(CtProfileAgentTest, SyncsAreRecordedAndCallBackUnlessCancelled)
 	EXPECT_EQ(CtContactsAgentMgr::SyncKind::PersonData, requests[1].kind);
 	EXPECT_EQ(42, requests[1].personId);
 	EXPECT_EQ(CtContactsAgentMgr::SyncKind::Profile, requests[2].kind);
+}
+
+TEST_F(CtProfileAgentTest, SignUpStepStoresTheStatusOnSuccessOnly)
+{
+	auto* esu = CtEsuAgentMgr::getInstance();
+	EXPECT_FALSE(esu->getEasySignUpCscFeatureEnabled());
+	setenv("CONTACTS_FEATURES", "13", 1);
+	EXPECT_TRUE(esu->getEasySignUpCscFeatureEnabled());
+	unsetenv("CONTACTS_FEATURES");
+	EXPECT_EQ(0, esu->getEasySignUpStatus());
+	EXPECT_EQ(-1, esu->getEasySignUpAddressBookId());
+
+	SignUp noApp;
+	EXPECT_FALSE(esu->launchEnhancedFeautre(onSignUp, &noApp, nullptr));
+
+	app_control_result_e answer = APP_CONTROL_RESULT_CANCELED;
+	auto registration = ct::appcontrol::registerAppHandler(CtEsuAgentMgr::kSignUpAppId,
+		[&](app_control_h, const ct::appcontrol::Reply& reply) {
+			reply(nullptr, answer);
+			return 0;
+		});
+	SignUp cancelled;
+	ASSERT_TRUE(esu->launchEnhancedFeautre(onSignUp, &cancelled, nullptr));
+	EXPECT_TRUE(pumpUntil([&] { return cancelled.calls > 0; }, 1.0));
+	EXPECT_EQ(APP_CONTROL_RESULT_CANCELED, cancelled.result);
+	EXPECT_EQ(0, esu->getEasySignUpStatus());
+
+	answer = APP_CONTROL_RESULT_SUCCEEDED;
+	SignUp gone, succeeded;
+	ASSERT_TRUE(esu->launchEnhancedFeautre(onSignUp, &gone, nullptr));
+	esu->cancelEnhancedFeature(&gone);
+	ASSERT_TRUE(esu->launchEnhancedFeautre(onSignUp, &succeeded, nullptr));
+	EXPECT_TRUE(pumpUntil([&] { return succeeded.calls > 0; }, 1.0));
+	EXPECT_EQ(0, gone.calls);
+	EXPECT_NE(0, esu->getEasySignUpStatus());
+}
+
+TEST_F(CtProfileAgentTest, SharingStatusChangeIsConfirmedThroughTheSignal)
+{
+	auto* esu = CtEsuAgentMgr::getInstance();
+	EXPECT_FALSE(esu->getProfileSharingStatus());
+	std::vector<int> values;
+	int id = CtRegistryMgr::getInstance()->addChangeListener([&](ctRegistryKey key, int value) {
+		if (key == CT_REGISTRY_KEY_PROFILE_SHARING_STATE)
+			values.push_back(value);
+	});
+	ASSERT_TRUE(esu->setProfileSharingStatus(true));
+	EXPECT_TRUE(esu->getProfileSharingStatus());
+	EXPECT_TRUE(values.empty());
+	EXPECT_TRUE(pumpUntil([&] { return !values.empty(); }, 1.0));
+	EXPECT_EQ(0, values[0]);
+	CtRegistryMgr::getInstance()->removeChangeListener(id);
 }

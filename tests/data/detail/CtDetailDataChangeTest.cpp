@@ -212,3 +212,11 @@ TEST_F(CtDetailDataChangeTest, GalEntryAndMissingPersonNeverNotify)
 	EXPECT_TRUE(galListener.uris.empty());
 	EXPECT_TRUE(nobodyListener.uris.empty());
 }
+
+TEST_F(CtDetailDataChangeTest, LinkingAnotherPersonInMovesTheMarkerAndNotifies)
+{
+	// The moved contact is not among the remembered ones: only the person's
+	// change marker tells that the person changed.
+	ASSERT_EQ(CONTACTS_ERROR_NONE, contacts_person_link_person(m_personId, m_otherPerson));
+	EXPECT_EQ(1u, callsAfterSettling());
+}

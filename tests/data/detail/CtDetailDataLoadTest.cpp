@@ -4,12 +4,15 @@
 #include "DetailTestStore.h"
 
 #include "ContactsCommon.h"
+#include "CtContactsAgentMgr.h"
 #include "CtCommonAddressbookUtil.h"
 #include "CtCommonRecordUtil.h"
 #include "LogSink.h"
 #include "SqliteFaultInjector.h"
 #include "TempDataDir.h"
 
+
+#include <glib.h>
 
 #include <cstdio>
 #include <fstream>
@@ -338,6 +341,15 @@ TEST_F(CtDetailDataLoadTest, GalEntryBuildsInMemoryRecordsAndStoresNothing)
 		EXPECT_EQ(nullptr, data.getEmailList());
 		EXPECT_EQ(nullptr, data.getDisplayName());
 	}
+	CtGalSearchData broken = {nullptr, nullptr, "Bad\xff name", "\xfe\xff", "200", nullptr, "\xc3", "Co\xffrp"};
+	{
+		CtDetailData data(&broken);
+		EXPECT_EQ((std::vector<std::string>{"200"}), numbersOf(data));
+		EXPECT_EQ(nullptr, data.getEmailList());
+		ASSERT_NE(nullptr, data.getDisplayName());
+		EXPECT_TRUE(g_utf8_validate(data.getDisplayName(), -1, nullptr));
+		EXPECT_TRUE(g_utf8_validate(data.getCompany(), -1, nullptr));
+	}
 	CtGalSearchData empty = {};
 	CtDetailData blank(&empty);
 	EXPECT_EQ(nullptr, blank.getNumberList());
@@ -347,4 +359,23 @@ TEST_F(CtDetailDataLoadTest, GalEntryBuildsInMemoryRecordsAndStoresNothing)
 	int count = -1;
 	ASSERT_EQ(CONTACTS_ERROR_NONE, contacts_db_get_count(_contacts_contact._uri, &count));
 	EXPECT_EQ(0, count);
+}
+
+TEST_F(CtDetailDataLoadTest, FavoriteStartsADataSyncOnlyWithEasySignUp)
+{
+	int personId = addSimplePerson("Synced");
+	CtContactsAgentMgr* agent = CtContactsAgentMgr::getInstance();
+	agent->clearSyncRequests();
+	CtDetailData data(personId);
+	data.setFavorite(true);
+	EXPECT_TRUE(agent->getSyncRequests().empty());
+
+	setenv("CONTACTS_FEATURES", "13", 1);
+	data.setFavorite(false);
+	unsetenv("CONTACTS_FEATURES");
+	ASSERT_EQ(1u, agent->getSyncRequests().size());
+	EXPECT_EQ(CtContactsAgentMgr::SyncKind::PersonData, agent->getSyncRequests().front().kind);
+	EXPECT_EQ(personId, agent->getSyncRequests().front().personId);
+	settle(0.1);
+	agent->clearSyncRequests();
 }

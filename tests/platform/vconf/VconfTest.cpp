@@ -11,6 +11,7 @@
 #include <filesystem>
 #include <memory>
 #include <string>
+#include <thread>
 #include <vector>
 
 namespace {
@@ -229,6 +230,18 @@ TEST_F(Vconf, CallbacksSeeOwnChangesOnTheMainLoop)
 	EXPECT_EQ(2u, second.names.size());
 }
 
+TEST_F(Vconf, CallbacksFollowTheStoreToANewDataFolder)
+{
+	Recorder recorder;
+	ASSERT_EQ(VCONF_OK, vconf_notify_key_changed(VCONFKEY_SETAPPL_PSMODE, recordCb, &recorder));
+	ct::test::TempDataDir other;
+	EXPECT_EQ(0, getInt(VCONFKEY_SETAPPL_PSMODE)) << "the new folder starts from the defaults";
+	ASSERT_EQ(VCONF_OK, vconf_set_int(VCONFKEY_SETAPPL_PSMODE, 1));
+	ASSERT_TRUE(ct::test::pumpUntil([&] { return !recorder.ints.empty(); }));
+	EXPECT_EQ(1, recorder.ints[0]);
+	EXPECT_EQ(VCONF_OK, vconf_ignore_key_changed(VCONFKEY_SETAPPL_PSMODE, recordCb));
+}
+
 namespace {
 
 struct RemovingRecorder {
@@ -262,6 +275,25 @@ TEST_F(Vconf, CallbackRemovedDuringDeliveryIsNotCalled)
 	ct::test::pumpFor(0.3);
 	EXPECT_EQ(1, remover.calls);
 	EXPECT_EQ(0, other.calls);
+}
+
+TEST_F(Vconf, WriteFromAnotherThreadIsDeliveredOnTheMainLoop)
+{
+	Recorder recorder;
+	std::thread::id mainThread = std::this_thread::get_id();
+	static std::thread::id deliveredOn;
+	auto threadCb = [](keynode_t* node, void* data) {
+		deliveredOn = std::this_thread::get_id();
+		recordCb(node, data);
+	};
+	ASSERT_EQ(VCONF_OK, vconf_notify_key_changed(VCONFKEY_TELEPHONY_SIM_POWER_STATE2, threadCb, &recorder));
+	int result = -1;
+	std::thread writer([&] { result = vconf_set_int(VCONFKEY_TELEPHONY_SIM_POWER_STATE2, 0); });
+	writer.join();
+	ASSERT_EQ(VCONF_OK, result);
+	ASSERT_TRUE(ct::test::pumpUntil([&] { return !recorder.ints.empty(); }));
+	EXPECT_EQ(0, recorder.ints[0]);
+	EXPECT_EQ(mainThread, deliveredOn);
 }
 
 TEST_F(Vconf, ChangesFromAnotherProcessReachTheCallback)

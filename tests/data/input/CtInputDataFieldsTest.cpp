@@ -1,6 +1,7 @@
 // The editable contact in memory: type tables, next types, name splits and
 // composed texts, addresses, bad texts.
 #include "CtInputData.h"
+#include "ContactsCommon.h"
 #include "InputTestStore.h"
 
 #include <glib.h>
@@ -277,6 +278,6 @@ TEST_F(CtInputDataFieldsTest, ImagesEventsRingtoneAndFixedAnswers)
 	EXPECT_FALSE(m_data->getAddressbookItemShown());
 	m_data->setAddressbookItemShown(true);
 	EXPECT_TRUE(m_data->getAddressbookItemShown());
-	EXPECT_EQ(m_data->getGroupsName(), "IDS_PB_BODY_NOT_ASSIGNED");
+	EXPECT_EQ(m_data->getGroupsName(), ContactsCommon::translate("IDS_PB_BODY_NOT_ASSIGNED"));
 	EXPECT_EQ(m_data->getEmergencyNumber(), nullptr);
 }

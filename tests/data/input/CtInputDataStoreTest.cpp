@@ -2,6 +2,7 @@
 // requests, storage choice, saving (atomic under write faults), SIM saving,
 // groups, emergency number and change notification.
 #include "CtInputData.h"
+#include "CtCommonAddressbookUtil.h"
 #include "ICtChangeListener.h"
 #include "InputTestStore.h"
 
@@ -250,7 +251,7 @@ TEST_F(CtInputDataStoreTest, GoogleStorageJoinsItsDefaultGroupOnce)
 	data.getAllGroupsId(groups);
 	EXPECT_EQ(groups, std::vector<int>{myContacts});
 	data.updateGroupsName();
-	EXPECT_EQ(data.getGroupsName(), "IDS_PB_BODY_MY_CONTACTS");
+	EXPECT_EQ(data.getGroupsName(), ctCommonGetDisplayGroupName("contacts"));
 	data.removeAllGroups();
 	groups.clear();
 	data.getAllGroupsId(groups);
@@ -268,7 +269,7 @@ TEST_F(CtInputDataStoreTest, GroupNamesAndTheEmergencyFlag)
 	data.addGroupRelation(twin);
 	data.updateGroupsName();
 	EXPECT_TRUE(data.isInEmergencyGroup());
-	EXPECT_EQ(data.getGroupsName(), "Friends, IDS_PB_HEADER_EMERGENCY_CONTACTS");
+	EXPECT_EQ(data.getGroupsName(), "Friends, " + ctCommonGetDisplayGroupName("emergency"));
 	std::vector<int> groups = {99};
 	data.getAllGroupsId(groups);
 	EXPECT_EQ(groups, (std::vector<int>{99, twin, emergency, friends}));

@@ -178,11 +178,11 @@ const char* ContactsSchema::createSql()
 CREATE TABLE meta(key TEXT PRIMARY KEY, value) WITHOUT ROWID;
 CREATE TABLE view_versions(uri TEXT PRIMARY KEY, version INTEGER NOT NULL) WITHOUT ROWID;
 CREATE TABLE ringtones(kind INTEGER, id INTEGER, path TEXT, flag INTEGER, position INTEGER, PRIMARY KEY(kind, id));
-CREATE TABLE address_books(id INTEGER PRIMARY KEY, account_id INTEGER DEFAULT 0, name TEXT,
+CREATE TABLE address_books(id INTEGER PRIMARY KEY AUTOINCREMENT, account_id INTEGER DEFAULT 0, name TEXT,
 	mode INTEGER DEFAULT 0, provider_name TEXT, user_name TEXT);
-CREATE TABLE groups(id INTEGER PRIMARY KEY, address_book_id INTEGER DEFAULT 0, name TEXT, ringtone_path TEXT,
+CREATE TABLE groups(id INTEGER PRIMARY KEY AUTOINCREMENT, address_book_id INTEGER DEFAULT 0, name TEXT, ringtone_path TEXT,
 	image_path TEXT, vibration TEXT, message_alert TEXT, system_id TEXT, is_read_only INTEGER DEFAULT 0);
-CREATE TABLE persons(id INTEGER PRIMARY KEY, display_name TEXT, display_name_index TEXT,
+CREATE TABLE persons(id INTEGER PRIMARY KEY AUTOINCREMENT, display_name TEXT, display_name_index TEXT,
 	display_contact_id INTEGER DEFAULT 0, ringtone_path TEXT, image_thumbnail_path TEXT, vibration TEXT,
 	message_alert TEXT, status TEXT, is_favorite INTEGER DEFAULT 0, favorite_priority REAL DEFAULT 0,
 	link_count INTEGER DEFAULT 0, addressbook_ids TEXT, has_phonenumber INTEGER DEFAULT 0,
@@ -196,14 +196,14 @@ CREATE TRIGGER persons_fts_ad AFTER DELETE ON persons BEGIN
 CREATE TRIGGER persons_fts_au AFTER UPDATE OF display_name ON persons BEGIN
 	INSERT INTO persons_fts(persons_fts, rowid, display_name) VALUES ('delete', old.id, old.display_name);
 	INSERT INTO persons_fts(rowid, display_name) VALUES (new.id, new.display_name); END;
-CREATE TABLE contacts(id INTEGER PRIMARY KEY, display_name TEXT, display_source_type INTEGER DEFAULT 0,
+CREATE TABLE contacts(id INTEGER PRIMARY KEY AUTOINCREMENT, display_name TEXT, display_source_type INTEGER DEFAULT 0,
 	address_book_id INTEGER DEFAULT 0, ringtone_path TEXT, image_thumbnail_path TEXT, is_favorite INTEGER DEFAULT 0,
 	has_phonenumber INTEGER DEFAULT 0, has_email INTEGER DEFAULT 0, person_id INTEGER NOT NULL, uid TEXT,
 	vibration TEXT, message_alert TEXT, changed_time INTEGER DEFAULT 0, link_mode INTEGER DEFAULT 0,
 	changed_ver INTEGER DEFAULT 0);
 CREATE INDEX contacts_person ON contacts(person_id);
 CREATE INDEX contacts_book ON contacts(address_book_id);
-CREATE TABLE my_profiles(id INTEGER PRIMARY KEY, display_name TEXT, address_book_id INTEGER DEFAULT 0,
+CREATE TABLE my_profiles(id INTEGER PRIMARY KEY AUTOINCREMENT, display_name TEXT, address_book_id INTEGER DEFAULT 0,
 	image_thumbnail_path TEXT, uid TEXT, changed_time INTEGER DEFAULT 0, status TEXT, profile_type INTEGER DEFAULT 0,
 	privacy INTEGER DEFAULT 0, sharing_enabled INTEGER DEFAULT 0);
 CREATE TABLE names(id INTEGER PRIMARY KEY, contact_id INTEGER, owner INTEGER DEFAULT 0, first TEXT, last TEXT,

@@ -122,6 +122,11 @@ TEST(Person, DeletingTheLastContactDeletesThePerson)
 	contacts_record_h r = nullptr;
 	EXPECT_EQ(CONTACTS_ERROR_NO_DATA, contacts_db_get_record(_contacts_person._uri, person, &r));
 	EXPECT_EQ(0, countOf(_contacts_number._uri));
+
+	// An open screen may still hold the deleted ids: they are never given out again.
+	int next = insertContact({ "Next", "", { "2" } });
+	EXPECT_GT(next, a);
+	EXPECT_GT(personOf(next), person);
 }
 
 TEST(AddressBook, PhoneBookAlwaysExistsAndBooksCarryModes)

@@ -200,8 +200,7 @@ TEST(ToastPopup, ClosesItselfAfterItsTimeout)
 	ASSERT_TRUE(toast->create(screen.win(), nullptr));
 	auto alive = toast->getWeakPtr();
 	EXPECT_STREQ(elm_object_text_get(toast->getEvasObj()), "Saved");
-	screen.pumpFor(0.5);
-	EXPECT_TRUE(alive.expired());
+	EXPECT_TRUE(screen.pumpUntil([&] { return alive.expired(); }));
 }
 
 TEST(Harness, ReadsPostedNoticesAndLogLines)

@@ -40,7 +40,9 @@ TEST(UiTimer, CallbacksRepeatWhileTheyReturnTrueThenTheHandleExpires)
 	WUiTimerHandle animatorHandle = WUiTimer::addAnimator(countCb, &animator, view);
 	EXPECT_TRUE(WUiTimer::isAlive(timerHandle));
 
-	screen.pumpFor(0.3);
+	EXPECT_TRUE(screen.pumpUntil([&] {
+		return idlerHandle.expired() && timerHandle.expired() && animatorHandle.expired();
+	}));
 	EXPECT_EQ(idler.fired, 3);
 	EXPECT_EQ(timer.fired, 1);
 	EXPECT_EQ(animator.fired, 4);
@@ -93,7 +95,8 @@ TEST(UiTimer, CallbackMayDestroyItsOwnerOrItself)
 		WUiTimer::destroy(self);
 		return true;
 	}, nullptr, holder);
-	screen.pumpFor(0.2);
+	EXPECT_TRUE(screen.pumpUntil([&] { return fired > 0 && selfFired > 0; }));
+	screen.pumpFor(0.1);
 	EXPECT_EQ(fired, 1);
 	EXPECT_TRUE(alive.expired());
 	EXPECT_EQ(selfFired, 1);

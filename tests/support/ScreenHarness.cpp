@@ -173,6 +173,12 @@ void ScreenHarness::pumpFor(double seconds)
 	__runUntil([&] { return ecore_time_get() >= end; }, seconds + 1.0);
 }
 
+bool ScreenHarness::pumpUntil(const std::function<bool()>& done, double maxSeconds)
+{
+	__runUntil(done, maxSeconds);
+	return done();
+}
+
 void ScreenHarness::__feedKey(const char* key)
 {
 	Evas* canvas = evas_object_evas_get(win());

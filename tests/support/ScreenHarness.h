@@ -10,6 +10,7 @@
 
 #include <Elementary.h>
 
+#include <functional>
 #include <memory>
 #include <string>
 #include <vector>
@@ -42,6 +43,9 @@ public:
 	// Runs the main loop for `frames` animation frames.
 	void pumpFrames(int frames);
 	void pumpFor(double seconds);
+	// Runs the main loop until `done` holds (at most `maxSeconds`); returns
+	// whether it holds. Prefer this to pumpFor when waiting for something.
+	bool pumpUntil(const std::function<bool()>& done, double maxSeconds = 5.0);
 
 	// Hardware keys, fed to the window's canvas as the device would.
 	void sendBackKey();

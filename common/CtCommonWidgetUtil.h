@@ -16,9 +16,16 @@ Evas_Object* ctCommonCreateLayout(Evas_Object* parent, const char* edj, const ch
 // An image showing `group` of the edje file `edj` (resource name or path),
 // or the plain image file `edj` when `group` is null. With a colour code
 // ("A03O004", "A03O004P", "A03O004D", ...) the image's "ct_icon" colour class
-// takes the theme colour of that code. Null for bad input.
+// takes the theme colour of that code; a code unknown to the theme that ends
+// in "P" (pressed) or "D" (disabled) is derived from its base code: darker,
+// or faded. Null for bad input.
 Evas_Object* ctCommonCreateImage(Evas_Object* parent, const char* edj, const char* group,
 		const char* colorCode = nullptr);
+
+// Recolours an image of ctCommonCreateImage with `colorCode`: the "ct_icon"
+// colour class of an edje image, else the whole image is tinted.
+// Returns false for bad input or an unknown code.
+bool ctCommonSetImageColor(Evas_Object* image, const char* colorCode);
 
 // A button of `style` (default style for null) labelled with the translation
 // id `textId`, calling `clickedCb(data)` on "clicked". Null for a null parent.
@@ -29,15 +36,16 @@ Evas_Object* ctCommonCreateButton(Evas_Object* parent, const char* style, const 
 // `clickedCb(data)` on "clicked".
 Evas_Object* ctCommonCreateDeleteImage(Evas_Object* parent, Evas_Smart_Cb clickedCb, void* data);
 
-// A picture too small for the detail picture area, centred at its own size
-// on a blurred, darkened fill of itself. Null for a null parent or empty path.
+// A picture too small for the detail picture area, kept at its aspect and
+// never enlarged past its own size. Null for a null parent or empty path.
 Evas_Object* ctCommonCreateMaskImageForLowSizeImage(Evas_Object* parent, const char* path);
 
-// The caller-id picture: the image at `path` filling a square, cut round.
+// The caller-id picture: the image at `path` filling a `size` square
+// (cropped to it, at its aspect). Null for a null parent or empty path.
 Evas_Object* ctCommonCreateMaskImageForCallerId(Evas_Object* parent, const char* path, int size);
 
 // Whether the picture at `path` is smaller than the detail picture area
-// (native width or height below 720 × the scale, see ctCommonGetScale).
+// (native width or height below 270 × the scale, see ctCommonGetScale).
 // `obj` is any object on the canvas that loads it. False for bad input.
 bool ctCommonIsLowSizeImage(Evas_Object* obj, const char* path);
 
@@ -83,5 +91,9 @@ bool ctCommonCheckHighlightSupported();
 
 // elm_config_scale_get() / elm_app_base_scale_get() (1.0 when the base is unset).
 double ctCommonGetScale();
+
+// The colour of a theme colour code, with the "P"/"D" derivation above.
+// Returns false (colour untouched) for an unknown code.
+bool ctCommonGetThemeColor(const char* code, int* r, int* g, int* b, int* a);
 
 #endif

@@ -29,7 +29,7 @@ std::string CtDetailViewAddressItem::getText(const char* part)
 {
 	if (strcmp(part, "elm.text.main") == 0) {
 		int type = getData()->getDataType(m_record, _contacts_address.type);
-		return toMarkup(CtCommonGetAddressTypeStr(m_record, type));
+		return typeLabel(CtCommonGetAddressTypeStr(m_record, type));
 	}
 	if (strcmp(part, "elm.text.multiline") == 0)
 		return highlightMain(toMarkup(getCopyText().c_str()));

@@ -26,7 +26,7 @@ std::string CtDetailViewEmailItem::getText(const char* part)
 {
 	if (strcmp(part, "elm.text.sub.left.top") == 0) {
 		int type = getData()->getDataType(m_record, _contacts_email.type);
-		return toMarkup(CtCommonGetEmailTypeStr(m_record, type));
+		return typeLabel(CtCommonGetEmailTypeStr(m_record, type));
 	}
 	if (strcmp(part, "elm.text.main.left.bottom") == 0)
 		return highlightMain(toMarkup(getCopyText().c_str()));

@@ -41,7 +41,7 @@ std::string CtDetailViewEventItem::getText(const char* part)
 {
 	if (strcmp(part, "elm.text.sub.left.top") == 0) {
 		int type = getData()->getDataType(m_record, _contacts_event.type);
-		return toMarkup(CtCommonGetEventTypeStr(m_record, type));
+		return typeLabel(CtCommonGetEventTypeStr(m_record, type));
 	}
 	if (strcmp(part, "elm.text.main.left.bottom") == 0)
 		return highlightMain(toMarkup(getCopyText().c_str()));

@@ -115,6 +115,11 @@ std::string CtDetailViewGenlistItem::translate(const char* textId)
 	return ContactsCommon::translate(textId);
 }
 
+std::string CtDetailViewGenlistItem::typeLabel(const char* label)
+{
+	return label && *label ? toMarkup(ContactsCommon::translate(label)) : std::string();
+}
+
 Evas_Object* CtDetailViewGenlistItem::createCopyArea(Evas_Object* parent, const std::string& text)
 {
 	Evas* evas = evas_object_evas_get(parent);

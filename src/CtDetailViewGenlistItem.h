@@ -67,6 +67,8 @@ protected:
 	std::string highlightMain(const std::string& markup) const;
 	static std::string toMarkup(const char* text);
 	static std::string translate(const char* textId);
+	// A type label of the common library (a translation id or a custom label) as markup.
+	static std::string typeLabel(const char* label);
 	// A transparent rectangle as large as `text` is drawn in the value font,
 	// at most 656 x 54 (scaled).
 	static Evas_Object* createCopyArea(Evas_Object* parent, const std::string& text);

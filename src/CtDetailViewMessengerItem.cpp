@@ -18,7 +18,7 @@ std::string CtDetailViewMessengerItem::getCopyText()
 std::string CtDetailViewMessengerItem::getText(const char* part)
 {
 	if (strcmp(part, "elm.text.sub.left.top") == 0)
-		return toMarkup(CtCommonGetMessengerTypeStr(m_record, getData()->getDataType(m_record, _contacts_messenger.type)));
+		return typeLabel(CtCommonGetMessengerTypeStr(m_record, getData()->getDataType(m_record, _contacts_messenger.type)));
 	if (strcmp(part, "elm.text.main.left.bottom") == 0)
 		return highlightMain(toMarkup(getCopyText().c_str()));
 	return std::string();

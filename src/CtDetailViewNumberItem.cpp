@@ -42,7 +42,7 @@ std::string CtDetailViewNumberItem::getText(const char* part)
 		if (m_isSimContact)
 			return translate("IDS_PB_HEADER_PHONE_M_CALL");
 		int type = getData()->getDataType(m_record, _contacts_number.type);
-		return toMarkup(CtCommonGetNumberTypeStr(m_record, type));
+		return typeLabel(CtCommonGetNumberTypeStr(m_record, type));
 	}
 	if (strcmp(part, "elm.text.main.left.bottom") == 0)
 		return highlightMain(toMarkup(__getNumber().c_str()));

@@ -18,7 +18,7 @@ std::string CtDetailViewRelationItem::getCopyText()
 std::string CtDetailViewRelationItem::getText(const char* part)
 {
 	if (strcmp(part, "elm.text.sub.left.top") == 0)
-		return toMarkup(CtCommonGetRelationshipTypeStr(m_record, getData()->getDataType(m_record, _contacts_relationship.type)));
+		return typeLabel(CtCommonGetRelationshipTypeStr(m_record, getData()->getDataType(m_record, _contacts_relationship.type)));
 	if (strcmp(part, "elm.text.main.left.bottom") == 0)
 		return highlightMain(toMarkup(getCopyText().c_str()));
 	return std::string();

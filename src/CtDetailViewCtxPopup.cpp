@@ -142,8 +142,7 @@ void CtDetailViewCtxPopup::copy()
 	if (row) {
 		std::string text = row->getCopyText();
 		if (__isPictureRow()) {
-			text = "file://" + text;
-			elm_cnp_selection_set(m_window, ELM_SEL_TYPE_CLIPBOARD, ELM_SEL_FORMAT_IMAGE, text.c_str(), text.size());
+			__copyPicture(text);
 		} else {
 			elm_cnp_selection_set(m_window, ELM_SEL_TYPE_CLIPBOARD, ELM_SEL_FORMAT_TEXT, text.c_str(), text.size());
 		}
@@ -151,6 +150,26 @@ void CtDetailViewCtxPopup::copy()
 		WERROR("row is gone");
 	}
 	destroy();
+}
+
+// The toolkit's image clipboard takes the picture's bytes (it reads the
+// format from them); a "file://" text handed over as an image crashes it.
+void CtDetailViewCtxPopup::__copyPicture(const std::string& path)
+{
+	if (path.rfind("file://", 0) == 0)
+		return __copyPicture(path.substr(7));
+	Eina_File* file = eina_file_open(path.c_str(), EINA_FALSE);
+	WPRET_M(!file, "cannot open %s", path.c_str());
+	size_t size = eina_file_size_get(file);
+	void* bytes = size ? eina_file_map_all(file, EINA_FILE_SEQUENTIAL) : nullptr;
+	if (bytes) {
+		if (!elm_cnp_selection_set(m_window, ELM_SEL_TYPE_CLIPBOARD, ELM_SEL_FORMAT_IMAGE, bytes, size))
+			WERROR("elm_cnp_selection_set() is fail");
+		eina_file_map_free(file, bytes);
+	} else {
+		WERROR("cannot read %s", path.c_str());
+	}
+	eina_file_close(file);
 }
 
 void CtDetailViewCtxPopup::__copySelectedCb(void* data, Evas_Object*, void*)

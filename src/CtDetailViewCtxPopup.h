@@ -6,11 +6,12 @@
 #include <Elementary.h>
 
 #include <memory>
+#include <string>
 
 class CtDetailViewGenlistItem;
 
 // The long-press popup of a detail row with one entry, "Copy", that puts the
-// row's value on the clipboard (a file reference for the picture row).
+// row's value on the clipboard as text (the picture row's picture as an image).
 class CtDetailViewCtxPopup : public app_assist::WPopup {
 public:
 	// Where the popup points: above the value, or at a fixed height when the
@@ -45,6 +46,7 @@ private:
 	CtDetailViewGenlistItem* __getRow() const;
 	bool __isPictureRow() const;
 	void __place(Evas_Object* ctxpopup);
+	void __copyPicture(const std::string& path);
 	static void __copySelectedCb(void* data, Evas_Object* obj, void* eventInfo);
 	static void __dismissedCb(void* data, Evas_Object* obj, void* eventInfo);
 	static void __backCb(void* data, Evas_Object* obj, void* eventInfo);

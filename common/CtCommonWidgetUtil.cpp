@@ -73,6 +73,8 @@ Evas_Object* ctCommonCreateImage(Evas_Object* parent, const char* edj, const cha
 	WPRET_VM(path.empty(), nullptr, "no image file %s", edj);
 	Evas_Object* image = elm_image_add(parent);
 	WPRET_VM(!image, nullptr, "elm_image_add() is fail");
+	// Rows are drawn in the frame they are made in, not a frame later.
+	elm_image_preload_disabled_set(image, EINA_TRUE);
 	if (!elm_image_file_set(image, path.c_str(), group)) {
 		WERROR("elm_image_file_set(%s, %s) is fail", path.c_str(), group ? group : "");
 		evas_object_del(image);

@@ -39,7 +39,7 @@ std::string CtDetailViewBasicInfoItem::getText(const char* part)
 std::string CtDetailViewBasicInfoItem::__getSubName(int line)
 {
 	std::vector<const char*> lines;
-	for (const char* text : {getData()->getExtraName2(), getData()->getExtraName1First(), getData()->getCompany()})
+	for (const char* text : {getData()->getExtraName1Second(), getData()->getExtraName1First(), getData()->getCompany()})
 		if (text && *text)
 			lines.push_back(text);
 	if (line < 1 || line > (int)lines.size())

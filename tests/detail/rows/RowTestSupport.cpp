@@ -32,7 +32,7 @@ std::vector<usagelog::Record> usageRecords(const std::string& feature)
 void RowTest::SetUp()
 {
 	ASSERT_EQ(CONTACTS_ERROR_NONE, contacts_connect());
-	m_screen = std::make_unique<ScreenHarness>();
+	m_screen = std::make_unique<ScreenHarness>(ScreenHarness::kWidth, m_screenHeight);
 	m_view = new RowHostView();
 	ASSERT_TRUE(m_screen->push(m_view));
 	m_launches = new LaunchRecorder();

@@ -110,6 +110,7 @@ protected:
 	void tapIcon(Evas_Object* layout, const char* touchPart, const char* signal = "mouse,clicked,1");
 	std::string picture(const char* name, int w, int h, unsigned int top, unsigned int bottom);
 
+	int m_screenHeight = ScreenHarness::kHeight;
 	TempDataDir m_dir;
 	std::unique_ptr<ScreenHarness> m_screen;
 	RowHostView* m_view = nullptr;

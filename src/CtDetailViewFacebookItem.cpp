@@ -56,10 +56,7 @@ Evas_Object* CtDetailViewFacebookItem::getContent(Evas_Object* genlist, const ch
 		return nullptr;
 	Evas_Object* layout = createIconLayout(genlist, "list/C/detail/icon/facebook");
 	if (layout)
-		elm_layout_signal_callback_add(layout, "mouse,clicked,*", "touch.icon",
-				[](void* data, Evas_Object*, const char*, const char* source) {
-					static_cast<CtDetailViewFacebookItem*>(data)->onIconClicked(source);
-				}, this);
+		elm_layout_signal_callback_add(layout, "mouse,clicked,*", "touch.icon", __iconClickedCb, this);
 	return layout;
 }
 
@@ -116,4 +113,10 @@ app_control_h CtDetailViewFacebookItem::createLaunchRequest(const SocialProfile&
 		app_control_add_extra_data(handle, "fb.appcontrol.launch.info", profile.uri.c_str());
 	}
 	return handle;
+}
+
+void CtDetailViewFacebookItem::__iconClickedCb(void* data, Evas_Object*, const char*, const char* source)
+{
+	WHIT();
+	static_cast<CtDetailViewFacebookItem*>(data)->onIconClicked(source);
 }

@@ -37,6 +37,9 @@ protected:
 	void onIconClicked(const char* touchPart) override;
 	// The first linked contact's first profile; false when there is none.
 	virtual bool readFirstProfile(SocialProfile& profile);
+
+private:
+	static void __iconClickedCb(void* data, Evas_Object* obj, const char* emission, const char* source);
 };
 
 #endif

@@ -8,8 +8,9 @@
 namespace app_assist {
 
 WControl::WControl()
-	// The owning pointer does not delete: it only makes weak pointers expire.
-	: m_self(this, [](WControl*) {})
+	// Deletion waits for callers that hold a locked weak pointer right now,
+	// so a control ended under them is still valid memory (in ended state).
+	: m_self(this, [](WControl* control) { delete control; })
 {
 }
 
@@ -113,8 +114,9 @@ void WControl::__finish()
 	if (m_created)
 		onDestroy();
 	m_evasObj = nullptr;
-	m_self.reset();
-	delete this;
+	std::shared_ptr<WControl> self = std::move(m_self);
+	self.reset(); // usually deletes this
+
 }
 
 void WControl::adoptControl(WControl* child)

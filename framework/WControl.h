@@ -31,7 +31,8 @@ protected:
 public:
 	virtual const char* getClassName();
 
-	// Expires when the control is destroyed; late callbacks check it.
+	// Expires when the control is destroyed (once no caller holds it locked);
+	// late callbacks check it.
 	std::weak_ptr<WControl> getWeakPtr() const { return m_self; }
 	bool isCreated() const { return m_evasObj != nullptr; }
 	// True from the start of destroy() (or of the object's deletion) on.

@@ -7,9 +7,16 @@ namespace app_assist {
 
 namespace {
 
+// Item data: the view, weakly, since the item outlives its content while
+// it is being deleted.
+struct ItemLink {
+	std::weak_ptr<WControl> view;
+};
+
 WView* viewOf(Elm_Object_Item* item)
 {
-	return item ? static_cast<WView*>(elm_object_item_data_get(item)) : nullptr;
+	auto* link = item ? static_cast<ItemLink*>(elm_object_item_data_get(item)) : nullptr;
+	return link ? static_cast<WView*>(link->view.lock().get()) : nullptr;
 }
 
 } // namespace
@@ -127,20 +134,25 @@ Elm_Object_Item* WNaviframe::__findItemOf(WView* view) const
 void WNaviframe::__adopt(WView* view, Elm_Object_Item* item)
 {
 	view->m_naviItem = item;
-	elm_object_item_data_set(item, view);
+	elm_object_item_data_set(item, new ItemLink { view->getWeakPtr() });
 	elm_object_item_del_cb_set(item, __itemDelCb);
-	elm_naviframe_item_pop_cb_set(item, __popCb, view);
+	elm_naviframe_item_pop_cb_set(item, __popCb, nullptr);
 }
 
-Eina_Bool WNaviframe::__popCb(void* data, Elm_Object_Item*)
+Eina_Bool WNaviframe::__popCb(void*, Elm_Object_Item* item)
 {
-	return static_cast<WView*>(data)->__runOnPop() ? EINA_TRUE : EINA_FALSE;
+	WView* view = viewOf(item);
+	return !view || view->__runOnPop() ? EINA_TRUE : EINA_FALSE;
 }
 
 void WNaviframe::__itemDelCb(void* data, Evas_Object*, void*)
 {
-	if (auto* view = static_cast<WView*>(data))
-		view->m_naviItem = nullptr;
+	auto* link = static_cast<ItemLink*>(data);
+	if (!link)
+		return;
+	if (auto view = link->view.lock())
+		static_cast<WView*>(view.get())->m_naviItem = nullptr;
+	delete link;
 }
 
 void WNaviframe::__backCb(void* data, Evas_Object*, void*)

@@ -2,12 +2,20 @@
 
 #include "ContactsDebug.h"
 #include "WNaviframe.h"
+#include "WUiTimer.h"
 
 namespace app_assist {
 
 WPageSlideView::WPageSlideView() = default;
 
-WPageSlideView::~WPageSlideView() = default;
+WPageSlideView::~WPageSlideView()
+{
+	if (m_scroller) {
+		evas_object_event_callback_del_full(m_scroller, EVAS_CALLBACK_RESIZE, __scrollerResizeCb, this);
+		evas_object_event_callback_del_full(m_scroller, EVAS_CALLBACK_DEL, __scrollerDelCb, this);
+		evas_object_event_callback_del_full(m_box, EVAS_CALLBACK_RESIZE, __boxResizeCb, this);
+	}
+}
 
 const char* WPageSlideView::getClassName()
 {
@@ -33,6 +41,7 @@ Evas_Object* WPageSlideView::createPageSlideContent(Evas_Object* parent)
 	evas_object_event_callback_add(m_scroller, EVAS_CALLBACK_DEL, __scrollerDelCb, this);
 
 	m_box = elm_box_add(m_scroller);
+	evas_object_event_callback_add(m_box, EVAS_CALLBACK_RESIZE, __boxResizeCb, this);
 	elm_box_horizontal_set(m_box, EINA_TRUE);
 	elm_box_homogeneous_set(m_box, EINA_TRUE);
 	elm_object_content_set(m_scroller, m_box);
@@ -46,13 +55,17 @@ Evas_Object* WPageSlideView::createPageSlideContent(Evas_Object* parent)
 int WPageSlideView::appendPage(const char* name)
 {
 	WPRET_VM(!m_box, -1, "appendPage() before the page scroller exists");
-	Evas_Object* page = elm_layout_add(m_box);
-	elm_layout_theme_set(page, "layout", "application", "default");
+	// A table page: its invisible spacer gives it the scroller's size, which
+	// containers would otherwise override with their own minimum.
+	Evas_Object* page = elm_table_add(m_box);
 	evas_object_size_hint_weight_set(page, EVAS_HINT_EXPAND, EVAS_HINT_EXPAND);
 	evas_object_size_hint_align_set(page, EVAS_HINT_FILL, EVAS_HINT_FILL);
+	Evas_Object* spacer = evas_object_rectangle_add(evas_object_evas_get(page));
+	evas_object_color_set(spacer, 0, 0, 0, 0);
+	elm_table_pack(page, spacer, 0, 0, 1, 1);
 	elm_box_pack_end(m_box, page);
 	evas_object_show(page);
-	m_pages.push_back({ page, name ? name : "", {} });
+	m_pages.push_back({ page, spacer, name ? name : "", {} });
 	__resizePages();
 	return static_cast<int>(m_pages.size()) - 1;
 }
@@ -76,7 +89,11 @@ bool WPageSlideView::setPageContent(int index, WView* view)
 	view->m_pageOwner = getWeakPtr();
 	if (!page.name.empty() && !*view->getName())
 		view->setName(page.name.c_str());
-	elm_object_part_content_set(page.obj, "elm.swallow.content", view->getEvasObj());
+	Evas_Object* content = view->getEvasObj();
+	evas_object_size_hint_weight_set(content, EVAS_HINT_EXPAND, EVAS_HINT_EXPAND);
+	evas_object_size_hint_align_set(content, EVAS_HINT_FILL, EVAS_HINT_FILL);
+	elm_table_pack(page.obj, content, 0, 0, 1, 1);
+	evas_object_show(content);
 	view->onSetAsPageContent(page.obj);
 	page.view = view->getWeakPtr();
 	adoptControl(view);
@@ -93,10 +110,15 @@ WView* WPageSlideView::getPageContent(int index) const
 void WPageSlideView::showPage(int index, bool animate)
 {
 	WPRET_M(index < 0 || index >= getPageCount(), "Invalid param : page index %d of %d", index, getPageCount());
-	if (animate)
-		elm_scroller_page_bring_in(m_scroller, index, 0);
-	else
-		elm_scroller_page_show(m_scroller, index, 0);
+	m_requestedPage = index;
+	__scrollToPage(index, animate);
+	// Pages added just now are laid out on the next loop pass; show again then.
+	WUiTimer::destroy(m_reshowIdler);
+	m_reshowIdler = WUiTimer::addIdler([this, animate](void*) {
+		if (m_requestedPage >= 0 && m_requestedPage < getPageCount())
+			__scrollToPage(m_requestedPage, animate);
+		return false;
+	}, nullptr, this);
 }
 
 int WPageSlideView::getCurrentPage() const
@@ -114,7 +136,27 @@ void WPageSlideView::setOnInitScroller(std::function<void(Evas_Object* scroller)
 
 void WPageSlideView::__scrollerResizeCb(void* data, Evas*, Evas_Object*, void*)
 {
-	static_cast<WPageSlideView*>(data)->__resizePages();
+	auto* self = static_cast<WPageSlideView*>(data);
+	self->__resizePages();
+	__boxResizeCb(data, nullptr, nullptr, nullptr);
+}
+
+void WPageSlideView::__scrollToPage(int index, bool animate)
+{
+	int w = 0, h = 0;
+	evas_object_geometry_get(m_scroller, nullptr, nullptr, &w, &h);
+	if (animate)
+		elm_scroller_region_bring_in(m_scroller, index * w, 0, w, h);
+	else
+		elm_scroller_region_show(m_scroller, index * w, 0, w, h);
+}
+
+void WPageSlideView::__boxResizeCb(void* data, Evas*, Evas_Object*, void*)
+{
+	// Pages grew after a page was asked for: show it again at the new size.
+	auto* self = static_cast<WPageSlideView*>(data);
+	if (self->m_requestedPage >= 0 && self->m_requestedPage < self->getPageCount())
+		self->__scrollToPage(self->m_requestedPage, false);
 }
 
 void WPageSlideView::__scrollerDelCb(void* data, Evas*, Evas_Object*, void*)
@@ -130,7 +172,7 @@ void WPageSlideView::__resizePages()
 	int w = 0, h = 0;
 	evas_object_geometry_get(m_scroller, nullptr, nullptr, &w, &h);
 	for (Page& page : m_pages)
-		evas_object_size_hint_min_set(page.obj, w, h);
+		evas_object_size_hint_min_set(page.spacer, w, h);
 }
 
 } // namespace app_assist

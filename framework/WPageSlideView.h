@@ -2,6 +2,7 @@
 // view, which the page slide view then owns.
 #pragma once
 
+#include "WUiTimer.h"
 #include "WView.h"
 
 #include <functional>
@@ -40,16 +41,21 @@ protected:
 private:
 	struct Page {
 		Evas_Object* obj;
+		Evas_Object* spacer;
 		std::string name;
 		std::weak_ptr<WControl> view;
 	};
 	static void __scrollerResizeCb(void* data, Evas* e, Evas_Object* obj, void* eventInfo);
+	static void __boxResizeCb(void* data, Evas* e, Evas_Object* obj, void* eventInfo);
 	static void __scrollerDelCb(void* data, Evas* e, Evas_Object* obj, void* eventInfo);
 	void __resizePages();
+	void __scrollToPage(int index, bool animate);
 
 	Evas_Object* m_scroller = nullptr;
 	Evas_Object* m_box = nullptr;
 	std::vector<Page> m_pages;
+	int m_requestedPage = -1;
+	WUiTimerHandle m_reshowIdler;
 	std::function<void(Evas_Object*)> m_onInitScroller;
 };
 

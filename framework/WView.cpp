@@ -41,7 +41,7 @@ void WView::destroy()
 		m_naviItem = nullptr;
 		std::weak_ptr<WControl> alive = getWeakPtr();
 		elm_object_item_del(item);
-		if (alive.expired())
+		if (alive.expired() || isDestroying())
 			return;
 	}
 	WControl::destroy();

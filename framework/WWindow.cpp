@@ -2,6 +2,8 @@
 
 #include "ContactsDebug.h"
 
+#include <initializer_list>
+
 namespace app_assist {
 
 WWindow::WWindow(const char* name, int width, int height)
@@ -23,7 +25,7 @@ WWindow::WWindow(const char* name, int width, int height)
 	evas_object_show(m_conformant);
 
 	m_baseLayout = elm_layout_add(m_conformant);
-	elm_layout_theme_set(m_baseLayout, "layout", "application", "default");
+	__setBaseTheme(m_baseLayout);
 	evas_object_size_hint_weight_set(m_baseLayout, EVAS_HINT_EXPAND, EVAS_HINT_EXPAND);
 	elm_object_content_set(m_conformant, m_baseLayout);
 	evas_object_show(m_baseLayout);
@@ -39,6 +41,17 @@ WWindow::~WWindow()
 		evas_object_event_callback_del_full(m_win, EVAS_CALLBACK_DEL, __winDelCb, this);
 		evas_object_del(m_win);
 	}
+}
+
+void WWindow::__setBaseTheme(Evas_Object* layout)
+{
+	// Themes without the application's own group still have this one.
+	for (const char* style : { "default", "toolbar-content" }) {
+		if (elm_layout_theme_set(layout, "layout", "application", style)
+			&& edje_object_part_exists(elm_layout_edje_get(layout), "elm.swallow.content"))
+			return;
+	}
+	WERROR("no base layout group with elm.swallow.content in the theme");
 }
 
 void WWindow::setContent(Evas_Object* content)

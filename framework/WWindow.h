@@ -22,6 +22,7 @@ public:
 	void setContent(Evas_Object* content);
 
 private:
+	static void __setBaseTheme(Evas_Object* layout);
 	static void __winDelCb(void* data, Evas* e, Evas_Object* obj, void* eventInfo);
 
 	Evas_Object* m_win = nullptr;

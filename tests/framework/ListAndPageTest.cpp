@@ -1,0 +1,211 @@
+#include "ScreenHarness.h"
+#include "TestViews.h"
+
+#include "WGengridItem.h"
+#include "WPageSlideView.h"
+#include "WUgClient.h"
+
+#include <gtest/gtest.h>
+
+#include <algorithm>
+#include <cstdlib>
+
+using namespace ct::test;
+
+namespace {
+
+class Cell : public app_assist::WGengridItem {
+public:
+	explicit Cell(int* live)
+		: m_live(live)
+	{
+		++*m_live;
+	}
+	~Cell() override { --*m_live; }
+	Elm_Gengrid_Item_Class* getItemClassNew() override
+	{
+		Elm_Gengrid_Item_Class* itc = elm_gengrid_item_class_new();
+		itc->item_style = "default";
+		return itc;
+	}
+
+private:
+	int* m_live;
+};
+
+// A row class that deletes its rows through its own item class.
+class SelfDeletingRow : public app_assist::WGenlistItem {
+public:
+	explicit SelfDeletingRow(int* live)
+		: m_live(live)
+	{
+		++*m_live;
+	}
+	~SelfDeletingRow() override { --*m_live; }
+	Elm_Genlist_Item_Class* getItemClassStatic() override
+	{
+		static Elm_Genlist_Item_Class itc = [] {
+			Elm_Genlist_Item_Class c = {};
+			c.version = ELM_GENLIST_ITEM_CLASS_VERSION;
+			c.item_style = "group_index";
+			c.func.del = deleteRowCb;
+			return c;
+		}();
+		return &itc;
+	}
+
+private:
+	int* m_live;
+};
+
+// A row class whose del function deletes the row itself, as row classes do.
+class PlainDeleteRow : public app_assist::WGenlistItem {
+public:
+	explicit PlainDeleteRow(int* live)
+		: m_live(live)
+	{
+		++*m_live;
+	}
+	~PlainDeleteRow() override { --*m_live; }
+	Elm_Genlist_Item_Class* getItemClassStatic() override
+	{
+		static Elm_Genlist_Item_Class itc = [] {
+			Elm_Genlist_Item_Class c = {};
+			c.version = ELM_GENLIST_ITEM_CLASS_VERSION;
+			c.item_style = "default";
+			c.func.del = [](void* data, Evas_Object*) { delete static_cast<PlainDeleteRow*>(data); };
+			return c;
+		}();
+		return &itc;
+	}
+
+private:
+	int* m_live;
+};
+
+} // namespace
+
+TEST(GenlistItem, RowsAreReadSelectedAndDeletedWithTheirItems)
+{
+	int live = 0;
+	{
+		ScreenHarness screen;
+		auto* view = new ListView(5, &live);
+		screen.push(view);
+		EXPECT_EQ(live, 5);
+		Evas_Object* genlist = screen.findGenlist();
+		ASSERT_EQ(genlist, view->genlist);
+		auto rows = ScreenHarness::rowsOf<CountingRow>(genlist);
+		ASSERT_EQ(rows.size(), 5u);
+		EXPECT_EQ(rows[2]->index(), 2);
+		auto even = ScreenHarness::rowsWhere<CountingRow>(genlist, [](CountingRow* r) { return r->index() % 2 == 0; });
+		EXPECT_EQ(even.size(), 3u);
+		Elm_Object_Item* third = rows[2]->getElmObjectItem();
+		EXPECT_EQ(ScreenHarness::itemStyle(third), "default");
+		EXPECT_EQ(ScreenHarness::itemText(third, "elm.text"), "Row 2");
+		EXPECT_EQ(ScreenHarness::itemText(third, "elm.text.sub"), "");
+
+		ScreenHarness::selectItem(third);
+		EXPECT_EQ(view->selections, 1);
+		elm_object_item_del(third);
+		EXPECT_EQ(live, 4);
+
+		int selfLive = 0;
+		auto* row = new SelfDeletingRow(&selfLive);
+		row->setElmObjectItem(elm_genlist_item_append(genlist, row->getItemClass(), row, nullptr,
+			ELM_GENLIST_ITEM_NONE, row->getSelectCb(), nullptr));
+		auto* plain = new PlainDeleteRow(&selfLive);
+		plain->setElmObjectItem(elm_genlist_item_append(genlist, plain->getItemClass(), plain, nullptr,
+			ELM_GENLIST_ITEM_NONE, plain->getSelectCb(), nullptr));
+		EXPECT_EQ(selfLive, 2);
+		elm_genlist_clear(genlist);
+		EXPECT_EQ(selfLive, 0);
+		EXPECT_EQ(live, 0);
+
+		auto* again = new CountingRow(9, &live);
+		again->setElmObjectItem(elm_genlist_item_append(genlist, again->getItemClass(), again, nullptr,
+			ELM_GENLIST_ITEM_NONE, again->getSelectCb(), nullptr));
+		again->attachToView(view);
+		EXPECT_EQ(again->getAttachedView(), view);
+		view->popOut();
+		screen.pumpUntilIdle();
+	}
+	EXPECT_EQ(live, 0);
+}
+
+TEST(GengridItem, CellsOwnTheirNewItemClassAndDieWithTheGrid)
+{
+	int live = 0;
+	ScreenHarness screen;
+	Evas_Object* grid = elm_gengrid_add(screen.win());
+	for (int i = 0; i < 3; ++i) {
+		auto* cell = new Cell(&live);
+		cell->setElmObjectItem(elm_gengrid_item_append(grid, cell->getItemClass(), cell, cell->getSelectCb(), nullptr));
+	}
+	EXPECT_EQ(live, 3);
+	evas_object_del(grid);
+	EXPECT_EQ(live, 0);
+}
+
+TEST(PageSlideView, PagesHoldViewsThatDieWithIt)
+{
+	EventLog log;
+	ScreenHarness screen;
+	auto* slide = new app_assist::WPageSlideView();
+	Evas_Object* initScroller = nullptr;
+	slide->setOnInitScroller([&](Evas_Object* scroller) { initScroller = scroller; });
+	ASSERT_TRUE(screen.push(slide));
+	EXPECT_EQ(initScroller, slide->getScroller());
+	EXPECT_EQ(slide->appendPage("one"), 0);
+	EXPECT_EQ(slide->appendPage("two"), 1);
+	EXPECT_EQ(slide->getPageCount(), 2);
+
+	auto* first = new RecordingView(log, "p0");
+	auto* second = new RecordingView(log, "p1");
+	EXPECT_TRUE(slide->setPageContent(0, first));
+	EXPECT_TRUE(slide->setPageContent(1, second));
+	EXPECT_STREQ(second->getName(), "two");
+	EXPECT_EQ(second->getWindow(), &screen.window());
+	EXPECT_EQ(slide->getPageContent(1), second);
+	EXPECT_FALSE(slide->setPageContent(5, new RecordingView(log, "bad")));
+	EXPECT_EQ(log.back(), "bad:destructor");
+
+	screen.pumpUntilIdle();
+	slide->showPage(1, false);
+	screen.pumpUntilIdle();
+	EXPECT_EQ(slide->getCurrentPage(), 1);
+	slide->showPage(7, true); // logged, ignored
+
+	second->popOut(); // a page leaves with its slide view
+	screen.pumpUntilIdle();
+	EXPECT_EQ(screen.viewCount(), 0);
+	EXPECT_EQ(std::count(log.begin(), log.end(), "p0:destructor"), 1);
+	EXPECT_EQ(std::count(log.begin(), log.end(), "p1:destructor"), 1);
+}
+
+TEST(UgClient, DestroyRunsTheEndCallbackOnce)
+{
+	int ended = 0;
+	auto* client = new app_assist::WUgClient([&] { ++ended; });
+	client->destroy();
+	EXPECT_EQ(ended, 1);
+}
+
+TEST(Harness, SavesAPictureOfAPushedListView)
+{
+	int live = 0;
+	ScreenHarness screen;
+	auto* view = new ListView(50, &live);
+	screen.push(view);
+	const char* binDir = getenv("CONTACTS_TEST_BIN_DIR");
+	std::string path = std::string(binDir ? binDir : "/tmp") + "/framework_list_view.png";
+	ASSERT_TRUE(screen.savePng(path));
+	FILE* file = fopen(path.c_str(), "rb");
+	ASSERT_NE(file, nullptr);
+	unsigned char magic[4] = {};
+	EXPECT_EQ(fread(magic, 1, 4, file), 4u);
+	fclose(file);
+	EXPECT_EQ(magic[1], 'P');
+	EXPECT_EQ(magic[2], 'N');
+	EXPECT_EQ(magic[3], 'G');
+}

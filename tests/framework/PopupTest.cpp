@@ -1,0 +1,218 @@
+#include "ScreenHarness.h"
+#include "TestViews.h"
+
+#include "LogSink.h"
+#include "WMenuPopup.h"
+#include "WPopup.h"
+#include "WToastPopup.h"
+#include "notification.h"
+
+#include <gtest/gtest.h>
+
+using namespace ct::test;
+using app_assist::WMenuPopup;
+using app_assist::WPopup;
+using app_assist::WToastPopup;
+
+namespace {
+
+WPopup* makeTwoButtonPopup(std::vector<std::string>& clicks, bool keepOnOk = false)
+{
+	auto* popup = new WPopup("Title", "Body text");
+	popup->addButton("Cancel", [&clicks](bool*) { clicks.push_back("Cancel"); });
+	popup->addButton("OK", [&clicks, keepOnOk](bool* destroyPopup) {
+		clicks.push_back("OK");
+		*destroyPopup = !keepOnOk;
+	});
+	return popup;
+}
+
+} // namespace
+
+TEST(Popup, ButtonsAppearInCallOrderAndCloseThePopup)
+{
+	EventLog log;
+	ScreenHarness screen;
+	auto* view = new RecordingView(log, "v");
+	screen.push(view);
+	std::vector<std::string> clicks;
+	WPopup* popup = makeTwoButtonPopup(clicks, true);
+	view->attachPopup(popup);
+	screen.pumpUntilIdle();
+	auto alive = popup->getWeakPtr();
+	EXPECT_EQ(view->getPopup(), popup);
+
+	Evas_Object* obj = popup->getEvasObj();
+	EXPECT_EQ(ScreenHarness::buttonLabel(elm_object_part_content_get(obj, "button1")), "Cancel");
+	EXPECT_EQ(ScreenHarness::buttonLabel(elm_object_part_content_get(obj, "button2")), "OK");
+	EXPECT_STREQ(elm_object_part_text_get(obj, "title,text"), "Title");
+
+	ASSERT_TRUE(ScreenHarness::click(screen.findButton("OK")));
+	EXPECT_FALSE(alive.expired()); // the callback kept it open
+	ASSERT_TRUE(ScreenHarness::click(screen.findButton("Cancel")));
+	screen.pumpUntilIdle();
+	EXPECT_TRUE(alive.expired());
+	EXPECT_EQ(clicks, (std::vector<std::string> { "OK", "Cancel" }));
+	EXPECT_EQ(view->getPopup(), nullptr);
+	EXPECT_EQ(screen.findButton("OK"), nullptr);
+}
+
+TEST(Popup, BackKeyClosesThePopupBeforeTheView)
+{
+	EventLog log;
+	ScreenHarness screen;
+	auto* view = new RecordingView(log, "v");
+	screen.push(view);
+	std::vector<std::string> clicks;
+	WPopup* popup = makeTwoButtonPopup(clicks);
+	int backs = 0;
+	popup->setOnBack([&backs](bool*) { ++backs; });
+	view->attachPopup(popup);
+	auto alivePopup = popup->getWeakPtr();
+	auto aliveView = view->getWeakPtr();
+
+	screen.sendBackKey();
+	EXPECT_EQ(backs, 1);
+	EXPECT_TRUE(alivePopup.expired());
+	EXPECT_FALSE(aliveView.expired());
+	screen.sendBackKey();
+	EXPECT_TRUE(aliveView.expired());
+}
+
+TEST(Popup, ButtonThatDestroysItsOwnViewDoesNotCrash)
+{
+	EventLog log;
+	ScreenHarness screen;
+	auto* below = new RecordingView(log, "below");
+	auto* view = new RecordingView(log, "v");
+	screen.push(below);
+	screen.push(view);
+	auto* popup = new WPopup();
+	popup->setTextTranslatable("contacts");
+	popup->setTitle("IDS_PB_HEADER_DISCARD_CHANGES_ABB");
+	popup->addButton("Discard", [view](bool*) { view->destroy(); });
+	auto* second = new WPopup();
+	second->addButton("Leave", [below](bool*) { below->popOut(); });
+	view->attachPopup(popup);
+	auto aliveView = view->getWeakPtr();
+	auto alivePopup = popup->getWeakPtr();
+
+	ASSERT_TRUE(ScreenHarness::click(screen.findButton("Discard")));
+	screen.pumpUntilIdle();
+	EXPECT_TRUE(aliveView.expired());
+	EXPECT_TRUE(alivePopup.expired());
+	EXPECT_EQ(screen.topView(), below);
+
+	// The same through popOut, from a popup attached to the view below.
+	below->attachPopup(second);
+	auto aliveBelow = below->getWeakPtr();
+	ASSERT_TRUE(ScreenHarness::click(screen.findButton("Leave")));
+	screen.pumpUntilIdle();
+	EXPECT_TRUE(aliveBelow.expired());
+}
+
+TEST(Popup, AttachingANewPopupClosesTheOldOneAndViewsCloseTheirPopups)
+{
+	EventLog log;
+	ScreenHarness screen;
+	auto* view = new RecordingView(log, "v");
+	screen.push(view);
+	std::vector<std::string> clicks;
+	WPopup* first = makeTwoButtonPopup(clicks);
+	view->attachPopup(first);
+	auto aliveFirst = first->getWeakPtr();
+	WPopup* second = new WPopup("Second", nullptr);
+	second->setContent([](Evas_Object* parent) {
+		Evas_Object* label = elm_label_add(parent);
+		elm_object_text_set(label, "built content");
+		return label;
+	});
+	view->attachPopup(second);
+	EXPECT_TRUE(aliveFirst.expired());
+	auto aliveSecond = second->getWeakPtr();
+	Evas_Object* content = elm_object_content_get(second->getEvasObj());
+	ASSERT_NE(content, nullptr);
+	EXPECT_STREQ(elm_object_text_get(content), "built content");
+
+	view->popOut();
+	screen.pumpUntilIdle();
+	EXPECT_TRUE(aliveSecond.expired());
+	EXPECT_TRUE(clicks.empty());
+
+	ct::log::clear();
+	auto* crowded = new WPopup();
+	for (int i = 0; i < 4; ++i)
+		crowded->addButton("b", nullptr);
+	EXPECT_TRUE(ct::log::contains("at most 3 buttons"));
+	crowded->destroy();
+}
+
+TEST(MenuPopup, MoreKeyOpensTheMenuWithItemsInAppendOrder)
+{
+	EventLog log;
+	ScreenHarness screen;
+	auto* view = new RecordingView(log, "v");
+	std::vector<std::string> chosen;
+	std::weak_ptr<app_assist::WControl> menuAlive;
+	struct MoreContext {
+		RecordingView* view;
+		std::vector<std::string>* chosen;
+		std::weak_ptr<app_assist::WControl>* menuAlive;
+	} context { view, &chosen, &menuAlive };
+	view->onPushedAction = [&](Elm_Object_Item* item) {
+		view->enableMoreButton(item, [](void* data, Evas_Object*, void*) {
+			auto* ctx = static_cast<MoreContext*>(data);
+			auto* menu = new WMenuPopup(ctx->view->getWindow(), ctx->view->getNaviframe());
+			for (const char* label : { "Edit", "Delete", "Share" })
+				menu->appendItem(label, [ctx, label] { ctx->chosen->push_back(label); });
+			ctx->view->attachPopup(menu);
+			*ctx->menuAlive = menu->getWeakPtr();
+		}, &context);
+	};
+	screen.push(view);
+	EXPECT_FALSE(view->enableMoreButton(nullptr, nullptr, nullptr));
+
+	screen.sendMoreKey();
+	auto menus = screen.findWidgets("Elm_Ctxpopup");
+	ASSERT_EQ(menus.size(), 1u);
+	std::vector<std::string> labels;
+	for (Elm_Object_Item* it = elm_ctxpopup_first_item_get(menus[0]); it; it = elm_ctxpopup_item_next_get(it))
+		labels.push_back(elm_object_item_text_get(it));
+	EXPECT_EQ(labels, (std::vector<std::string> { "Edit", "Delete", "Share" }));
+
+	Elm_Object_Item* second = elm_ctxpopup_item_next_get(elm_ctxpopup_first_item_get(menus[0]));
+	elm_ctxpopup_item_selected_set(second, EINA_TRUE);
+	screen.pumpUntilIdle();
+	EXPECT_EQ(chosen, (std::vector<std::string> { "Delete" }));
+	EXPECT_TRUE(menuAlive.expired());
+
+	screen.sendMoreKey();
+	ASSERT_FALSE(menuAlive.expired());
+	screen.sendBackKey(); // closes the menu, not the view
+	EXPECT_TRUE(menuAlive.expired());
+	EXPECT_EQ(screen.viewCount(), 1);
+}
+
+TEST(ToastPopup, ClosesItselfAfterItsTimeout)
+{
+	ScreenHarness screen;
+	auto* toast = new WToastPopup("Saved", 0.2);
+	ASSERT_TRUE(toast->create(screen.win(), nullptr));
+	auto alive = toast->getWeakPtr();
+	EXPECT_STREQ(elm_object_text_get(toast->getEvasObj()), "Saved");
+	screen.pumpFor(0.5);
+	EXPECT_TRUE(alive.expired());
+}
+
+TEST(Harness, ReadsPostedNoticesAndLogLines)
+{
+	ScreenHarness screen;
+	ScreenHarness::clearNotices();
+	EXPECT_EQ(notification_status_message_post("Saved"), 0);
+	EXPECT_EQ(ScreenHarness::notices(), (std::vector<std::string> { "Saved" }));
+	ScreenHarness::clearNotices();
+	EXPECT_TRUE(ScreenHarness::notices().empty());
+	ct::log::clear();
+	EXPECT_FALSE(screen.naviframe()->pop());
+	EXPECT_TRUE(ScreenHarness::logContains("naviframe is empty"));
+}

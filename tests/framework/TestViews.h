@@ -1,0 +1,140 @@
+// Small views and rows that record what the framework does to them.
+#pragma once
+
+#include "WGenlistItem.h"
+#include "WView.h"
+
+#include <cstring>
+#include <functional>
+#include <string>
+#include <vector>
+
+namespace ct::test {
+
+using EventLog = std::vector<std::string>;
+
+class RecordingView : public app_assist::WView {
+public:
+	RecordingView(EventLog& log, std::string tag)
+		: m_log(log)
+		, m_tag(std::move(tag))
+	{
+		m_log.push_back(m_tag + ":constructor");
+	}
+
+	const char* getClassName() override { return "RecordingView"; }
+
+	bool allowPop = true;
+	std::function<void()> onPopAction;
+	std::function<void(Elm_Object_Item*)> onPushedAction;
+	int becameTop = 0;
+	Evas_Object* layout = nullptr;
+
+protected:
+	~RecordingView() override { m_log.push_back(m_tag + ":destructor"); }
+	Evas_Object* onCreate(Evas_Object* parent, void*) override
+	{
+		m_log.push_back(m_tag + ":onCreate");
+		layout = elm_layout_add(parent);
+		elm_layout_theme_set(layout, "layout", "application", "content-back");
+		return layout;
+	}
+	void onCreated() override { m_log.push_back(m_tag + ":onCreated"); }
+	void onPushed(Elm_Object_Item* item) override
+	{
+		m_log.push_back(m_tag + ":onPushed");
+		if (onPushedAction)
+			onPushedAction(item);
+	}
+	bool onPop() override
+	{
+		m_log.push_back(m_tag + ":onPop");
+		if (onPopAction)
+			onPopAction();
+		return allowPop;
+	}
+	void onBecomeTop() override { ++becameTop; }
+	void onDestroy() override { m_log.push_back(m_tag + ":onDestroy"); }
+
+private:
+	EventLog& m_log;
+	std::string m_tag;
+};
+
+// A one-line row that counts live rows and selections.
+class CountingRow : public app_assist::WGenlistItem {
+public:
+	explicit CountingRow(int index, int* liveRows, int* selections = nullptr)
+		: m_index(index)
+		, m_liveRows(liveRows)
+		, m_selections(selections)
+	{
+		++*m_liveRows;
+	}
+	~CountingRow() override { --*m_liveRows; }
+
+	Elm_Genlist_Item_Class* getItemClassStatic() override
+	{
+		static Elm_Genlist_Item_Class itc = [] {
+			Elm_Genlist_Item_Class c = {};
+			c.version = ELM_GENLIST_ITEM_CLASS_VERSION;
+			c.item_style = "default";
+			c.func.text_get = __textCb;
+			return c;
+		}();
+		return &itc;
+	}
+	void onSelect(Elm_Object_Item* item) override
+	{
+		elm_genlist_item_selected_set(item, EINA_FALSE);
+		if (m_selections)
+			++*m_selections;
+	}
+	int index() const { return m_index; }
+
+private:
+	static char* __textCb(void* data, Evas_Object*, const char* part)
+	{
+		auto* row = static_cast<CountingRow*>(data);
+		if (strcmp(part, "elm.text") != 0)
+			return nullptr;
+		return strdup(("Row " + std::to_string(row->m_index)).c_str());
+	}
+
+	int m_index;
+	int* m_liveRows;
+	int* m_selections;
+};
+
+// A view whose root is a genlist of `rows` CountingRows.
+class ListView : public app_assist::WView {
+public:
+	ListView(int rows, int* liveRows)
+		: m_rows(rows)
+		, m_liveRows(liveRows)
+	{
+		setTitle("List");
+	}
+	Evas_Object* genlist = nullptr;
+	int selections = 0;
+
+protected:
+	Evas_Object* onCreate(Evas_Object* parent, void*) override
+	{
+		genlist = elm_genlist_add(parent);
+		elm_genlist_mode_set(genlist, ELM_LIST_COMPRESS);
+		elm_genlist_homogeneous_set(genlist, EINA_TRUE);
+		for (int i = 0; i < m_rows; ++i) {
+			auto* row = new CountingRow(i, m_liveRows, &selections);
+			row->setElmObjectItem(elm_genlist_item_append(genlist, row->getItemClass(), row, nullptr,
+				ELM_GENLIST_ITEM_NONE, row->getSelectCb(), nullptr));
+		}
+		return genlist;
+	}
+
+private:
+	int m_rows;
+	int* m_liveRows;
+};
+
+} // namespace ct::test

@@ -1,0 +1,119 @@
+#include "ScreenHarness.h"
+#include "TestViews.h"
+
+#include "LogSink.h"
+#include "WSignalIdGenerator.h"
+#include "WUiTimer.h"
+
+#include <gtest/gtest.h>
+
+using namespace ct::test;
+using app_assist::WUiTimer;
+using app_assist::WUiTimerHandle;
+
+namespace {
+
+struct Counter {
+	int fired = 0;
+	int repeatUntil = 1;
+};
+
+bool countCb(void* data)
+{
+	auto* counter = static_cast<Counter*>(data);
+	return ++counter->fired < counter->repeatUntil;
+}
+
+} // namespace
+
+TEST(UiTimer, CallbacksRepeatWhileTheyReturnTrueThenTheHandleExpires)
+{
+	EventLog log;
+	ScreenHarness screen;
+	auto* view = new RecordingView(log, "v");
+	screen.push(view);
+	Counter idler, timer, animator;
+	idler.repeatUntil = 3;
+	animator.repeatUntil = 4;
+	WUiTimerHandle idlerHandle = WUiTimer::addIdler(countCb, &idler, view);
+	WUiTimerHandle timerHandle = WUiTimer::addTimer(0.05, countCb, &timer, view);
+	WUiTimerHandle animatorHandle = WUiTimer::addAnimator(countCb, &animator, view);
+	EXPECT_TRUE(WUiTimer::isAlive(timerHandle));
+
+	screen.pumpFor(0.3);
+	EXPECT_EQ(idler.fired, 3);
+	EXPECT_EQ(timer.fired, 1);
+	EXPECT_EQ(animator.fired, 4);
+	EXPECT_TRUE(idlerHandle.expired());
+	EXPECT_TRUE(timerHandle.expired());
+	EXPECT_TRUE(animatorHandle.expired());
+}
+
+TEST(UiTimer, DestroyCancelsAndTimersDieWithTheirOwner)
+{
+	EventLog log;
+	ScreenHarness screen;
+	auto* view = new RecordingView(log, "v");
+	screen.push(view);
+	Counter cancelled, orphaned, byObject;
+	WUiTimerHandle handle = WUiTimer::addTimer(0.05, countCb, &cancelled, view);
+	WUiTimer::destroy(handle);
+	WUiTimer::destroy(handle); // expired: ignored
+	EXPECT_TRUE(handle.expired());
+
+	WUiTimerHandle owned = WUiTimer::addTimer(0.05, countCb, &orphaned, view);
+	WUiTimerHandle ownedByObject = WUiTimer::addAnimator(countCb, &byObject, view->layout);
+	view->destroy();
+	EXPECT_TRUE(owned.expired());
+	EXPECT_TRUE(ownedByObject.expired());
+	screen.pumpFor(0.2);
+	EXPECT_EQ(cancelled.fired, 0);
+	EXPECT_EQ(orphaned.fired, 0);
+	EXPECT_EQ(byObject.fired, 0);
+}
+
+TEST(UiTimer, CallbackMayDestroyItsOwnerOrItself)
+{
+	EventLog log;
+	ScreenHarness screen;
+	auto* view = new RecordingView(log, "v");
+	screen.push(view);
+	auto alive = view->getWeakPtr();
+	int fired = 0;
+	WUiTimer::addTimer(0.01, [&](void*) {
+		++fired;
+		view->destroy();
+		return true; // ignored: the owner is gone
+	}, nullptr, view);
+	WUiTimerHandle self;
+	int selfFired = 0;
+	Evas_Object* holder = evas_object_rectangle_add(evas_object_evas_get(screen.win()));
+	self = WUiTimer::addAnimator([&](void*) {
+		++selfFired;
+		WUiTimer::destroy(self);
+		return true;
+	}, nullptr, holder);
+	screen.pumpFor(0.2);
+	EXPECT_EQ(fired, 1);
+	EXPECT_TRUE(alive.expired());
+	EXPECT_EQ(selfFired, 1);
+	evas_object_del(holder);
+}
+
+TEST(UiTimer, NullCallbackOrOwnerIsRefused)
+{
+	ct::log::clear();
+	Counter counter;
+	EXPECT_TRUE(WUiTimer::addTimer(0.01, countCb, &counter, static_cast<app_assist::WControl*>(nullptr)).expired());
+	EXPECT_TRUE(ct::log::contains("owner is null"));
+	EXPECT_TRUE(WUiTimer::addIdler(nullptr, nullptr, static_cast<Evas_Object*>(nullptr)).expired());
+	EXPECT_TRUE(ct::log::contains("callback is null"));
+}
+
+TEST(SignalIdGenerator, IdsAreUniqueAndNeverZero)
+{
+	unsigned int first = app_assist::WSignalIdGenerator::generate();
+	unsigned int second = app_assist::WSignalIdGenerator::generate();
+	EXPECT_NE(first, 0u);
+	EXPECT_NE(first, second);
+}

@@ -1,0 +1,170 @@
+#include "ScreenHarness.h"
+#include "TestViews.h"
+
+#include "LogSink.h"
+
+#include <gtest/gtest.h>
+
+#include <algorithm>
+
+using namespace ct::test;
+using app_assist::WView;
+
+TEST(ViewLifecycle, PushThenBackRunsEveryStepInOrder)
+{
+	EventLog log;
+	{
+		ScreenHarness screen;
+		auto* view = new RecordingView(log, "a");
+		ASSERT_TRUE(screen.push(view, "first"));
+		EXPECT_EQ(screen.topView(), view);
+		EXPECT_STREQ(view->getName(), "first");
+		EXPECT_EQ(WView_getInstanceFromEvasObj(view->getEvasObj()), view);
+		EXPECT_EQ(WView_getWindowEvasObj(view), screen.win());
+		EXPECT_EQ(WView_getWindowBaseLayoutEvasObj(view), screen.window().getBaseLayoutEvasObj());
+		EXPECT_EQ(view->getNaviframe(), screen.naviframe());
+		EXPECT_NE(view->getNaviItem(), nullptr);
+		view->setTitle("Details");
+		EXPECT_EQ(ScreenHarness::naviText(view), "Details");
+
+		screen.sendBackKey();
+		EXPECT_EQ(screen.viewCount(), 0);
+	}
+	EXPECT_EQ(log, (EventLog { "a:constructor", "a:onCreate", "a:onCreated", "a:onPushed", "a:onPop",
+		"a:onDestroy", "a:destructor" }));
+}
+
+TEST(ViewLifecycle, RefusedPopKeepsTheViewUntilAllowed)
+{
+	EventLog log;
+	ScreenHarness screen;
+	auto* view = new RecordingView(log, "a");
+	view->allowPop = false;
+	ASSERT_TRUE(screen.push(view));
+	auto alive = view->getWeakPtr();
+
+	screen.sendBackKey();
+	EXPECT_FALSE(alive.expired());
+	EXPECT_EQ(screen.viewCount(), 1);
+	view->popOut();
+	screen.pumpUntilIdle();
+	EXPECT_FALSE(alive.expired());
+
+	view->allowPop = true;
+	view->popOut();
+	screen.pumpUntilIdle();
+	EXPECT_TRUE(alive.expired());
+	EXPECT_EQ(std::count(log.begin(), log.end(), "a:onPop"), 3);
+}
+
+TEST(ViewLifecycle, NestedPushesPopTopFirstAndTitleBackButtonPops)
+{
+	EventLog log;
+	ScreenHarness screen;
+	auto* a = new RecordingView(log, "a");
+	auto* b = new RecordingView(log, "b");
+	auto* c = new RecordingView(log, "c");
+	ASSERT_TRUE(screen.push(a));
+	ASSERT_TRUE(screen.push(b));
+	ASSERT_TRUE(screen.push(c));
+	EXPECT_EQ(screen.viewCount(), 3);
+	auto aliveB = b->getWeakPtr();
+	auto aliveC = c->getWeakPtr();
+
+	screen.sendBackKey();
+	EXPECT_TRUE(aliveC.expired());
+	EXPECT_EQ(screen.topView(), b);
+	EXPECT_GE(b->becameTop, 1);
+
+	Evas_Object* prev = elm_object_item_part_content_get(b->getNaviItem(), "prev_btn");
+	ASSERT_NE(prev, nullptr);
+	EXPECT_TRUE(ScreenHarness::click(prev));
+	screen.pumpUntilIdle();
+	EXPECT_TRUE(aliveB.expired());
+	EXPECT_EQ(screen.topView(), a);
+	EXPECT_LT(std::find(log.begin(), log.end(), "c:destructor"), std::find(log.begin(), log.end(), "b:destructor"));
+}
+
+TEST(ViewLifecycle, ClosingTheHarnessDestroysEveryPushedView)
+{
+	EventLog log;
+	{
+		ScreenHarness screen;
+		screen.push(new RecordingView(log, "a"));
+		screen.push(new RecordingView(log, "b"));
+	}
+	EXPECT_EQ(std::count(log.begin(), log.end(), "a:destructor"), 1);
+	EXPECT_EQ(std::count(log.begin(), log.end(), "b:destructor"), 1);
+	EXPECT_LT(std::find(log.begin(), log.end(), "b:onDestroy"), std::find(log.begin(), log.end(), "a:onDestroy"));
+}
+
+TEST(ViewLifecycle, ViewsDestroyedInOnPopOrTwiceEndOnce)
+{
+	EventLog log;
+	ScreenHarness screen;
+	auto* a = new RecordingView(log, "a");
+	auto* b = new RecordingView(log, "b");
+	screen.push(a);
+	screen.push(b);
+	b->onPopAction = [b] { b->destroy(); b->destroy(); };
+	auto aliveB = b->getWeakPtr();
+	screen.sendBackKey();
+	EXPECT_TRUE(aliveB.expired());
+	EXPECT_EQ(std::count(log.begin(), log.end(), "b:destructor"), 1);
+
+	// Destroying directly removes the view from the naviframe at once.
+	auto aliveA = a->getWeakPtr();
+	a->destroy();
+	EXPECT_TRUE(aliveA.expired());
+	EXPECT_EQ(screen.viewCount(), 0);
+	screen.pumpUntilIdle();
+	EXPECT_EQ(std::count(log.begin(), log.end(), "a:onDestroy"), 1);
+}
+
+TEST(ViewLifecycle, BadInputIsRefusedAndLogged)
+{
+	EventLog log;
+	ScreenHarness screen;
+	ct::log::clear();
+	EXPECT_FALSE(screen.naviframe()->push(nullptr));
+	EXPECT_TRUE(ct::log::contains("Invalid param : view"));
+
+	EXPECT_FALSE(screen.naviframe()->pop());
+	EXPECT_TRUE(ct::log::contains("naviframe is empty"));
+	screen.sendBackKey();
+	EXPECT_TRUE(ct::log::contains("back on an empty naviframe"));
+
+	auto* orphan = new RecordingView(log, "o");
+	EXPECT_FALSE(orphan->create(nullptr, nullptr));
+	EXPECT_TRUE(ct::log::contains("parent is null"));
+	orphan->popOut(); // not in a naviframe: it is destroyed
+	EXPECT_EQ(log.back(), "o:destructor");
+
+	auto* twice = new RecordingView(log, "t");
+	ASSERT_TRUE(screen.push(twice));
+	EXPECT_FALSE(screen.naviframe()->push(twice));
+	EXPECT_TRUE(ct::log::contains("is already created"));
+	EXPECT_EQ(screen.viewCount(), 1);
+
+	EXPECT_EQ(WView_getInstanceFromEvasObj(nullptr), nullptr);
+	EXPECT_EQ(WView_getWindowEvasObj(nullptr), nullptr);
+}
+
+TEST(ViewLifecycle, LastViewBackHandlerDecides)
+{
+	EventLog log;
+	ScreenHarness screen;
+	int asked = 0;
+	bool letGo = false;
+	screen.naviframe()->setOnLastViewBack([&](bool* popOut) {
+		++asked;
+		*popOut = letGo;
+	});
+	screen.push(new RecordingView(log, "a"));
+	screen.sendBackKey();
+	EXPECT_EQ(asked, 1);
+	EXPECT_EQ(screen.viewCount(), 1);
+	letGo = true;
+	screen.sendBackKey();
+	EXPECT_EQ(screen.viewCount(), 0);
+}

@@ -1,0 +1,26 @@
+// Generated contacts databases for benchmarks, built once into a cache folder
+// and copied into a fresh data folder per run.
+#pragma once
+
+#include <string>
+
+namespace ct::bench {
+
+struct BenchDatabase {
+	std::string dataDir; // CONTACTS_DATA_DIR now points here
+	std::string dbPath;  // the contacts database file in it
+	int bigPersonId = 0; // a person of 10 linked contacts with over 100 child records
+	int persons = 0;
+};
+
+// Makes sure a database of `persons` persons exists in the cache folder
+// ($CONTACTS_BENCH_CACHE, else /tmp/contacts-bench-cache), generating it
+// when missing (names in several scripts, 1-3 numbers, e-mails, some
+// addresses, events and groups, 5% of the persons linked), then copies it
+// into a new data folder and points CONTACTS_DATA_DIR there.
+BenchDatabase ensureDatabase(int persons);
+
+// Resident memory of this process in bytes.
+long residentBytes();
+
+} // namespace ct::bench

@@ -1,0 +1,189 @@
+#include "ContactsReader.h"
+
+#include "ContactsDebug.h"
+#include "ContactsList.h"
+#include "contacts_list.h"
+
+#include <memory>
+
+namespace ct::contacts {
+
+void fillRecord(contacts_record_s& record, db::Statement& st, const std::vector<const PropertyInfo*>& props)
+{
+	for (size_t i = 0; i < props.size(); ++i) {
+		const PropertyInfo* p = props[i];
+		auto& v = record.values[p->slot];
+		int col = static_cast<int>(i);
+		v.set = true;
+		switch (p->type) {
+		case PropType::Str:
+			if (const char* text = st.columnTextPtr(col))
+				v.s = std::string(text, static_cast<size_t>(st.columnBytes(col)));
+			else
+				v.s.reset();
+			break;
+		case PropType::Double:
+			v.d = st.columnDouble(col);
+			break;
+		default:
+			v.i = st.columnInt64(col);
+			break;
+		}
+	}
+}
+
+bool ContactsReader::exists(const ViewInfo& view, int id)
+{
+	if (!view.table || id < 0)
+		return false;
+	CachedStatement st(m_conn.statement(std::string("SELECT 1 FROM ") + view.table + " WHERE id = ?"));
+	return st->bind(1, id).step() == SQLITE_ROW;
+}
+
+std::vector<int> ContactsReader::contactIdsOfPerson(int personId)
+{
+	std::vector<int> ids;
+	CachedStatement st(m_conn.statement("SELECT id FROM contacts WHERE person_id = ? ORDER BY id"));
+	st->bind(1, personId);
+	while (st->step() == SQLITE_ROW)
+		ids.push_back(st->columnInt(0));
+	return ids;
+}
+
+int ContactsReader::loadChildren(contacts_record_s& record, int ownerId, int owner)
+{
+	for (const PropertyInfo& p : record.view->props) {
+		if (p.type != PropType::Record)
+			continue;
+		const ViewInfo& child = *p.child;
+		CachedStatement st(m_conn.statement(child.selectSql + " WHERE contact_id = ? AND owner = ? ORDER BY id"));
+		st->bind(1, ownerId).bind(2, owner);
+		int rc;
+		while ((rc = st->step()) == SQLITE_ROW) {
+			auto* c = new contacts_record_s(child);
+			fillRecord(*c, *st, child.columns);
+			c->parent = &record;
+			record.childLists[p.slot].push_back(c);
+		}
+		if (rc != SQLITE_DONE)
+			return m_conn.failed(child.table, rc);
+	}
+	return CONTACTS_ERROR_NONE;
+}
+
+int ContactsReader::readRecord(const ViewInfo& view, int id, contacts_record_s** out)
+{
+	*out = nullptr;
+	WPRET_VM(!view.findByName("id") || !view.readSource, CONTACTS_ERROR_INVALID_PARAMETER,
+		"records of %s cannot be read by id", view.uri);
+	WPRET_VM(id < 0, CONTACTS_ERROR_INVALID_PARAMETER, "Invalid param : id %d", id);
+	std::string sql = view.selectSql + " WHERE id = ?";
+	if (view.baseWhere)
+		sql += std::string(" AND ") + view.baseWhere;
+	auto record = std::make_unique<contacts_record_s>(view);
+	{
+		CachedStatement st(m_conn.statement(sql));
+		int rc = st->bind(1, id).step();
+		if (rc == SQLITE_DONE)
+			return CONTACTS_ERROR_NO_DATA;
+		if (rc != SQLITE_ROW)
+			return m_conn.failed(view.uri, rc);
+		fillRecord(*record, *st, view.columns);
+	}
+	bool isProfile = std::string(view.uri) == "contacts.view.my_profile";
+	int err = loadChildren(*record, id, isProfile ? 1 : 0);
+	if (err != CONTACTS_ERROR_NONE)
+		return err;
+	*out = record.release();
+	return CONTACTS_ERROR_NONE;
+}
+
+int ContactsReader::__where(const ViewInfo& view, const contacts_query_s* query, std::string& sql,
+	std::vector<SqlParam>& params)
+{
+	bool hasBase = view.baseWhere != nullptr;
+	bool hasFilter = query && query->filter;
+	if (!hasBase && !hasFilter)
+		return CONTACTS_ERROR_NONE;
+	sql += " WHERE ";
+	if (hasBase)
+		sql += view.baseWhere;
+	if (hasBase && hasFilter)
+		sql += " AND ";
+	return hasFilter ? query->filter->toSql(sql, params) : CONTACTS_ERROR_NONE;
+}
+
+int ContactsReader::readList(const ViewInfo& view, const contacts_query_s* query, int offset, int limit,
+	contacts_list_h* out)
+{
+	*out = nullptr;
+	WPRET_VM(!view.readSource || offset < 0 || limit < 0, CONTACTS_ERROR_INVALID_PARAMETER, "Invalid param");
+	const std::vector<const PropertyInfo*>* props = &view.columns;
+	std::string cols;
+	if (query && !query->projection.empty())
+		props = &query->projection;
+	for (const PropertyInfo* p : *props)
+		cols += (cols.empty() ? "" : ", ") + quoted(p->name);
+	std::string sql = std::string("SELECT ") + (query && query->distinct ? "DISTINCT " : "") + cols + " FROM "
+		+ view.readSource;
+	std::vector<SqlParam> params;
+	int err = __where(view, query, sql, params);
+	if (err != CONTACTS_ERROR_NONE)
+		return err;
+	if (query && !query->sort.empty()) {
+		sql += " ORDER BY ";
+		for (size_t i = 0; i < query->sort.size(); ++i)
+			sql += (i ? ", " : "") + quoted(query->sort[i].first->name) + (query->sort[i].second ? " ASC" : " DESC");
+	}
+	sql += " LIMIT ? OFFSET ?";
+	SqlParam lim, off;
+	lim.i = limit > 0 ? limit : -1;
+	off.i = offset;
+	params.push_back(lim);
+	params.push_back(off);
+
+	contacts_list_create(out);
+	CachedStatement st(m_conn.statement(sql));
+	WPRET_VM(!st->valid(), (contacts_list_destroy(*out, true), *out = nullptr, CONTACTS_ERROR_DB), "bad query");
+	bindParams(*st, params);
+	int rc;
+	while ((rc = st->step()) == SQLITE_ROW) {
+		auto* r = new contacts_record_s(view);
+		fillRecord(*r, *st, *props);
+		(*out)->records.push_back(r);
+	}
+	if (rc != SQLITE_DONE) {
+		contacts_list_destroy(*out, true);
+		*out = nullptr;
+		return m_conn.failed("query", rc);
+	}
+	return CONTACTS_ERROR_NONE;
+}
+
+int ContactsReader::count(const ViewInfo& view, const contacts_query_s* query, int* out)
+{
+	*out = 0;
+	WPRET_VM(!view.readSource, CONTACTS_ERROR_INVALID_PARAMETER, "Invalid param");
+	std::string sql = std::string("SELECT count(*) FROM ") + view.readSource;
+	if (query && query->distinct && !query->projection.empty()) {
+		std::string cols;
+		for (const PropertyInfo* p : query->projection)
+			cols += (cols.empty() ? "" : ", ") + quoted(p->name);
+		sql = "SELECT count(*) FROM (SELECT DISTINCT " + cols + " FROM " + view.readSource;
+	}
+	std::vector<SqlParam> params;
+	int err = __where(view, query, sql, params);
+	if (err != CONTACTS_ERROR_NONE)
+		return err;
+	if (query && query->distinct && !query->projection.empty())
+		sql += ")";
+	CachedStatement st(m_conn.statement(sql));
+	bindParams(*st, params);
+	int rc = st->step();
+	if (rc != SQLITE_ROW)
+		return m_conn.failed("count", rc);
+	*out = st->columnInt(0);
+	return CONTACTS_ERROR_NONE;
+}
+
+} // namespace ct::contacts

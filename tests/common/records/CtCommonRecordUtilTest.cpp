@@ -1,0 +1,288 @@
+// The common record and address-book helpers over a real contacts store.
+#include "../../data/detail/DetailTestStore.h"
+
+#include "ContactsCommon.h"
+#include "CtCommonAddressbookUtil.h"
+#include "CtCommonRecordUtil.h"
+#include "TempDataDir.h"
+
+#include <vconf.h>
+
+#include <cstdlib>
+#include <cstring>
+#include <memory>
+#include <string>
+
+using namespace ct::test;
+
+namespace {
+
+using CText = std::unique_ptr<char, decltype(&free)>;
+
+CText take(char* text)
+{
+	return CText(text, free);
+}
+
+class CtCommonRecordUtilTest : public ::testing::Test {
+protected:
+	void SetUp() override
+	{
+		ecore_init();
+		ASSERT_EQ(CONTACTS_ERROR_NONE, contacts_connect());
+	}
+	void TearDown() override
+	{
+		contacts_disconnect();
+		ecore_shutdown();
+	}
+
+	TempDataDir m_dir;
+};
+
+std::string tr(const char* id)
+{
+	return ContactsCommon::translate(id);
+}
+
+} // namespace
+
+TEST_F(CtCommonRecordUtilTest, ContactsAndChildListsCoverEveryLinkedContactInOrder)
+{
+	contacts_record_h first = newContact(0, "One");
+	addNumber(first, "1", CONTACTS_NUMBER_TYPE_CELL);
+	addNumber(first, "2", CONTACTS_NUMBER_TYPE_HOME);
+	int firstId = store(first);
+	contacts_record_h second = newContact(0, "Two");
+	addNumber(second, "3", CONTACTS_NUMBER_TYPE_WORK);
+	int secondId = store(second);
+	int personId = linkContacts({firstId, secondId});
+
+	Eina_List* contacts = ctCommonGetContactsList(personId);
+	ASSERT_EQ(2u, eina_list_count(contacts));
+	Eina_List* numbers = CtCommonGetChildDataList(contacts, _contacts_contact.number);
+	std::string joined;
+	Eina_List* l = nullptr;
+	void* record = nullptr;
+	EINA_LIST_FOREACH(numbers, l, record) {
+		char* number = nullptr;
+		contacts_record_get_str_p(static_cast<contacts_record_h>(record), _contacts_number.number, &number);
+		joined += number;
+	}
+	EXPECT_EQ("123", joined);
+	eina_list_free(numbers);
+	EXPECT_EQ(nullptr, CtCommonGetChildDataList(contacts, _contacts_contact.email));
+	ctCommonDestroyRecordList(contacts);
+
+	EXPECT_EQ(nullptr, ctCommonGetContactsList(0));
+	EXPECT_EQ(nullptr, ctCommonGetContactsList(-3));
+	EXPECT_EQ(nullptr, ctCommonGetContactsList(424242));
+	ctCommonDestroyRecordList(nullptr);
+}
+
+TEST_F(CtCommonRecordUtilTest, SimContactIsASinglePersonContactInASimBook)
+{
+	int sim = addAddressbook(CONTACTS_SIM1_ADDRESS_BOOK_NAME, 0, 0, CONTACTS_SIM1_ADDRESS_BOOK_NAME);
+	int simContact = store(newContact(sim, "Sim"));
+	int phoneContact = store(newContact(0, "Phone"));
+	EXPECT_TRUE(ctCommonIsSimAddressbook(sim));
+	EXPECT_FALSE(ctCommonIsSimAddressbook(0));
+	EXPECT_FALSE(ctCommonIsSimAddressbook(-1));
+	EXPECT_TRUE(ctCommonIsSimContact(personOf(simContact)));
+	EXPECT_FALSE(ctCommonIsSimContact(personOf(phoneContact)));
+	EXPECT_FALSE(ctCommonIsSimContact(0));
+	int linked = linkContacts({simContact, phoneContact});
+	EXPECT_FALSE(ctCommonIsSimContact(linked));
+}
+
+TEST_F(CtCommonRecordUtilTest, AddressBookLookupsAnswerNamesProvidersAndWritableContacts)
+{
+	int readOnly = addAddressbook("corp", CONTACTS_ADDRESS_BOOK_MODE_READONLY, 7, "Corp");
+	EXPECT_EQ(readOnly, ctCommonGetAddressBookId("corp"));
+	EXPECT_EQ(0, ctCommonGetAddressBookId(PHONE_ADDRESSBOOK_NAME));
+	EXPECT_EQ(-1, ctCommonGetAddressBookId("nobody"));
+	EXPECT_EQ(-1, ctCommonGetAddressBookId(nullptr));
+	EXPECT_STREQ("corp", take(ctCommonGetAddressBookName(readOnly)).get());
+	EXPECT_EQ(nullptr, take(ctCommonGetAddressBookName(9999)).get());
+
+	char* provider = nullptr;
+	char* user = nullptr;
+	EXPECT_EQ(CONTACTS_ERROR_NONE, ctCommonGetProviderNameByAddressbookId(readOnly, &provider, &user));
+	EXPECT_STREQ("Corp", provider);
+	EXPECT_STREQ("user@example.com", user);
+	free(provider);
+	free(user);
+	EXPECT_NE(CONTACTS_ERROR_NONE, ctCommonGetProviderNameByAddressbookId(9999, &provider, &user));
+	EXPECT_EQ(nullptr, provider);
+
+	char* firstText = nullptr;
+	char* secondText = nullptr;
+	EXPECT_EQ(CONTACTS_ERROR_NONE, ctCommonGetAccountInforByAddressbookId(0, &firstText, &secondText));
+	EXPECT_STREQ("IDS_PB_OPT_DEVICE", firstText);
+	free(firstText);
+	free(secondText);
+	EXPECT_NE(std::string::npos, ctCommonGetAccountIconPathByAddressbookId(0).find("contacts_list_ic_device.png"));
+	EXPECT_EQ("", ctCommonGetAccountIconPathByAddressbookId(readOnly));
+
+	int roContact = store(newContact(readOnly, "Ro"));
+	int phoneContact = store(newContact(0, "Ph"));
+	int other = store(newContact(0, "Ph2"));
+	int personId = linkContacts({roContact, phoneContact, other});
+	Eina_List* writable = ctCommonGetWritableContactList(personId, 0);
+	EXPECT_EQ(2u, eina_list_count(writable));
+	ctCommonDestroyRecordList(writable);
+	writable = ctCommonGetWritableContactList(personId, 1);
+	ASSERT_EQ(1u, eina_list_count(writable));
+	int id = 0;
+	contacts_record_get_int(static_cast<contacts_record_h>(eina_list_data_get(writable)), _contacts_contact.id, &id);
+	EXPECT_EQ(phoneContact, id);
+	ctCommonDestroyRecordList(writable);
+	EXPECT_EQ(nullptr, ctCommonGetWritableContactList(personOf(store(newContact(readOnly, "Only"))), 0));
+}
+
+TEST_F(CtCommonRecordUtilTest, GroupNamesUseSystemNamesOnceEach)
+{
+	int exchange = addAddressbook("eas", 0, 9, "Exchange");
+	auto addGroup = [](int book, const char* name, const char* systemId) {
+		contacts_record_h group = nullptr;
+		contacts_record_create(_contacts_group._uri, &group);
+		contacts_record_set_int(group, _contacts_group.address_book_id, book);
+		contacts_record_set_str(group, _contacts_group.name, name);
+		if (systemId)
+			contacts_record_set_str(group, _contacts_group.system_id, systemId);
+		int id = 0;
+		EXPECT_EQ(CONTACTS_ERROR_NONE, contacts_db_insert_record(group, &id));
+		contacts_record_destroy(group, true);
+		return id;
+	};
+	int hikers = addGroup(0, "Hikers", nullptr);
+	int family = addGroup(0, "ignored", "family");
+	int easDefault = addGroup(exchange, "Contacts", "contacts");
+	EXPECT_EQ(easDefault, ctCommonGetEasDefaultGroupId(exchange));
+	EXPECT_EQ(0, ctCommonGetEasDefaultGroupId(0));
+
+	int a = store(newContact(0, "A"));
+	int b = store(newContact(0, "B"));
+	contacts_group_add_contact(hikers, a);
+	contacts_group_add_contact(family, a);
+	contacts_group_add_contact(hikers, b);
+	int personId = linkContacts({a, b});
+	Eina_List* contacts = ctCommonGetContactsList(personId);
+	EXPECT_EQ("Hikers, " + ctCommonGetDisplayGroupName("family"), ctCommonGetGroupNames(contacts));
+	ctCommonDestroyRecordList(contacts);
+	EXPECT_EQ("", ctCommonGetGroupNames(nullptr));
+	EXPECT_EQ("custom_sys", ctCommonGetDisplayGroupName("custom_sys"));
+	EXPECT_EQ("", ctCommonGetDisplayGroupName(nullptr));
+}
+
+TEST_F(CtCommonRecordUtilTest, CompanyExtraNamesNewlinesAndShareText)
+{
+	contacts_record_h contact = newContact(0, "Dana");
+	contacts_record_h company = addChild(contact, _contacts_contact.company, _contacts_company._uri);
+	contacts_record_set_str(company, _contacts_company.job_title, "Chief");
+	addNumber(contact, "0101", CONTACTS_NUMBER_TYPE_CELL);
+	addEmail(contact, "dana@example.com");
+	int personId = personOf(store(contact));
+
+	Eina_List* contacts = ctCommonGetContactsList(personId);
+	EXPECT_STREQ("Chief", take(CtCommonGetCompany(contacts)).get());
+	char* first = nullptr;
+	char* second = nullptr;
+	CtCommonGetExtraName1(contacts, &first, &second);
+	EXPECT_EQ(nullptr, first);
+	EXPECT_EQ(nullptr, second);
+	ctCommonDestroyRecordList(contacts);
+	EXPECT_EQ(nullptr, CtCommonGetCompany(nullptr));
+
+	EXPECT_STREQ("a b  c", take(ctCommonRemoveNewline("a\nb\r\nc")).get());
+	EXPECT_EQ(nullptr, ctCommonRemoveNewline(nullptr));
+
+	EXPECT_STREQ("Dana\n0101\ndana@example.com", take(CtCommonGetShareText(personId)).get());
+	EXPECT_EQ(nullptr, CtCommonGetShareText(0));
+}
+
+TEST_F(CtCommonRecordUtilTest, TypeLabelsCoverEveryTypeAndCustomLabels)
+{
+	EXPECT_EQ(tr("IDS_PB_OPT_MOBILE"), CtCommonGetNumberTypeStr(CONTACTS_NUMBER_TYPE_CELL, nullptr));
+	EXPECT_EQ(tr("IDS_PB_OPT_MOBILE"), CtCommonGetNumberTypeStr(CONTACTS_NUMBER_TYPE_CELL | CONTACTS_NUMBER_TYPE_VOICE, nullptr));
+	EXPECT_EQ(tr("IDS_PB_OPT_HOME_ABB2"), CtCommonGetNumberTypeStr(CONTACTS_NUMBER_TYPE_HOME | CONTACTS_NUMBER_TYPE_VOICE, nullptr));
+	EXPECT_EQ(tr("IDS_PB_OPT_WORK"), CtCommonGetNumberTypeStr(CONTACTS_NUMBER_TYPE_WORK, nullptr));
+	EXPECT_EQ(tr("IDS_PB_OPT_FAX_HHOME_ABB"), CtCommonGetNumberTypeStr(CONTACTS_NUMBER_TYPE_FAX | CONTACTS_NUMBER_TYPE_HOME, nullptr));
+	EXPECT_EQ(tr("IDS_PB_OPT_FAX_HWORK_ABB"), CtCommonGetNumberTypeStr(CONTACTS_NUMBER_TYPE_FAX | CONTACTS_NUMBER_TYPE_WORK, nullptr));
+	EXPECT_EQ(tr("IDS_PB_OPT_PAGER"), CtCommonGetNumberTypeStr(CONTACTS_NUMBER_TYPE_PAGER, nullptr));
+	EXPECT_EQ(tr("IDS_PB_OPT_ASSISTANT_M_CONTACTS"), CtCommonGetNumberTypeStr(CONTACTS_NUMBER_TYPE_ASSISTANT, nullptr));
+	EXPECT_EQ(tr("IDS_PB_OPT_OTHER"), CtCommonGetNumberTypeStr(CONTACTS_NUMBER_TYPE_OTHER, nullptr));
+	EXPECT_EQ(tr("IDS_PB_OPT_OTHER"), CtCommonGetNumberTypeStr(CONTACTS_NUMBER_TYPE_MODEM, nullptr));
+	EXPECT_STREQ("Boat", CtCommonGetNumberTypeStr(CONTACTS_NUMBER_TYPE_CUSTOM, "Boat"));
+	EXPECT_EQ(tr("IDS_PB_OPT_CUSTOM"), CtCommonGetNumberTypeStr(CONTACTS_NUMBER_TYPE_CUSTOM, ""));
+
+	contacts_record_h number = nullptr;
+	contacts_record_create(_contacts_number._uri, &number);
+	contacts_record_set_str(number, _contacts_number.label, "Yacht");
+	EXPECT_STREQ("Yacht", CtCommonGetNumberTypeStr(number, CONTACTS_NUMBER_TYPE_CUSTOM));
+	contacts_record_destroy(number, true);
+	EXPECT_EQ(tr("IDS_PB_OPT_CUSTOM"), CtCommonGetNumberTypeStr(static_cast<contacts_record_h>(nullptr), 1));
+
+	EXPECT_EQ(tr("IDS_PB_OPT_HOME_ABB2"), CtCommonGetEmailTypeStr(CONTACTS_EMAIL_TYPE_HOME, nullptr));
+	EXPECT_EQ(tr("IDS_PB_OPT_WORK"), CtCommonGetEmailTypeStr(CONTACTS_EMAIL_TYPE_WORK, nullptr));
+	EXPECT_EQ(tr("IDS_PB_OPT_MOBILE"), CtCommonGetEmailTypeStr(CONTACTS_EMAIL_TYPE_MOBILE, nullptr));
+	EXPECT_EQ(tr("IDS_PB_OPT_OTHER"), CtCommonGetEmailTypeStr(CONTACTS_EMAIL_TYPE_OTHER, nullptr));
+	EXPECT_STREQ("Alt", CtCommonGetEmailTypeStr(CONTACTS_EMAIL_TYPE_CUSTOM, "Alt"));
+
+	EXPECT_EQ(tr("IDS_PB_OPT_HOME_ABB2"), CtCommonGetAddressTypeStr(CONTACTS_ADDRESS_TYPE_HOME, nullptr));
+	EXPECT_EQ(tr("IDS_PB_OPT_WORK"), CtCommonGetAddressTypeStr(CONTACTS_ADDRESS_TYPE_WORK, nullptr));
+	EXPECT_EQ(tr("IDS_PB_OPT_OTHER"), CtCommonGetAddressTypeStr(CONTACTS_ADDRESS_TYPE_PARCEL, nullptr));
+	EXPECT_STREQ("Cabin", CtCommonGetAddressTypeStr(CONTACTS_ADDRESS_TYPE_CUSTOM, "Cabin"));
+
+	const char* messengers[] = {"IDS_PB_OPT_OTHER", nullptr, "IDS_PB_OPT_HANGOUTS", "IDS_PB_OPT_WINDOWS_LIVE_MESSENGER",
+		"IDS_PB_OPT_YAHOO_E", "IDS_PB_OPT_FACEBOOK", "IDS_PB_OPT_ICQ", "IDS_PB_OPT_AIM", "IDS_PB_OPT_QQ",
+		"IDS_PB_OPT_JABBER", "IDS_PB_BODY_SKYPE", "IDS_PB_OPT_IRC"};
+	for (int type = 0; type <= CONTACTS_MESSENGER_TYPE_IRC; ++type)
+		if (messengers[type]) {
+			EXPECT_EQ(tr(messengers[type]), CtCommonGetMessengerTypeStr(type, nullptr)) << type;
+		}
+	EXPECT_STREQ("Signal", CtCommonGetMessengerTypeStr(CONTACTS_MESSENGER_TYPE_CUSTOM, "Signal"));
+	EXPECT_EQ(tr("IDS_PB_OPT_OTHER"), CtCommonGetMessengerTypeStr(99, nullptr));
+	EXPECT_EQ(tr("IDS_PB_OPT_OTHER"), CtCommonGetMessengerTypeStr(-4, nullptr));
+
+	EXPECT_EQ(tr("IDS_PB_OPT_HOME_ABB2"), CtCommonGetUrlTypeStr(CONTACTS_URL_TYPE_HOME, nullptr));
+	EXPECT_EQ(tr("IDS_PB_OPT_WORK"), CtCommonGetUrlTypeStr(CONTACTS_URL_TYPE_WORK, nullptr));
+	EXPECT_EQ(tr("IDS_PB_OPT_OTHER"), CtCommonGetUrlTypeStr(CONTACTS_URL_TYPE_OTHER, nullptr));
+	EXPECT_STREQ("Blog", CtCommonGetUrlTypeStr(CONTACTS_URL_TYPE_CUSTOM, "Blog"));
+
+	const char* relations[] = {"IDS_PB_OPT_OTHER", "IDS_PB_OPT_ASSISTANT_M_CONTACTS", "IDS_PB_OPT_BROTHER",
+		"IDS_PB_OPT_CHILD", "IDS_PB_OPT_DOMESTIC_PARTNER_ABB2", "IDS_PB_OPT_FATHER", "IDS_PB_OPT_FRIEND",
+		"IDS_PB_OPT_MANAGER", "IDS_PB_OPT_MOTHER", "IDS_PB_OPT_PARENT", "IDS_PB_OPT_PARTNER",
+		"IDS_PB_OPT_REFERRED_BY_ABB", "IDS_PB_OPT_RELATIVE", "IDS_PB_OPT_SISTER", "IDS_PB_OPT_SPOUSE"};
+	for (int type = 0; type < CONTACTS_RELATIONSHIP_TYPE_CUSTOM; ++type)
+		EXPECT_EQ(tr(relations[type]), CtCommonGetRelationshipTypeStr(type, nullptr)) << type;
+	EXPECT_STREQ("Mentor", CtCommonGetRelationshipTypeStr(CONTACTS_RELATIONSHIP_TYPE_CUSTOM, "Mentor"));
+	EXPECT_EQ(tr("IDS_PB_OPT_OTHER"), CtCommonGetRelationshipTypeStr(40, nullptr));
+
+	EXPECT_EQ(tr("IDS_PB_OPT_BIRTHDAY"), CtCommonGetEventTypeStr(CONTACTS_EVENT_TYPE_BIRTH, nullptr));
+	EXPECT_EQ(tr("IDS_PB_OPT_ANNIVERSARY_ABB"), CtCommonGetEventTypeStr(CONTACTS_EVENT_TYPE_ANNIVERSARY, nullptr));
+	EXPECT_EQ(tr("IDS_PB_OPT_OTHER"), CtCommonGetEventTypeStr(CONTACTS_EVENT_TYPE_OTHER, nullptr));
+	EXPECT_STREQ("Graduation", CtCommonGetEventTypeStr(CONTACTS_EVENT_TYPE_CUSTOM, "Graduation"));
+}
+
+TEST_F(CtCommonRecordUtilTest, DateFormattersFollowTheRegionFormat)
+{
+	i18n_udate_h withYear = CtCommonGetTimeFormatter();
+	i18n_udate_h withoutYear = CtCommonGetTimeFormatterWithoutYear();
+	ASSERT_NE(nullptr, withYear);
+	ASSERT_NE(nullptr, withoutYear);
+	EXPECT_EQ("Dec 31, 1999", CtCommonGetDatetimeStr(withYear, 1999, 12, 31));
+	EXPECT_EQ("Feb 29", CtCommonGetDatetimeStr(withoutYear, 0, 2, 29));
+	EXPECT_EQ("", CtCommonGetDatetimeStr(nullptr, 1999, 1, 1));
+	i18n_udate_destroy(withYear);
+	i18n_udate_destroy(withoutYear);
+
+	ASSERT_EQ(0, vconf_set_str(VCONFKEY_REGIONFORMAT, "de_DE.UTF-8"));
+	i18n_udate_h german = CtCommonGetTimeFormatter();
+	ASSERT_NE(nullptr, german);
+	std::string date = CtCommonGetDatetimeStr(german, 1999, 12, 31);
+	EXPECT_EQ(0u, date.find("31.")) << date;
+	EXPECT_NE(std::string::npos, date.find("1999")) << date;
+	i18n_udate_destroy(german);
+	vconf_set_str(VCONFKEY_REGIONFORMAT, "en_US.UTF-8");
+}

@@ -1,0 +1,222 @@
+// Change detection: which database changes reach the detail data's listener.
+#include "CtDetailData.h"
+#include "DetailTestStore.h"
+
+#include "CtRegistryMgr.h"
+#include "LogSink.h"
+#include "TempDataDir.h"
+
+#include <functional>
+#include <memory>
+#include <string>
+#include <vector>
+
+using namespace ct::test;
+
+namespace {
+
+class RecordingListener : public ICtChangeListener {
+public:
+	void onDbChanged(const char* viewUri) override
+	{
+		uris.push_back(viewUri ? viewUri : "");
+		if (onChange)
+			onChange();
+	}
+	void onCompleteGetContacts() override {}
+	void onConditionChagned() override {}
+
+	std::vector<std::string> uris;
+	std::function<void()> onChange;
+};
+
+class CtDetailDataChangeTest : public ::testing::Test {
+protected:
+	void SetUp() override
+	{
+		ecore_init();
+		ASSERT_EQ(CONTACTS_ERROR_NONE, contacts_connect());
+		m_registryId = CtRegistryMgr::getInstance()->addChangeListener(
+			[this](ctRegistryKey key, int) { m_registryKeys.push_back(key); });
+		int second = 0;
+		m_contactA = store(newContact(0, "Alpha"));
+		second = store(newContact(0, "Beta"));
+		m_contactB = second;
+		m_personId = linkContacts({m_contactA, m_contactB});
+		m_otherPerson = addSimplePerson("Stranger", &m_otherContact);
+		settle(0.3);
+		m_data = std::make_unique<CtDetailData>(m_personId);
+		m_data->attachListener(&m_listener);
+	}
+	void TearDown() override
+	{
+		m_data.reset();
+		CtRegistryMgr::getInstance()->removeChangeListener(m_registryId);
+		contacts_disconnect();
+		ecore_shutdown();
+	}
+
+	size_t callsAfterSettling()
+	{
+		pumpUntil([this] { return !m_listener.uris.empty(); }, 2.0);
+		settle();
+		return m_listener.uris.size();
+	}
+
+	TempDataDir m_dir;
+	RecordingListener m_listener;
+	std::unique_ptr<CtDetailData> m_data;
+	std::vector<ctRegistryKey> m_registryKeys;
+	int m_registryId = 0;
+	int m_contactA = 0;
+	int m_contactB = 0;
+	int m_personId = 0;
+	int m_otherPerson = 0;
+	int m_otherContact = 0;
+};
+
+} // namespace
+
+TEST_F(CtDetailDataChangeTest, UnrelatedContactChangesDoNotNotify)
+{
+	addNumberToStoredContact(m_otherContact, "555");
+	addSimplePerson("Newcomer");
+	ASSERT_EQ(CONTACTS_ERROR_NONE, contacts_db_delete_record(_contacts_person._uri, m_otherPerson));
+	settle(1.0);
+	EXPECT_TRUE(m_listener.uris.empty());
+}
+
+TEST_F(CtDetailDataChangeTest, ChangeOfALinkedContactNotifiesOnce)
+{
+	addNumberToStoredContact(m_contactB, "777");
+	EXPECT_EQ(1u, callsAfterSettling());
+	EXPECT_EQ(_contacts_person._uri, m_listener.uris.front());
+
+	// The remembered version moved on: an unrelated change stays quiet now.
+	addNumberToStoredContact(m_otherContact, "888");
+	settle();
+	EXPECT_EQ(1u, m_listener.uris.size());
+}
+
+TEST_F(CtDetailDataChangeTest, NameContactChangeNotifies)
+{
+	int nameContact = m_data->getNameContactId();
+	int other = nameContact == m_contactA ? m_contactB : m_contactA;
+	ASSERT_EQ(CONTACTS_ERROR_NONE,
+		contacts_person_set_default_property(CONTACTS_PERSON_PROPERTY_NAME_CONTACT, m_personId, other));
+	EXPECT_EQ(1u, callsAfterSettling());
+	EXPECT_EQ(other, m_data->getNameContactId());
+}
+
+TEST_F(CtDetailDataChangeTest, FavoriteChangeOfThePersonNotifies)
+{
+	CtDetailData elsewhere(m_personId);
+	elsewhere.setFavorite(true);
+	EXPECT_EQ(1u, callsAfterSettling());
+}
+
+TEST_F(CtDetailDataChangeTest, DefaultImageChangeNotifies)
+{
+	m_data.reset();
+	contacts_record_h a = nullptr;
+	ASSERT_EQ(CONTACTS_ERROR_NONE, contacts_db_get_record(_contacts_contact._uri, m_contactA, &a));
+	addImage(a, "/pics/a.jpg");
+	ASSERT_EQ(CONTACTS_ERROR_NONE, contacts_db_update_record(a));
+	contacts_record_destroy(a, true);
+	contacts_record_h b = nullptr;
+	ASSERT_EQ(CONTACTS_ERROR_NONE, contacts_db_get_record(_contacts_contact._uri, m_contactB, &b));
+	addImage(b, "/pics/b.jpg");
+	ASSERT_EQ(CONTACTS_ERROR_NONE, contacts_db_update_record(b));
+	contacts_record_destroy(b, true);
+	settle(0.3);
+
+	m_data = std::make_unique<CtDetailData>(m_personId);
+	m_data->attachListener(&m_listener);
+	int current = m_data->getDefaultImageId();
+	int other = 0;
+	Eina_List* l = nullptr;
+	void* record = nullptr;
+	EINA_LIST_FOREACH(m_data->getImageList(), l, record) {
+		int id = 0;
+		contacts_record_get_int(static_cast<contacts_record_h>(record), _contacts_image.id, &id);
+		if (id != current)
+			other = id;
+	}
+	ASSERT_GT(other, 0);
+	ASSERT_EQ(CONTACTS_ERROR_NONE,
+		contacts_person_set_default_property(CONTACTS_PERSON_PROPERTY_IMAGE, m_personId, other));
+	EXPECT_EQ(1u, callsAfterSettling());
+	EXPECT_EQ(other, m_data->getDefaultImageId());
+}
+
+TEST_F(CtDetailDataChangeTest, PhoneLogChangeRaisesTheRegistrySignalOnly)
+{
+	contacts_record_h log = nullptr;
+	contacts_record_create(_contacts_phone_log._uri, &log);
+	contacts_record_set_str(log, _contacts_phone_log.address, "555");
+	contacts_record_set_int(log, _contacts_phone_log.log_type, CONTACTS_PLOG_TYPE_VOICE_INCOMING);
+	ASSERT_EQ(CONTACTS_ERROR_NONE, contacts_db_insert_record(log, nullptr));
+	contacts_record_destroy(log, true);
+	EXPECT_TRUE(pumpUntil([this] { return !m_registryKeys.empty(); }, 2.0));
+	settle();
+	ASSERT_EQ(1u, m_registryKeys.size());
+	EXPECT_EQ(CT_REGISTRY_KEY_PHONELOG_CHANGED, m_registryKeys.front());
+	EXPECT_TRUE(m_listener.uris.empty());
+}
+
+TEST_F(CtDetailDataChangeTest, DeletedPersonNotifiesOnceThenStaysQuiet)
+{
+	ASSERT_EQ(CONTACTS_ERROR_NONE, contacts_db_delete_record(_contacts_person._uri, m_personId));
+	EXPECT_EQ(1u, callsAfterSettling());
+	EXPECT_FALSE(m_data->isCurrentPersonValid());
+	addNumberToStoredContact(m_otherContact, "999");
+	settle();
+	EXPECT_EQ(1u, m_listener.uris.size());
+}
+
+TEST_F(CtDetailDataChangeTest, ListenerMayDeleteTheDataInsideItsCallback)
+{
+	m_listener.onChange = [this] { m_data.reset(); };
+	addNumberToStoredContact(m_contactA, "123");
+	EXPECT_EQ(1u, callsAfterSettling());
+	EXPECT_EQ(nullptr, m_data);
+	addNumberToStoredContact(m_contactA, "456");
+	settle();
+	EXPECT_EQ(1u, m_listener.uris.size());
+}
+
+TEST_F(CtDetailDataChangeTest, NullListenerIsRefusedAndDetachedListenerHearsNothing)
+{
+	ct::log::clear();
+	m_data->attachListener(nullptr);
+	EXPECT_TRUE(ct::log::contains("* Critical * listener is NULL", DLOG_ERROR));
+	m_data->detachListener();
+	addNumberToStoredContact(m_contactA, "321");
+	settle(1.0);
+	EXPECT_TRUE(m_listener.uris.empty());
+}
+
+TEST_F(CtDetailDataChangeTest, GalEntryAndMissingPersonNeverNotify)
+{
+	CtGalSearchData entry = {nullptr, nullptr, "Gal", "1", nullptr, nullptr, nullptr, nullptr};
+	CtDetailData gal(&entry);
+	RecordingListener galListener;
+	gal.attachListener(&galListener);
+	CtDetailData nobody(0);
+	RecordingListener nobodyListener;
+	nobody.attachListener(&nobodyListener);
+
+	addNumberToStoredContact(m_otherContact, "1");
+	addNumberToStoredContact(m_contactA, "2");
+	EXPECT_EQ(1u, callsAfterSettling());
+	EXPECT_TRUE(galListener.uris.empty());
+	EXPECT_TRUE(nobodyListener.uris.empty());
+}
+
+TEST_F(CtDetailDataChangeTest, LinkingAnotherPersonInMovesTheMarkerAndNotifies)
+{
+	// The moved contact is not among the remembered ones: only the person's
+	// change marker tells that the person changed.
+	ASSERT_EQ(CONTACTS_ERROR_NONE, contacts_person_link_person(m_personId, m_otherPerson));
+	EXPECT_EQ(1u, callsAfterSettling());
+}

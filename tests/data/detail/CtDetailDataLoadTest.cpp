@@ -1,0 +1,361 @@
+// Loading one person for the detail screens: a rich linked person, persons
+// that do not exist, GAL entries and the stored writes.
+#include "CtDetailData.h"
+#include "DetailTestStore.h"
+
+#include "ContactsCommon.h"
+#include "CtCommonAddressbookUtil.h"
+#include "CtCommonRecordUtil.h"
+#include "LogSink.h"
+#include "SqliteFaultInjector.h"
+#include "TempDataDir.h"
+
+
+#include <glib.h>
+
+#include <cstdio>
+#include <fstream>
+#include <memory>
+#include <string>
+#include <vector>
+
+using namespace ct::test;
+
+namespace {
+
+std::vector<std::string> numbersOf(CtDetailData& data)
+{
+	std::vector<std::string> out;
+	Eina_List* l = nullptr;
+	void* record = nullptr;
+	EINA_LIST_FOREACH(data.getNumberList(), l, record)
+		out.push_back(data.getNumber(static_cast<contacts_record_h>(record)));
+	return out;
+}
+
+class CtDetailDataLoadTest : public ::testing::Test {
+protected:
+	TempDataDir m_dir;
+
+	void SetUp() override
+	{
+		ecore_init();
+		ASSERT_EQ(CONTACTS_ERROR_NONE, contacts_connect());
+	}
+	void TearDown() override
+	{
+		contacts_disconnect();
+		ecore_shutdown();
+	}
+
+	// Ann (phone book, rich) linked with Bob's contact of a second account.
+	int addRichLinkedPerson(int* annContact, int* otherContact)
+	{
+		int account = addAddressbook("work@example.com", 0, 3, "Exchange");
+		contacts_record_h ann = newContact(0, "Ann");
+		contacts_record_h name = nullptr;
+		contacts_record_get_child_record_at_p(ann, _contacts_contact.name, 0, &name);
+		contacts_record_set_str(name, _contacts_name.phonetic_first, "An");
+		contacts_record_set_str(name, _contacts_name.phonetic_last, "Lee");
+		contacts_record_set_str(addChild(ann, _contacts_contact.nickname, _contacts_nickname._uri),
+			_contacts_nickname.name, "Annie");
+		contacts_record_h company = addChild(ann, _contacts_contact.company, _contacts_company._uri);
+		contacts_record_set_str(company, _contacts_company.name, "Acme");
+		contacts_record_set_str(company, _contacts_company.department, "Sales");
+		contacts_record_set_str(company, _contacts_company.job_title, "Manager");
+		addNumber(ann, "111", CONTACTS_NUMBER_TYPE_CELL);
+		addNumber(ann, "222", CONTACTS_NUMBER_TYPE_CUSTOM, "Boat");
+		addEmail(ann, "ann@example.com");
+		contacts_record_h address = addChild(ann, _contacts_contact.address, _contacts_address._uri);
+		contacts_record_set_str(address, _contacts_address.street, "1 Main St");
+		contacts_record_set_str(address, _contacts_address.locality, "Springfield");
+		contacts_record_set_str(address, _contacts_address.country, "USA");
+		contacts_record_set_str(addChild(ann, _contacts_contact.messenger, _contacts_messenger._uri),
+			_contacts_messenger.im_id, "ann.im");
+		contacts_record_set_str(addChild(ann, _contacts_contact.url, _contacts_url._uri), _contacts_url.url,
+			"https://ann.example.com");
+		contacts_record_set_str(addChild(ann, _contacts_contact.relationship, _contacts_relationship._uri),
+			_contacts_relationship.name, "Carl");
+		contacts_record_h event = addChild(ann, _contacts_contact.event, _contacts_event._uri);
+		contacts_record_set_int(event, _contacts_event.type, CONTACTS_EVENT_TYPE_BIRTH);
+		contacts_record_set_int(event, _contacts_event.date, 19800102);
+		contacts_record_set_int(event, _contacts_event.calendar_type, CONTACTS_EVENT_CALENDAR_TYPE_LUNAR);
+		contacts_record_set_bool(event, _contacts_event.is_leap_month, true);
+		contacts_record_set_str(addChild(ann, _contacts_contact.note, _contacts_note._uri), _contacts_note.note,
+			"likes tea");
+		addImage(ann, "/images/ann1.jpg", 1);
+		*annContact = store(ann);
+
+		contacts_record_h other = newContact(account, "Bob");
+		addNumber(other, "333", CONTACTS_NUMBER_TYPE_HOME);
+		addEmail(other, "bob@example.com");
+		addImage(other, "/images/ann2.jpg", 2);
+		*otherContact = store(other);
+		return linkContacts({*annContact, *otherContact});
+	}
+};
+
+} // namespace
+
+TEST_F(CtDetailDataLoadTest, RichLinkedPersonLoadsEveryFieldOverAllContactsInOrder)
+{
+	int annContact = 0, otherContact = 0;
+	int personId = addRichLinkedPerson(&annContact, &otherContact);
+	int groupId = 0;
+	contacts_record_h group = nullptr;
+	contacts_record_create(_contacts_group._uri, &group);
+	contacts_record_set_str(group, _contacts_group.name, "Climbers");
+	ASSERT_EQ(CONTACTS_ERROR_NONE, contacts_db_insert_record(group, &groupId));
+	contacts_record_destroy(group, true);
+	ASSERT_EQ(CONTACTS_ERROR_NONE, contacts_group_add_contact(groupId, annContact));
+
+	CtDetailData data(personId);
+	EXPECT_EQ(personId, data.getPersonId());
+	EXPECT_EQ(2u, eina_list_count(data.getContactsList()));
+	EXPECT_NE(nullptr, data.getDisplayName());
+	EXPECT_STREQ("Acme Sales, Manager", data.getCompany());
+	EXPECT_STREQ("Annie", data.getExtraName1First());
+	EXPECT_STREQ("An Lee", data.getExtraName1Second());
+	EXPECT_STREQ("An Lee, Annie", data.getExtraName2());
+	EXPECT_EQ((std::vector<std::string>{"111", "222", "333"}), numbersOf(data));
+
+	contacts_record_h custom = static_cast<contacts_record_h>(eina_list_nth(data.getNumberList(), 1));
+	EXPECT_EQ(CONTACTS_NUMBER_TYPE_CUSTOM, data.getDataType(custom, _contacts_number.type));
+	EXPECT_STREQ("Boat", data.getDataTypeCustom(custom, _contacts_number.label));
+	EXPECT_EQ(2u, eina_list_count(data.getEmailList()));
+	EXPECT_STREQ("ann@example.com", data.getEmail(static_cast<contacts_record_h>(eina_list_data_get(data.getEmailList()))));
+
+	char address[1024] = {0};
+	data.getAddress(static_cast<contacts_record_h>(eina_list_data_get(data.getAddressList())), address, sizeof(address));
+	EXPECT_STREQ("Springfield\n1 Main St\nUSA", address);
+	char small[8] = {0};
+	data.getAddress(static_cast<contacts_record_h>(eina_list_data_get(data.getAddressList())), small, sizeof(small));
+	EXPECT_STREQ("Springf", small);
+
+	EXPECT_STREQ("ann.im", data.getMessenger(static_cast<contacts_record_h>(eina_list_data_get(data.getMessengerList()))));
+	EXPECT_STREQ("https://ann.example.com", data.getUrl(static_cast<contacts_record_h>(eina_list_data_get(data.getUrlList()))));
+	EXPECT_STREQ("Carl", data.getRelationship(static_cast<contacts_record_h>(eina_list_data_get(data.getRelationshipList()))));
+	contacts_record_h event = static_cast<contacts_record_h>(eina_list_data_get(data.getEventList()));
+	EXPECT_EQ(19800102, data.getEvent(event));
+	EXPECT_EQ(CONTACTS_EVENT_CALENDAR_TYPE_LUNAR, data.getCalendarType(event));
+	EXPECT_TRUE(data.getIsLeapMonth(event));
+	EXPECT_STREQ("likes tea", data.getNote(static_cast<contacts_record_h>(eina_list_data_get(data.getNoteList()))));
+	EXPECT_EQ(2u, eina_list_count(data.getNameList()));
+	EXPECT_EQ(2u, eina_list_count(data.getImageList()));
+
+	std::unique_ptr<char, decltype(&free)> second(data.getImagePath(2), free);
+	EXPECT_STREQ("/images/ann2.jpg", second.get());
+	EXPECT_EQ(nullptr, data.getImagePath(3));
+	EXPECT_EQ(nullptr, data.getImagePath(0));
+	EXPECT_EQ(nullptr, data.getImagePath(6));
+	EXPECT_TRUE(ct::log::contains("* Critical * Invalid Param : order : 6"));
+
+	EXPECT_TRUE(data.getNameContactId() == annContact || data.getNameContactId() == otherContact);
+	EXPECT_EQ("Climbers", data.getGroupNames());
+	ASSERT_NE(nullptr, data.getTimeFormatter());
+	ASSERT_NE(nullptr, data.getTimeFormatterWithoutYear());
+	EXPECT_EQ("Jan 2, 1980", CtCommonGetDatetimeStr(data.getTimeFormatter(), 1980, 1, 2));
+	EXPECT_EQ("Jan 2", CtCommonGetDatetimeStr(data.getTimeFormatterWithoutYear(), 0, 1, 2));
+
+	EXPECT_FALSE(data.getReadOnlyMode());
+	EXPECT_FALSE(data.getFacebookMode());
+	EXPECT_FALSE(data.isSimContact());
+	EXPECT_TRUE(data.isCurrentPersonValid());
+	std::unique_ptr<char, decltype(&free)> vcard(data.getVcardStream(), free);
+	ASSERT_NE(nullptr, vcard.get());
+	EXPECT_NE(std::string::npos, std::string(vcard.get()).find("BEGIN:VCARD"));
+	EXPECT_NE(std::string::npos, std::string(vcard.get()).find("111"));
+}
+
+TEST_F(CtDetailDataLoadTest, PersonWithoutGroupsShowsNotAssigned)
+{
+	int personId = addSimplePerson("Solo");
+	CtDetailData data(personId);
+	EXPECT_EQ(ContactsCommon::translate("IDS_PB_BODY_NOT_ASSIGNED"), data.getGroupNames());
+	EXPECT_EQ(nullptr, data.getCompany());
+	EXPECT_EQ(nullptr, data.getExtraName2());
+	EXPECT_EQ(nullptr, data.getRingtonePath());
+	EXPECT_EQ(nullptr, data.getNumberList());
+}
+
+TEST_F(CtDetailDataLoadTest, MissingPersonGivesAnEmptyObject)
+{
+	int contactId = 0;
+	int deleted = addSimplePerson("Gone", &contactId);
+	ASSERT_EQ(CONTACTS_ERROR_NONE, contacts_db_delete_record(_contacts_person._uri, deleted));
+
+	for (int personId : {0, -7, deleted, 999999}) {
+		CtDetailData data(personId);
+		EXPECT_EQ(0, data.getPersonId());
+		EXPECT_EQ(nullptr, data.getDisplayName());
+		EXPECT_EQ(nullptr, data.getContactsList());
+		EXPECT_EQ(nullptr, data.getNumberList());
+		EXPECT_EQ(nullptr, data.getImageList());
+		EXPECT_EQ(nullptr, data.getImagePath(1));
+		EXPECT_EQ(0, data.getDefaultImageId());
+		EXPECT_EQ(0, data.getNameContactId());
+		EXPECT_FALSE(data.isFavorite());
+		EXPECT_EQ("", data.getGroupNames());
+		EXPECT_FALSE(data.isCurrentPersonValid());
+		EXPECT_FALSE(data.isSimContact());
+		EXPECT_TRUE(data.getReadOnlyMode());
+		EXPECT_TRUE(data.getFacebookMode());
+		EXPECT_EQ(nullptr, data.getContactsWithoutFacebook());
+		EXPECT_EQ(nullptr, data.getVcardStream());
+		data.setFavorite(true);
+		data.setRingtone("/x.ogg");
+		EXPECT_FALSE(data.isFavorite());
+	}
+}
+
+TEST_F(CtDetailDataLoadTest, RingtoneWhoseFileIsGoneIsClearedInTheStore)
+{
+	std::string tone = m_dir.file("tone.ogg");
+	std::ofstream(tone) << "ogg";
+	int personId = addSimplePerson("Ringo");
+	{
+		CtDetailData data(personId);
+		data.setRingtone(tone.c_str());
+		EXPECT_STREQ(tone.c_str(), data.getRingtonePath());
+	}
+	{
+		CtDetailData data(personId);
+		EXPECT_STREQ(tone.c_str(), data.getRingtonePath());
+	}
+	std::remove(tone.c_str());
+	{
+		CtDetailData data(personId);
+		EXPECT_EQ(nullptr, data.getRingtonePath());
+	}
+	reopenStore();
+	EXPECT_EQ("<null>", personText(personId, _contacts_person.ringtone_path));
+}
+
+TEST_F(CtDetailDataLoadTest, FavoriteAndRingtoneWritesPersistAndAFailedWriteKeepsTheStore)
+{
+	int personId = addSimplePerson("Fav");
+	{
+		CtDetailData data(personId);
+		EXPECT_FALSE(data.isFavorite());
+		data.setFavorite(true);
+		data.setRingtone("/no/such/tone.ogg");
+		EXPECT_TRUE(data.isFavorite());
+	}
+	reopenStore();
+	{
+		contacts_record_h person = nullptr;
+		ASSERT_EQ(CONTACTS_ERROR_NONE, contacts_db_get_record(_contacts_person._uri, personId, &person));
+		bool favorite = false;
+		contacts_record_get_bool(person, _contacts_person.is_favorite, &favorite);
+		EXPECT_TRUE(favorite);
+		contacts_record_destroy(person, true);
+	}
+	EXPECT_EQ("/no/such/tone.ogg", personText(personId, _contacts_person.ringtone_path));
+
+	// Loading clears the dangling ringtone; then the disk fills up.
+	CtDetailData data(personId);
+	EXPECT_TRUE(data.isFavorite());
+	{
+		ct::db::ScopedWriteFailure full(1);
+		ct::log::clear();
+		data.setFavorite(false);
+		data.setRingtone("/other.ogg");
+	}
+	EXPECT_TRUE(data.isFavorite());
+	EXPECT_EQ(nullptr, data.getRingtonePath());
+	EXPECT_TRUE(ct::log::contains("contacts_db_update_record() Failed(-28)"));
+	reopenStore();
+	CtDetailData reread(personId);
+	EXPECT_TRUE(reread.isFavorite());
+	EXPECT_EQ(nullptr, reread.getRingtonePath());
+}
+
+TEST_F(CtDetailDataLoadTest, ReadOnlySocialAndSimModesFollowTheAddressBooks)
+{
+	int readOnly = addAddressbook("ro", CONTACTS_ADDRESS_BOOK_MODE_READONLY, 4, "Corp");
+	int social = addAddressbook("fb", CT_ADDRESSBOOK_MODE_SOCIAL, 5, "Facebook");
+	int sim = addAddressbook(CONTACTS_SIM1_ADDRESS_BOOK_NAME, 0, 0, CONTACTS_SIM1_ADDRESS_BOOK_NAME);
+
+	int roContact = store(newContact(readOnly, "Ro"));
+	{
+		CtDetailData data(personOf(roContact));
+		EXPECT_TRUE(data.getReadOnlyMode());
+		EXPECT_FALSE(data.getFacebookMode());
+		EXPECT_FALSE(data.isSimContact());
+	}
+	int fbContact = store(newContact(social, "Fb"));
+	{
+		CtDetailData data(personOf(fbContact));
+		EXPECT_TRUE(data.getFacebookMode());
+		EXPECT_EQ(nullptr, data.getContactsWithoutFacebook());
+	}
+	int phoneContact = store(newContact(0, "Ph"));
+	int linked = linkContacts({fbContact, phoneContact, roContact});
+	{
+		CtDetailData data(linked);
+		EXPECT_FALSE(data.getFacebookMode());
+		EXPECT_FALSE(data.getReadOnlyMode());
+		Eina_List* others = data.getContactsWithoutFacebook();
+		ASSERT_EQ(2u, eina_list_count(others));
+		int id = 0;
+		contacts_record_get_int(static_cast<contacts_record_h>(eina_list_data_get(others)), _contacts_contact.id, &id);
+		EXPECT_NE(fbContact, id);
+		ctCommonDestroyRecordList(others);
+	}
+	int simContact = store(newContact(sim, "Sim"));
+	{
+		CtDetailData data(personOf(simContact));
+		EXPECT_TRUE(data.isSimContact());
+	}
+}
+
+TEST_F(CtDetailDataLoadTest, GalEntryBuildsInMemoryRecordsAndStoresNothing)
+{
+	CtGalSearchData full = {nullptr, "/gal/pic.jpg", "Gail\nSmith", "100", "200", "300", "gail@corp.com", "Corp"};
+	{
+		CtDetailData data(&full);
+		EXPECT_EQ(-2, data.getPersonId());
+		EXPECT_STREQ("Gail Smith", data.getDisplayName());
+		EXPECT_STREQ("/gal/pic.jpg", data.getImageThumbnailPath());
+		EXPECT_STREQ("Corp", data.getCompany());
+		EXPECT_EQ((std::vector<std::string>{"100", "200", "300"}), numbersOf(data));
+		std::vector<int> types;
+		Eina_List* l = nullptr;
+		void* record = nullptr;
+		EINA_LIST_FOREACH(data.getNumberList(), l, record)
+			types.push_back(data.getDataType(static_cast<contacts_record_h>(record), _contacts_number.type));
+		EXPECT_EQ((std::vector<int>{4, 64, 2}), types);
+		ASSERT_EQ(1u, eina_list_count(data.getEmailList()));
+		contacts_record_h email = static_cast<contacts_record_h>(eina_list_data_get(data.getEmailList()));
+		EXPECT_STREQ("gail@corp.com", data.getEmail(email));
+		EXPECT_EQ(4, data.getDataType(email, _contacts_email.type));
+		EXPECT_FALSE(data.isCurrentPersonValid());
+	}
+	CtGalSearchData secondOnly = {nullptr, nullptr, nullptr, "", "200", nullptr, nullptr, nullptr};
+	{
+		CtDetailData data(&secondOnly);
+		ASSERT_EQ(1u, eina_list_count(data.getNumberList()));
+		contacts_record_h number = static_cast<contacts_record_h>(eina_list_data_get(data.getNumberList()));
+		EXPECT_EQ(64, data.getDataType(number, _contacts_number.type));
+		EXPECT_EQ(nullptr, data.getEmailList());
+		EXPECT_EQ(nullptr, data.getDisplayName());
+	}
+	CtGalSearchData broken = {nullptr, nullptr, "Bad\xff name", "\xfe\xff", "200", nullptr, "\xc3", "Co\xffrp"};
+	{
+		CtDetailData data(&broken);
+		EXPECT_EQ((std::vector<std::string>{"200"}), numbersOf(data));
+		EXPECT_EQ(nullptr, data.getEmailList());
+		ASSERT_NE(nullptr, data.getDisplayName());
+		EXPECT_TRUE(g_utf8_validate(data.getDisplayName(), -1, nullptr));
+		EXPECT_TRUE(g_utf8_validate(data.getCompany(), -1, nullptr));
+	}
+	CtGalSearchData empty = {};
+	CtDetailData blank(&empty);
+	EXPECT_EQ(nullptr, blank.getNumberList());
+	CtDetailData none(static_cast<const CtGalSearchData*>(nullptr));
+	EXPECT_EQ(-2, none.getPersonId());
+
+	int count = -1;
+	ASSERT_EQ(CONTACTS_ERROR_NONE, contacts_db_get_count(_contacts_contact._uri, &count));
+	EXPECT_EQ(0, count);
+}

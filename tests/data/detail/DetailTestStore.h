@@ -1,0 +1,158 @@
+// Builds persons in the contacts service for the detail-data tests: address
+// books, contacts with child records, linking, and a main-loop pump.
+#pragma once
+
+#include <Ecore.h>
+#include <contacts.h>
+#include <gtest/gtest.h>
+
+#include <initializer_list>
+#include <string>
+
+namespace ct::test {
+
+template <typename Pred>
+bool pumpUntil(Pred done, double seconds)
+{
+	double end = ecore_time_get() + seconds;
+	while (!done() && ecore_time_get() < end)
+		ecore_main_loop_iterate();
+	return done();
+}
+
+// Lets every pending change notification arrive.
+inline void settle(double seconds = 0.7)
+{
+	pumpUntil([] { return false; }, seconds);
+}
+
+inline int addAddressbook(const char* name, int mode, int accountId, const char* provider)
+{
+	contacts_record_h book = nullptr;
+	contacts_record_create(_contacts_address_book._uri, &book);
+	contacts_record_set_str(book, _contacts_address_book.name, name);
+	contacts_record_set_int(book, _contacts_address_book.mode, mode);
+	contacts_record_set_int(book, _contacts_address_book.account_id, accountId);
+	contacts_record_set_str(book, _contacts_address_book.provider_name, provider);
+	contacts_record_set_str(book, _contacts_address_book.user_name, "user@example.com");
+	int id = -1;
+	EXPECT_EQ(CONTACTS_ERROR_NONE, contacts_db_insert_record(book, &id));
+	contacts_record_destroy(book, true);
+	return id;
+}
+
+inline contacts_record_h addChild(contacts_record_h contact, unsigned int property, const char* uri)
+{
+	contacts_record_h child = nullptr;
+	contacts_record_create(uri, &child);
+	contacts_record_add_child_record(contact, property, child);
+	return child;
+}
+
+inline contacts_record_h newContact(int addressbookId, const char* firstName)
+{
+	contacts_record_h contact = nullptr;
+	contacts_record_create(_contacts_contact._uri, &contact);
+	contacts_record_set_int(contact, _contacts_contact.address_book_id, addressbookId);
+	contacts_record_set_int(contact, _contacts_contact.link_mode, CONTACTS_CONTACT_LINK_MODE_IGNORE_ONCE);
+	if (firstName) {
+		contacts_record_h name = addChild(contact, _contacts_contact.name, _contacts_name._uri);
+		contacts_record_set_str(name, _contacts_name.first, firstName);
+	}
+	return contact;
+}
+
+inline void addNumber(contacts_record_h contact, const char* number, int type, const char* label = nullptr)
+{
+	contacts_record_h child = addChild(contact, _contacts_contact.number, _contacts_number._uri);
+	contacts_record_set_str(child, _contacts_number.number, number);
+	contacts_record_set_int(child, _contacts_number.type, type);
+	if (label)
+		contacts_record_set_str(child, _contacts_number.label, label);
+}
+
+inline void addEmail(contacts_record_h contact, const char* email)
+{
+	contacts_record_h child = addChild(contact, _contacts_contact.email, _contacts_email._uri);
+	contacts_record_set_str(child, _contacts_email.email, email);
+	contacts_record_set_int(child, _contacts_email.type, CONTACTS_EMAIL_TYPE_HOME);
+}
+
+inline void addImage(contacts_record_h contact, const char* path, int order = 0)
+{
+	contacts_record_h child = addChild(contact, _contacts_contact.image, _contacts_image._uri);
+	contacts_record_set_str(child, _contacts_image.path, path);
+	contacts_record_set_int(child, _contacts_image_ex.order, order);
+}
+
+// Stores the contact (and destroys the handle); returns the new contact id.
+inline int store(contacts_record_h contact)
+{
+	int id = 0;
+	EXPECT_EQ(CONTACTS_ERROR_NONE, contacts_db_insert_record(contact, &id));
+	contacts_record_destroy(contact, true);
+	return id;
+}
+
+inline int personOf(int contactId)
+{
+	contacts_record_h contact = nullptr;
+	if (contacts_db_get_record(_contacts_contact._uri, contactId, &contact) != CONTACTS_ERROR_NONE)
+		return 0;
+	int personId = 0;
+	contacts_record_get_int(contact, _contacts_contact.person_id, &personId);
+	contacts_record_destroy(contact, true);
+	return personId;
+}
+
+// A person of one phone contact with just a name; returns the person id.
+inline int addSimplePerson(const char* firstName, int* contactId = nullptr)
+{
+	int id = store(newContact(0, firstName));
+	if (contactId)
+		*contactId = id;
+	return personOf(id);
+}
+
+// Links the persons of the contacts into the first one's person.
+inline int linkContacts(std::initializer_list<int> contactIds)
+{
+	int base = personOf(*contactIds.begin());
+	for (int id : contactIds) {
+		int person = personOf(id);
+		if (person != base) {
+			EXPECT_EQ(CONTACTS_ERROR_NONE, contacts_person_link_person(base, person));
+		}
+	}
+	return base;
+}
+
+inline void addNumberToStoredContact(int contactId, const char* number)
+{
+	contacts_record_h contact = nullptr;
+	ASSERT_EQ(CONTACTS_ERROR_NONE, contacts_db_get_record(_contacts_contact._uri, contactId, &contact));
+	addNumber(contact, number, CONTACTS_NUMBER_TYPE_CELL);
+	EXPECT_EQ(CONTACTS_ERROR_NONE, contacts_db_update_record(contact));
+	contacts_record_destroy(contact, true);
+}
+
+inline std::string personText(int personId, unsigned int property)
+{
+	contacts_record_h person = nullptr;
+	if (contacts_db_get_record(_contacts_person._uri, personId, &person) != CONTACTS_ERROR_NONE)
+		return "<no person>";
+	char* text = nullptr;
+	contacts_record_get_str_p(person, property, &text);
+	std::string out = text ? text : "<null>";
+	contacts_record_destroy(person, true);
+	return out;
+}
+
+// Reopens the database (last connection closes it), as a restart would.
+inline void reopenStore()
+{
+	contacts_disconnect();
+	ASSERT_EQ(CONTACTS_ERROR_NONE, contacts_connect());
+}
+
+} // namespace ct::test

@@ -1,0 +1,207 @@
+// Change versions, changes by version, and change callbacks on the main loop,
+// for writes of this process and of another one.
+#include "../contacts_db/ContactsTestSupport.h"
+
+#include <Ecore.h>
+
+#include <sys/wait.h>
+#include <unistd.h>
+
+#include <set>
+
+using namespace ct::test;
+
+namespace {
+
+struct Change {
+	int contactId;
+	int type;
+	int version;
+};
+
+std::vector<Change> changesSince(int version, int book = -1, int* current = nullptr)
+{
+	contacts_list_h list = nullptr;
+	int now = 0;
+	EXPECT_EQ(CONTACTS_ERROR_NONE,
+		contacts_db_get_changes_by_version(_contacts_contact_updated_info._uri, book, version, &list, &now));
+	ListPtr owner(list);
+	if (current)
+		*current = now;
+	std::vector<Change> out;
+	int count = 0;
+	contacts_list_get_count(list, &count);
+	for (int i = 0; i < count; ++i) {
+		contacts_record_h r = nullptr;
+		contacts_list_get_current_record_p(list, &r);
+		out.push_back({ intOf(r, _contacts_contact_updated_info.contact_id), intOf(r, _contacts_contact_updated_info.type),
+			intOf(r, _contacts_contact_updated_info.version) });
+		contacts_list_next(list);
+	}
+	return out;
+}
+
+struct Recorder {
+	std::vector<std::string> uris;
+	static void cb(const char* uri, void* data) { static_cast<Recorder*>(data)->uris.push_back(uri); }
+};
+
+class EcoreScope {
+public:
+	EcoreScope() { ecore_init(); }
+	~EcoreScope() { ecore_shutdown(); }
+};
+
+// Pumps the main loop until pred() or the timeout.
+template <typename Pred>
+bool pumpUntil(Pred pred, double seconds)
+{
+	double end = ecore_time_get() + seconds;
+	while (!pred() && ecore_time_get() < end) {
+		ecore_main_loop_iterate();
+		usleep(1000);
+	}
+	return pred();
+}
+
+} // namespace
+
+TEST(Changes, EveryWriteGetsItsOwnVersionAndIsListedByVersion)
+{
+	ConnectedStore store;
+	int v0 = 0;
+	contacts_db_get_current_version(&v0);
+	int a = insertContact({ "A", "" });
+	int b = insertContact({ "B", "" });
+	RecordPtr ra = getRecord(_contacts_contact._uri, a);
+	contacts_db_update_record(ra.get());
+	contacts_db_delete_record(_contacts_contact._uri, b);
+	int current = 0;
+	std::vector<Change> changes = changesSince(v0, -1, &current);
+	ASSERT_EQ(4u, changes.size());
+	EXPECT_EQ(a, changes[0].contactId);
+	EXPECT_EQ(CONTACTS_CHANGE_INSERTED, changes[0].type);
+	EXPECT_EQ(CONTACTS_CHANGE_UPDATED, changes[2].type);
+	EXPECT_EQ(b, changes[3].contactId);
+	EXPECT_EQ(CONTACTS_CHANGE_DELETED, changes[3].type);
+	EXPECT_EQ(2, static_cast<int>(CONTACTS_CHANGE_DELETED));
+	EXPECT_EQ(v0 + 4, current);
+	EXPECT_EQ(current, changes[3].version);
+	int last = 0;
+	contacts_db_get_last_change_version(&last);
+	EXPECT_EQ(current, last);
+	EXPECT_EQ(1u, changesSince(current - 1).size());
+	EXPECT_TRUE(changesSince(0, 77).empty());
+
+	// Many writes, no version lost or shared.
+	for (int i = 0; i < 200; ++i)
+		insertContact({ "N" + std::to_string(i), "" });
+	std::set<int> versions;
+	for (const Change& c : changesSince(current))
+		versions.insert(c.version);
+	EXPECT_EQ(200u, versions.size());
+	store.reopen();
+	int afterReopen = 0;
+	contacts_db_get_current_version(&afterReopen);
+	EXPECT_EQ(current + 200, afterReopen);
+
+	contacts_list_h list = nullptr;
+	int now = 0;
+	EXPECT_EQ(CONTACTS_ERROR_INVALID_PARAMETER,
+		contacts_db_get_changes_by_version(_contacts_person._uri, -1, 0, &list, &now));
+	EXPECT_EQ(CONTACTS_ERROR_INVALID_PARAMETER,
+		contacts_db_get_changes_by_version(_contacts_contact_updated_info._uri, -1, -5, &list, &now));
+}
+
+TEST(Changes, OwnWritesReachCallbacksOnTheNextMainLoopIterationOncePerView)
+{
+	EcoreScope ecore;
+	ConnectedStore store;
+	Recorder person, contact, group;
+	ASSERT_EQ(CONTACTS_ERROR_NONE, contacts_db_add_changed_cb(_contacts_person._uri, Recorder::cb, &person));
+	ASSERT_EQ(CONTACTS_ERROR_NONE, contacts_db_add_changed_cb(_contacts_contact._uri, Recorder::cb, &contact));
+	ASSERT_EQ(CONTACTS_ERROR_NONE, contacts_db_add_changed_cb(_contacts_group._uri, Recorder::cb, &group));
+	EXPECT_EQ(CONTACTS_ERROR_INVALID_PARAMETER, contacts_db_add_changed_cb("bad", Recorder::cb, &group));
+	EXPECT_EQ(CONTACTS_ERROR_INVALID_PARAMETER, contacts_db_add_changed_cb(_contacts_person._uri, nullptr, &group));
+
+	insertContact({ "A", "" });
+	EXPECT_TRUE(person.uris.empty()); // never inside the write
+	ecore_main_loop_iterate();
+	ASSERT_EQ(1u, person.uris.size());
+	EXPECT_EQ(_contacts_person._uri, person.uris[0]);
+	EXPECT_EQ(1u, contact.uris.size());
+	EXPECT_TRUE(group.uris.empty());
+
+	ASSERT_EQ(CONTACTS_ERROR_NONE, contacts_db_remove_changed_cb(_contacts_person._uri, Recorder::cb, &person));
+	EXPECT_EQ(CONTACTS_ERROR_INVALID_PARAMETER, contacts_db_remove_changed_cb(_contacts_person._uri, Recorder::cb, &person));
+	insertContact({ "B", "" });
+	ecore_main_loop_iterate();
+	EXPECT_EQ(1u, person.uris.size());
+	EXPECT_EQ(2u, contact.uris.size());
+	contacts_db_remove_changed_cb(_contacts_contact._uri, Recorder::cb, &contact);
+	contacts_db_remove_changed_cb(_contacts_group._uri, Recorder::cb, &group);
+}
+
+namespace {
+
+struct Disconnector {
+	int calls = 0;
+	static void cb(const char*, void* data)
+	{
+		auto* self = static_cast<Disconnector*>(data);
+		++self->calls;
+		contacts_db_remove_changed_cb(_contacts_person._uri, cb, data);
+		contacts_disconnect();
+	}
+};
+
+} // namespace
+
+TEST(Changes, ACallbackMayUnregisterAndDisconnect)
+{
+	EcoreScope ecore;
+	TempDataDir dir;
+	ASSERT_EQ(CONTACTS_ERROR_NONE, contacts_connect());
+	Disconnector d;
+	contacts_db_add_changed_cb(_contacts_person._uri, Disconnector::cb, &d);
+	insertContact({ "A", "" });
+	ecore_main_loop_iterate();
+	EXPECT_EQ(1, d.calls);
+	int version = 0;
+	EXPECT_EQ(CONTACTS_ERROR_DB, contacts_db_get_current_version(&version));
+}
+
+TEST(Changes, AnotherProcessWriteReachesCallbacksWithinHalfASecond)
+{
+	EcoreScope ecore;
+	ConnectedStore store;
+	Recorder person;
+	contacts_db_add_changed_cb(_contacts_person._uri, Recorder::cb, &person);
+	int v0 = 0;
+	contacts_db_get_current_version(&v0);
+
+	pid_t child = fork();
+	ASSERT_GE(child, 0);
+	if (child == 0) {
+		// The child has its own connection to the same file.
+		int rc = contacts_connect();
+		contacts_record_h c = nullptr;
+		contacts_record_create(_contacts_contact._uri, &c);
+		contacts_record_h name = nullptr;
+		contacts_record_create(_contacts_name._uri, &name);
+		contacts_record_set_str(name, _contacts_name.first, "FromChild");
+		contacts_record_add_child_record(c, _contacts_contact.name, name);
+		if (rc == CONTACTS_ERROR_NONE)
+			rc = contacts_db_insert_record(c, nullptr);
+		_exit(rc == CONTACTS_ERROR_NONE ? 0 : 1);
+	}
+	int status = 0;
+	waitpid(child, &status, 0);
+	ASSERT_TRUE(WIFEXITED(status));
+	ASSERT_EQ(0, WEXITSTATUS(status));
+	EXPECT_TRUE(pumpUntil([&]() { return !person.uris.empty(); }, 5.0));
+	std::vector<Change> changes = changesSince(v0);
+	ASSERT_EQ(1u, changes.size());
+	EXPECT_EQ(CONTACTS_CHANGE_INSERTED, changes[0].type);
+	contacts_db_remove_changed_cb(_contacts_person._uri, Recorder::cb, &person);
+}

@@ -1,0 +1,96 @@
+// A write that fails at any point (disk full) leaves the database as it was.
+#include "ContactsTestSupport.h"
+#include "SqliteFaultInjector.h"
+
+#include <functional>
+
+using namespace ct::test;
+
+namespace {
+
+// Every row of every table, read through a second connection.
+std::string dump(const std::string& path)
+{
+	ct::db::Database db;
+	EXPECT_EQ(SQLITE_OK, db.open(path, ct::db::OpenMode::ReadOnly));
+	std::string out;
+	std::vector<std::string> tables;
+	auto st = db.prepare("SELECT name FROM sqlite_master WHERE type = 'table' ORDER BY name");
+	while (st.step() == SQLITE_ROW)
+		tables.push_back(st.columnText(0));
+	for (const std::string& t : tables) {
+		auto rows = db.prepare(("SELECT * FROM \"" + t + "\"").c_str());
+		out += "[" + t + "]\n";
+		while (rows.step() == SQLITE_ROW) {
+			for (int c = 0; c < sqlite3_column_count(rows.handle()); ++c)
+				out += rows.columnText(c) + "|";
+			out += "\n";
+		}
+	}
+	return out;
+}
+
+// Runs op with the Nth write failing, for N = 1, 2, ... until op succeeds;
+// every failed run must leave the database exactly as it was.
+void expectAtomic(const ConnectedStore& store, const std::function<int()>& op)
+{
+	std::string path = store.dir().file("contacts.db");
+	std::string before = dump(path);
+	for (int n = 1; n < 400; ++n) {
+		int err;
+		{
+			ct::db::ScopedWriteFailure failure(n);
+			err = op();
+		}
+		if (err == CONTACTS_ERROR_NONE) {
+			EXPECT_NE(before, dump(path)) << "succeeded without writing at n=" << n;
+			return;
+		}
+		EXPECT_EQ(CONTACTS_ERROR_FILE_NO_SPACE, err) << "n=" << n;
+		ASSERT_EQ(before, dump(path)) << "partial write at n=" << n;
+	}
+	FAIL() << "the write never succeeded";
+}
+
+RecordPtr bigContact()
+{
+	RecordPtr contact = makeContact({ "Big", "Contact", { "1", "2", "3", "4", "5", "6" }, { "a@b", "c@d", "e@f" } });
+	for (int i = 0; i < 10; ++i) {
+		contacts_record_h url = addChild(contact.get(), _contacts_contact.url, _contacts_url._uri);
+		contacts_record_set_str(url, _contacts_url.url, ("http://x/" + std::to_string(i)).c_str());
+	}
+	return contact;
+}
+
+} // namespace
+
+TEST(Atomicity, InsertUpdateDeleteAndLinkLoseNothingWhenTheDiskFills)
+{
+	ConnectedStore store;
+	int keep = insertContact({ "Keep", "Me", { "42" } });
+
+	RecordPtr contact = bigContact();
+	expectAtomic(store, [&]() { return contacts_db_insert_record(contact.get(), nullptr); });
+	int id = intOf(contact.get(), _contacts_contact.id);
+	ASSERT_GT(id, 0);
+
+	RecordPtr stored = getRecord(_contacts_contact._uri, id);
+	contacts_record_h number = nullptr;
+	contacts_record_get_child_record_at_p(stored.get(), _contacts_contact.number, 0, &number);
+	contacts_record_set_str(number, _contacts_number.number, "changed");
+	contacts_record_get_child_record_at_p(stored.get(), _contacts_contact.number, 1, &number);
+	contacts_record_remove_child_record(stored.get(), _contacts_contact.number, number);
+	contacts_record_destroy(number, true);
+	contacts_record_h added = addChild(stored.get(), _contacts_contact.email, _contacts_email._uri);
+	contacts_record_set_str(added, _contacts_email.email, "new@x");
+	expectAtomic(store, [&]() { return contacts_db_update_record(stored.get()); });
+	RecordPtr reread = getRecord(_contacts_contact._uri, id);
+	EXPECT_EQ(5, childCount(reread.get(), _contacts_contact.number));
+	EXPECT_EQ(4, childCount(reread.get(), _contacts_contact.email));
+
+	int base = personOf(keep);
+	expectAtomic(store, [&]() { return contacts_person_link_person(base, personOf(id)); });
+	expectAtomic(store, [&]() { return contacts_utils_set_ringtone_info(1, id, "/r.ogg", 1, 30); });
+	expectAtomic(store, [&]() { return contacts_db_delete_record(_contacts_person._uri, base); });
+	EXPECT_EQ(0, countOf(_contacts_contact._uri));
+}

@@ -1,0 +1,111 @@
+// SIM cards: readiness from the power key, field limits, capacity, writes.
+#include "../contacts_db/ContactsTestSupport.h"
+
+#include "vconf.h"
+
+#include <fstream>
+
+using namespace ct::test;
+
+namespace {
+
+int simBook(int slot)
+{
+	contacts_query_h q = nullptr;
+	contacts_filter_h f = nullptr;
+	contacts_query_create(_contacts_address_book._uri, &q);
+	contacts_filter_create(_contacts_address_book._uri, &f);
+	contacts_filter_add_str(f, _contacts_address_book.name, CONTACTS_MATCH_EXACTLY, slot == 0 ? "SIM1" : "SIM2");
+	contacts_query_set_filter(q, f);
+	std::vector<int> ids = queryIds(q, _contacts_address_book.id);
+	contacts_filter_destroy(f);
+	contacts_query_destroy(q);
+	return ids.empty() ? -1 : ids[0];
+}
+
+} // namespace
+
+TEST(Sim, DefaultSimTakesNamesNumbersAndEmailsWithinItsLimits)
+{
+	ConnectedStore store;
+	vconf_set_int(VCONFKEY_TELEPHONY_SIM_POWER_STATE1, 1);
+	bool ready = false;
+	ASSERT_EQ(CONTACTS_ERROR_NONE, contacts_sim_is_ready(0, &ready));
+	EXPECT_TRUE(ready);
+	EXPECT_EQ(CONTACTS_ERROR_NONE, contacts_sim_is_ready(1, &ready));
+	EXPECT_FALSE(ready);
+	EXPECT_EQ(CONTACTS_ERROR_INVALID_PARAMETER, contacts_sim_is_ready(2, &ready));
+	int len = 0;
+	contacts_sim_get_field_text_max_len(0, CONTACTS_SIM_FIELD_NAME, &len);
+	EXPECT_EQ(14, len);
+	contacts_sim_get_field_text_max_len(0, CONTACTS_SIM_FIELD_NUMBER, &len);
+	EXPECT_EQ(20, len);
+	bool supported = false;
+	contacts_sim_get_field_status(0, CONTACTS_SIM_FIELD_EMAIL, &supported);
+	EXPECT_TRUE(supported);
+	int unused = 0;
+	contacts_sim_get_unused_field_count(0, CONTACTS_SIM_FIELD_NAME, &unused);
+	EXPECT_EQ(250, unused);
+
+	int book = simBook(0);
+	ASSERT_GT(book, 0);
+	RecordPtr contact = makeContact({ "Simone", "", { "0101", "0202" }, { "s@x" }, book });
+	int id = 0;
+	ASSERT_EQ(CONTACTS_ERROR_NONE, contacts_sim_insert(contact.get(), &id));
+	store.reopen();
+	RecordPtr read = getRecord(_contacts_contact._uri, id);
+	EXPECT_EQ(1, childCount(read.get(), _contacts_contact.number)); // a SIM keeps one number
+	EXPECT_EQ(1, childCount(read.get(), _contacts_contact.email));
+	contacts_sim_get_unused_field_count(0, CONTACTS_SIM_FIELD_NAME, &unused);
+	EXPECT_EQ(249, unused);
+
+	RecordPtr tooLong = makeContact({ "A name far too long for a SIM", "", {}, {}, book });
+	EXPECT_EQ(CONTACTS_ERROR_INVALID_PARAMETER, contacts_sim_insert(tooLong.get(), &id));
+	RecordPtr phoneBook = makeContact({ "Phone", "", {}, {}, 0 });
+	EXPECT_EQ(CONTACTS_ERROR_INVALID_PARAMETER, contacts_sim_insert(phoneBook.get(), &id));
+
+	contacts_record_h name = nullptr;
+	contacts_record_get_child_record_at_p(read.get(), _contacts_contact.name, 0, &name);
+	contacts_record_set_str(name, _contacts_name.first, "Simon");
+	ASSERT_EQ(CONTACTS_ERROR_NONE, contacts_sim_update(read.get()));
+	EXPECT_EQ("Simon", strOf(getRecord(_contacts_contact._uri, id).get(), _contacts_contact.display_name));
+
+	vconf_set_int(VCONFKEY_TELEPHONY_SIM_POWER_STATE1, 0);
+	contacts_sim_is_ready(0, &ready);
+	EXPECT_FALSE(ready);
+	RecordPtr whileOff = makeContact({ "Off", "", {}, {}, book });
+	EXPECT_EQ(CONTACTS_ERROR_NOT_SUPPORTED, contacts_sim_insert(whileOff.get(), &id));
+	vconf_set_int(VCONFKEY_TELEPHONY_SIM_POWER_STATE1, 1);
+
+	int person = personOf(intOf(read.get(), _contacts_contact.id));
+	ASSERT_EQ(CONTACTS_ERROR_NONE, contacts_sim_delete(person));
+	EXPECT_EQ(CONTACTS_ERROR_NO_DATA, contacts_sim_delete(person));
+	EXPECT_EQ(CONTACTS_ERROR_INVALID_PARAMETER, contacts_sim_delete(-1));
+}
+
+TEST(Sim, ConfiguredSimsHaveTheirOwnCapacityAndLimits)
+{
+	TempDataDir dir;
+	std::ofstream(dir.file("sim.conf")) << "[SIM1]\ncapacity=1\nname_max=5\nemail_max=0\n[SIM2]\ncapacity=3\n";
+	ASSERT_EQ(CONTACTS_ERROR_NONE, contacts_connect());
+	int book1 = simBook(0), book2 = simBook(1);
+	EXPECT_GT(book1, 0);
+	EXPECT_GT(book2, 0);
+	bool supported = true;
+	contacts_sim_get_field_status(0, CONTACTS_SIM_FIELD_EMAIL, &supported);
+	EXPECT_FALSE(supported);
+	int len = 0;
+	contacts_sim_get_field_text_max_len(0, CONTACTS_SIM_FIELD_NAME, &len);
+	EXPECT_EQ(5, len);
+	RecordPtr one = makeContact({ "One", "", { "1" }, {}, book1 });
+	EXPECT_EQ(CONTACTS_ERROR_NONE, contacts_sim_insert(one.get(), nullptr));
+	RecordPtr two = makeContact({ "Two", "", { "2" }, {}, book1 });
+	EXPECT_EQ(CONTACTS_ERROR_FILE_NO_SPACE, contacts_sim_insert(two.get(), nullptr));
+	RecordPtr multiByte = makeContact({ "ÄÖÜäö", "", {}, {}, book1 });
+	int unused = -1;
+	contacts_sim_get_unused_field_count(0, CONTACTS_SIM_FIELD_NAME, &unused);
+	EXPECT_EQ(0, unused);
+	RecordPtr onSecond = makeContact({ "Zwei", "", {}, {}, book2 });
+	EXPECT_EQ(CONTACTS_ERROR_NONE, contacts_sim_insert(onSecond.get(), nullptr));
+	contacts_disconnect();
+}

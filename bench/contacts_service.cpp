@@ -139,7 +139,8 @@ void searchBare(benchmark::State& state, const char* text)
 }
 
 void BM_SearchContains_Service_Common(benchmark::State& s) { searchService(s, "ann"); }
-void BM_SearchContains_Service_Rare(benchmark::State& s) { searchService(s, "Тре"); }
+void BM_SearchContains_Service_Rare(benchmark::State& s) { searchService(s, "na Smi"); }
+void BM_SearchContains_Service_Cyrillic(benchmark::State& s) { searchService(s, "етр"); }
 void BM_SearchContains_Service_None(benchmark::State& s) { searchService(s, "qxz"); }
 void BM_SearchContains_Service_Short(benchmark::State& s) { searchService(s, "an"); }
 void BM_SearchContains_Bare_Common(benchmark::State& s) { searchBare(s, "ann"); }
@@ -305,6 +306,7 @@ CT_MEDIAN(BM_LoadPerson_BareSqlite);
 CT_MEDIAN(BM_SearchContains_Service_Common);
 CT_MEDIAN(BM_SearchContains_Service_Rare);
 CT_MEDIAN(BM_SearchContains_Service_None);
+CT_MEDIAN(BM_SearchContains_Service_Cyrillic);
 CT_MEDIAN(BM_SearchContains_Service_Short);
 CT_MEDIAN(BM_SearchContains_Bare_Common);
 CT_MEDIAN(BM_SearchContains_Bare_None);

@@ -2,6 +2,7 @@
 #include "ContactsConnection.h"
 #include "ContactsDebug.h"
 #include "ContactsList.h"
+#include "ContactsRawValue.h"
 #include "ContactsReader.h"
 #include "ContactsWriter.h"
 #include "contacts_db.h"
@@ -10,6 +11,7 @@
 #include "contacts_service.h"
 
 #include <cstdlib>
+#include <cstring>
 #include <memory>
 
 using namespace ct::contacts;
@@ -228,7 +230,8 @@ int contacts_person_unlink_contact(int person_id, int contact_id, int* unlinked_
 int contacts_person_set_default_property(contacts_person_property_e property, int person_id, int id)
 {
 	WPRET_VM(person_id <= 0 || id <= 0, CONTACTS_ERROR_INVALID_PARAMETER, "Invalid param : %d, %d", person_id, id);
-	return write([&](ContactsWriter& w) { return w.setDefaultProperty(property, person_id, id); });
+	int kind = rawValue(property);
+	return write([&](ContactsWriter& w) { return w.setDefaultProperty(kind, person_id, id); });
 }
 
 int contacts_person_get_default_property(contacts_person_property_e property, int person_id, int* id)
@@ -238,7 +241,7 @@ int contacts_person_get_default_property(contacts_person_property_e property, in
 	WPRET_VM(person_id <= 0, CONTACTS_ERROR_INVALID_PARAMETER, "Invalid param : person %d", person_id);
 	CT_CONNECTION_OR_RETURN(conn);
 	const char* sql = nullptr;
-	switch (property) {
+	switch (rawValue(property)) {
 	case CONTACTS_PERSON_PROPERTY_NAME_CONTACT: sql = "SELECT display_contact_id FROM persons WHERE id = ?"; break;
 	case CONTACTS_PERSON_PROPERTY_IMAGE: sql = "SELECT image_id FROM persons WHERE id = ?"; break;
 	case CONTACTS_PERSON_PROPERTY_NUMBER:
@@ -250,7 +253,7 @@ int contacts_person_get_default_property(contacts_person_property_e property, in
 		      "AND t.owner = 0 ORDER BY t.is_default DESC, t.id LIMIT 1";
 		break;
 	default:
-		WERROR("Invalid param : property %d", property);
+		WERROR("Invalid param : property %d", rawValue(property));
 		return CONTACTS_ERROR_INVALID_PARAMETER;
 	}
 	if (!ContactsReader(*conn).exists(*ContactsSchema::view("contacts.view.person"), person_id))
@@ -299,13 +302,14 @@ int contacts_setting_get_name_display_order(contacts_name_display_order_e* name_
 
 int contacts_setting_set_name_display_order(contacts_name_display_order_e order)
 {
-	WPRET_VM(order != CONTACTS_NAME_DISPLAY_ORDER_FIRSTLAST && order != CONTACTS_NAME_DISPLAY_ORDER_LASTFIRST,
-		CONTACTS_ERROR_INVALID_PARAMETER, "Invalid param : order %d", order);
+	int value = rawValue(order);
+	WPRET_VM(value != CONTACTS_NAME_DISPLAY_ORDER_FIRSTLAST && value != CONTACTS_NAME_DISPLAY_ORDER_LASTFIRST,
+		CONTACTS_ERROR_INVALID_PARAMETER, "Invalid param : order %d", value);
 	CT_CONNECTION_OR_RETURN(conn);
 	return conn->write([&](WriteContext& ctx) {
 		{
 			CachedStatement st(conn->statement("UPDATE meta SET value = ? WHERE key = 'name_display_order'"));
-			int rc = st->bind(1, static_cast<int>(order)).run();
+			int rc = st->bind(1, value).run();
 			if (rc != SQLITE_DONE)
 				return conn->failed("setting", rc);
 		}

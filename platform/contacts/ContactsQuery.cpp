@@ -1,6 +1,7 @@
 #include "ContactsQuery.h"
 
 #include "ContactsDebug.h"
+#include "ContactsRawValue.h"
 #include "contacts_query.h"
 #include "contacts_views.h"
 
@@ -42,6 +43,17 @@ std::string quoted(const char* identifier)
 	return std::string("\"") + identifier + "\"";
 }
 
+std::string ftsPhrase(const std::string& text)
+{
+	std::string out = "\"";
+	for (char c : text) {
+		if (c == '"')
+			out += '"';
+		out += c;
+	}
+	return out + "\"";
+}
+
 } // namespace ct::contacts
 
 namespace {
@@ -54,29 +66,20 @@ SqlParam textParam(const std::string& text)
 	return p;
 }
 
-// The FTS5 phrase that matches `text` literally.
-std::string ftsPhrase(const std::string& text)
-{
-	std::string out = "\"";
-	for (char c : text) {
-		if (c == '"')
-			out += '"';
-		out += c;
-	}
-	return out + "\"";
-}
-
 // Trigram index lookup for "person display name contains", which narrows the
-// rows before the exact test; texts under 3 characters cannot use it.
+// rows before the exact test. Texts under 3 characters cannot use it; very
+// long ones would build huge index queries and are tested by scanning.
+constexpr size_t kMaxIndexedSearchBytes = 256;
+
 bool usesTrigramIndex(const contacts_filter_s::Item& item, const ViewInfo& view)
 {
 	return item.match == CONTACTS_MATCH_CONTAINS && view.number == (_contacts_person.id >> 16)
 		&& item.propertyId == _contacts_person.display_name
-		&& g_utf8_strlen(item.value.text.c_str(), -1) >= 3;
+		&& g_utf8_strlen(item.value.text.c_str(), -1) >= 3 && item.value.text.size() <= kMaxIndexedSearchBytes;
 }
 
 void stringCondition(const contacts_filter_s::Item& item, const ViewInfo& view, const std::string& col,
-	std::string& sql, std::vector<SqlParam>& params)
+	std::string& sql, std::vector<SqlParam>& params, const contacts_filter_s::IndexChoice& useIndex)
 {
 	const std::string& v = item.value.text;
 	switch (item.match) {
@@ -89,9 +92,9 @@ void stringCondition(const contacts_filter_s::Item& item, const ViewInfo& view, 
 		params.push_back(textParam(v));
 		break;
 	case CONTACTS_MATCH_CONTAINS:
-		if (usesTrigramIndex(item, view)) {
+		if (usesTrigramIndex(item, view) && (!useIndex || useIndex(v))) {
 			sql += "\"id\" IN (SELECT rowid FROM persons_fts WHERE persons_fts MATCH ?) AND ";
-			params.push_back(textParam(ftsPhrase(v)));
+			params.push_back(textParam(ct::contacts::ftsPhrase(v)));
 		}
 		sql += "instr(lower(" + col + "), lower(?)) > 0";
 		params.push_back(textParam(v));
@@ -126,12 +129,12 @@ const char* comparison(int match)
 }
 
 void condition(const contacts_filter_s::Item& item, const ViewInfo& view, std::string& sql,
-	std::vector<SqlParam>& params)
+	std::vector<SqlParam>& params, const contacts_filter_s::IndexChoice& useIndex)
 {
 	const PropertyInfo* p = view.find(item.propertyId);
 	std::string col = ct::contacts::quoted(p->name);
 	if (item.type == PropType::Str) {
-		stringCondition(item, view, col, sql, params);
+		stringCondition(item, view, col, sql, params, useIndex);
 	} else if (item.type != PropType::Bool && item.match == CONTACTS_MATCH_NONE) {
 		sql += col + " IS NULL";
 	} else {
@@ -179,7 +182,7 @@ SqlParam intParam(int64_t v)
 
 } // namespace
 
-int contacts_filter_s::toSql(std::string& sql, std::vector<SqlParam>& params) const
+int contacts_filter_s::toSql(std::string& sql, std::vector<SqlParam>& params, const IndexChoice& useIndex) const
 {
 	WPRET_VM(items.empty(), CONTACTS_ERROR_INVALID_PARAMETER, "empty filter");
 	WPRET_VM(items.back().kind == Item::Kind::Operator, CONTACTS_ERROR_INVALID_PARAMETER,
@@ -189,12 +192,12 @@ int contacts_filter_s::toSql(std::string& sql, std::vector<SqlParam>& params) co
 		if (item.kind == Item::Kind::Operator) {
 			sql += item.op == CONTACTS_FILTER_OPERATOR_AND ? " AND " : " OR ";
 		} else if (item.kind == Item::Kind::Filter) {
-			int err = item.filter->toSql(sql, params);
+			int err = item.filter->toSql(sql, params, useIndex);
 			if (err != CONTACTS_ERROR_NONE)
 				return err;
 		} else {
 			sql += "(";
-			condition(item, *view, sql, params);
+			condition(item, *view, sql, params, useIndex);
 			sql += ")";
 		}
 	}
@@ -227,9 +230,10 @@ int contacts_filter_destroy(contacts_filter_h filter)
 int contacts_filter_add_str(contacts_filter_h filter, unsigned int property_id, contacts_match_str_flag_e match,
 	const char* match_value)
 {
-	WPRET_VM(match < CONTACTS_MATCH_EXACTLY || match > CONTACTS_MATCH_EXISTS, CONTACTS_ERROR_INVALID_PARAMETER,
-		"Invalid param : match %d", match);
-	WPRET_VM(!match_value && match != CONTACTS_MATCH_EXISTS, CONTACTS_ERROR_INVALID_PARAMETER,
+	int m = ct::contacts::rawValue(match);
+	WPRET_VM(m < CONTACTS_MATCH_EXACTLY || m > CONTACTS_MATCH_EXISTS, CONTACTS_ERROR_INVALID_PARAMETER,
+		"Invalid param : match %d", m);
+	WPRET_VM(!match_value && m != CONTACTS_MATCH_EXISTS, CONTACTS_ERROR_INVALID_PARAMETER,
 		"Invalid param : match_value");
 	WPRET_VM(match_value && !g_utf8_validate(match_value, -1, nullptr), CONTACTS_ERROR_INVALID_PARAMETER,
 		"match_value is not valid UTF-8");
@@ -237,7 +241,7 @@ int contacts_filter_add_str(contacts_filter_h filter, unsigned int property_id, 
 	auto* item = newCondition(filter, property_id, PropType::Str, err);
 	if (!item)
 		return err;
-	item->match = match;
+	item->match = m;
 	item->value = textParam(match_value ? match_value : "");
 	return CONTACTS_ERROR_NONE;
 }
@@ -245,13 +249,13 @@ int contacts_filter_add_str(contacts_filter_h filter, unsigned int property_id, 
 int contacts_filter_add_int(contacts_filter_h filter, unsigned int property_id, contacts_match_int_flag_e match,
 	int match_value)
 {
-	return addNumberCondition(filter, property_id, PropType::Int, match, intParam(match_value));
+	return addNumberCondition(filter, property_id, PropType::Int, ct::contacts::rawValue(match), intParam(match_value));
 }
 
 int contacts_filter_add_lli(contacts_filter_h filter, unsigned int property_id, contacts_match_int_flag_e match,
 	long long int match_value)
 {
-	return addNumberCondition(filter, property_id, PropType::Lli, match, intParam(match_value));
+	return addNumberCondition(filter, property_id, PropType::Lli, ct::contacts::rawValue(match), intParam(match_value));
 }
 
 int contacts_filter_add_double(contacts_filter_h filter, unsigned int property_id, contacts_match_int_flag_e match,
@@ -260,7 +264,7 @@ int contacts_filter_add_double(contacts_filter_h filter, unsigned int property_i
 	SqlParam p;
 	p.kind = SqlParam::Kind::Double;
 	p.d = match_value;
-	return addNumberCondition(filter, property_id, PropType::Double, match, p);
+	return addNumberCondition(filter, property_id, PropType::Double, ct::contacts::rawValue(match), p);
 }
 
 int contacts_filter_add_bool(contacts_filter_h filter, unsigned int property_id, bool match_value)
@@ -271,13 +275,14 @@ int contacts_filter_add_bool(contacts_filter_h filter, unsigned int property_id,
 int contacts_filter_add_operator(contacts_filter_h filter, contacts_filter_operator_e operator_type)
 {
 	WPRET_VM(!filter, CONTACTS_ERROR_INVALID_PARAMETER, "Invalid param : filter");
-	WPRET_VM(operator_type != CONTACTS_FILTER_OPERATOR_AND && operator_type != CONTACTS_FILTER_OPERATOR_OR,
-		CONTACTS_ERROR_INVALID_PARAMETER, "Invalid param : operator %d", operator_type);
+	int op = ct::contacts::rawValue(operator_type);
+	WPRET_VM(op != CONTACTS_FILTER_OPERATOR_AND && op != CONTACTS_FILTER_OPERATOR_OR,
+		CONTACTS_ERROR_INVALID_PARAMETER, "Invalid param : operator %d", op);
 	WPRET_VM(filter->items.empty() || filter->items.back().kind == contacts_filter_s::Item::Kind::Operator,
 		CONTACTS_ERROR_INVALID_PARAMETER, "an operator must follow a condition");
 	filter->items.emplace_back();
 	filter->items.back().kind = contacts_filter_s::Item::Kind::Operator;
-	filter->items.back().op = operator_type;
+	filter->items.back().op = op == CONTACTS_FILTER_OPERATOR_AND ? CONTACTS_FILTER_OPERATOR_AND : CONTACTS_FILTER_OPERATOR_OR;
 	return CONTACTS_ERROR_NONE;
 }
 

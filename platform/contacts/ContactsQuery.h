@@ -7,6 +7,7 @@
 #include "contacts_types.h"
 
 #include <cstdint>
+#include <functional>
 #include <memory>
 #include <string>
 #include <utility>
@@ -28,6 +29,9 @@ void bindParams(db::Statement& st, const std::vector<SqlParam>& params);
 // Quotes an identifier for SQL ("name").
 std::string quoted(const char* identifier);
 
+// The full-text phrase that matches `text` literally.
+std::string ftsPhrase(const std::string& text);
+
 } // namespace ct::contacts
 
 struct contacts_filter_s {
@@ -44,9 +48,14 @@ struct contacts_filter_s {
 	const ct::contacts::ViewInfo* view = nullptr;
 	std::vector<Item> items;
 
+	// Whether a "display name contains" text should go through the trigram
+	// index; null means whenever the text allows it.
+	using IndexChoice = std::function<bool(const std::string& text)>;
+
 	// Appends "(...)" for this filter to sql; CONTACTS_ERROR_INVALID_PARAMETER
 	// when the filter is empty or ends with an operator.
-	int toSql(std::string& sql, std::vector<ct::contacts::SqlParam>& params) const;
+	int toSql(std::string& sql, std::vector<ct::contacts::SqlParam>& params, const IndexChoice& useIndex = nullptr) const;
+
 };
 
 struct contacts_query_s {

@@ -56,7 +56,7 @@ int ContactsReader::loadChildren(contacts_record_s& record, int ownerId, int own
 		if (p.type != PropType::Record)
 			continue;
 		const ViewInfo& child = *p.child;
-		CachedStatement st(m_conn.statement(child.selectSql + " WHERE contact_id = ? AND owner = ? ORDER BY id"));
+		CachedStatement st(m_conn.statement(child.selectChildrenSql));
 		st->bind(1, ownerId).bind(2, owner);
 		int rc;
 		while ((rc = st->step()) == SQLITE_ROW) {
@@ -77,12 +77,9 @@ int ContactsReader::readRecord(const ViewInfo& view, int id, contacts_record_s**
 	WPRET_VM(!view.findByName("id") || !view.readSource, CONTACTS_ERROR_INVALID_PARAMETER,
 		"records of %s cannot be read by id", view.uri);
 	WPRET_VM(id < 0, CONTACTS_ERROR_INVALID_PARAMETER, "Invalid param : id %d", id);
-	std::string sql = view.selectSql + " WHERE id = ?";
-	if (view.baseWhere)
-		sql += std::string(" AND ") + view.baseWhere;
 	auto record = std::make_unique<contacts_record_s>(view);
 	{
-		CachedStatement st(m_conn.statement(sql));
+		CachedStatement st(m_conn.statement(view.selectByIdSql));
 		int rc = st->bind(1, id).step();
 		if (rc == SQLITE_DONE)
 			return CONTACTS_ERROR_NO_DATA;
@@ -90,7 +87,7 @@ int ContactsReader::readRecord(const ViewInfo& view, int id, contacts_record_s**
 			return m_conn.failed(view.uri, rc);
 		fillRecord(*record, *st, view.columns);
 	}
-	bool isProfile = std::string(view.uri) == "contacts.view.my_profile";
+	bool isProfile = view.number == kMyProfileView;
 	int err = loadChildren(*record, id, isProfile ? 1 : 0);
 	if (err != CONTACTS_ERROR_NONE)
 		return err;
@@ -98,8 +95,20 @@ int ContactsReader::readRecord(const ViewInfo& view, int id, contacts_record_s**
 	return CONTACTS_ERROR_NONE;
 }
 
+contacts_filter_s::IndexChoice ContactsReader::__indexChoiceForLimit(int limit)
+{
+	if (limit <= 0)
+		return nullptr;
+	return [this](const std::string& text) {
+		const int kRareMatches = 500;
+		CachedStatement st(m_conn.statement("SELECT count(*) FROM (SELECT rowid FROM persons_fts WHERE persons_fts "
+			"MATCH ? LIMIT 501)"));
+		return st->bind(1, ftsPhrase(text)).step() == SQLITE_ROW && st->columnInt(0) < kRareMatches;
+	};
+}
+
 int ContactsReader::__where(const ViewInfo& view, const contacts_query_s* query, std::string& sql,
-	std::vector<SqlParam>& params)
+	std::vector<SqlParam>& params, const contacts_filter_s::IndexChoice& useIndex)
 {
 	bool hasBase = view.baseWhere != nullptr;
 	bool hasFilter = query && query->filter;
@@ -110,7 +119,7 @@ int ContactsReader::__where(const ViewInfo& view, const contacts_query_s* query,
 		sql += view.baseWhere;
 	if (hasBase && hasFilter)
 		sql += " AND ";
-	return hasFilter ? query->filter->toSql(sql, params) : CONTACTS_ERROR_NONE;
+	return hasFilter ? query->filter->toSql(sql, params, useIndex) : CONTACTS_ERROR_NONE;
 }
 
 int ContactsReader::readList(const ViewInfo& view, const contacts_query_s* query, int offset, int limit,
@@ -127,7 +136,7 @@ int ContactsReader::readList(const ViewInfo& view, const contacts_query_s* query
 	std::string sql = std::string("SELECT ") + (query && query->distinct ? "DISTINCT " : "") + cols + " FROM "
 		+ view.readSource;
 	std::vector<SqlParam> params;
-	int err = __where(view, query, sql, params);
+	int err = __where(view, query, sql, params, __indexChoiceForLimit(limit));
 	if (err != CONTACTS_ERROR_NONE)
 		return err;
 	if (query && !query->sort.empty()) {
@@ -142,9 +151,9 @@ int ContactsReader::readList(const ViewInfo& view, const contacts_query_s* query
 	params.push_back(lim);
 	params.push_back(off);
 
-	contacts_list_create(out);
 	CachedStatement st(m_conn.statement(sql));
-	WPRET_VM(!st->valid(), (contacts_list_destroy(*out, true), *out = nullptr, CONTACTS_ERROR_DB), "bad query");
+	WPRET_VM(!st->valid(), CONTACTS_ERROR_DB, "bad query");
+	contacts_list_create(out);
 	bindParams(*st, params);
 	int rc;
 	while ((rc = st->step()) == SQLITE_ROW) {

@@ -26,7 +26,12 @@ public:
 	bool exists(const ViewInfo& view, int id);
 
 private:
-	int __where(const ViewInfo& view, const contacts_query_s* query, std::string& sql, std::vector<SqlParam>& params);
+	int __where(const ViewInfo& view, const contacts_query_s* query, std::string& sql, std::vector<SqlParam>& params,
+		const contacts_filter_s::IndexChoice& useIndex = nullptr);
+	// For a limited read: the trigram index only pays when the text is rare;
+	// for a common one, walking the rows in sort order finds the first
+	// matches sooner.
+	contacts_filter_s::IndexChoice __indexChoiceForLimit(int limit);
 
 	ContactsConnection& m_conn;
 };

@@ -111,6 +111,10 @@ Registry::Registry()
 			cols += (cols.empty() ? "\"" : ", \"") + std::string(p.name) + "\"";
 		}
 		view->selectSql = "SELECT " + cols + " FROM " + (view->readSource ? view->readSource : "");
+		view->selectByIdSql = view->selectSql + " WHERE id = ?";
+		if (view->baseWhere)
+			view->selectByIdSql += std::string(" AND ") + view->baseWhere;
+		view->selectChildrenSql = view->selectSql + " WHERE contact_id = ? AND owner = ? ORDER BY id";
 		for (PropertyInfo& p : view->props) {
 			if (p.type != PropType::Record)
 				continue;

@@ -46,6 +46,8 @@ struct ViewInfo {
 	std::unordered_map<unsigned, int> slotById;
 	std::vector<const PropertyInfo*> columns; // every non-record property
 	std::string selectSql;                    // SELECT <columns> FROM readSource
+	std::string selectByIdSql;                // ... WHERE id = ? [AND baseWhere]
+	std::string selectChildrenSql;            // ... WHERE contact_id = ? AND owner = ? ORDER BY id
 };
 
 class ContactsSchema {

@@ -2,6 +2,7 @@
 
 #include "ContactsDebug.h"
 #include "ContactsList.h"
+#include "ContactsRawValue.h"
 #include "ContactsRecord.h"
 #include "ContactsWriter.h"
 #include "DataDir.h"
@@ -199,7 +200,7 @@ int contacts_sim_get_field_text_max_len(int sim_slot_no, contacts_sim_field_e fi
 	WPRET_VM(!max_len || sim_slot_no < 0 || sim_slot_no >= ContactsSim::kSlots, CONTACTS_ERROR_INVALID_PARAMETER,
 		"Invalid param : slot %d", sim_slot_no);
 	ContactsSim::Slot s = ContactsSim::slot(sim_slot_no);
-	*max_len = s.present ? fieldMaxLen(s, field) : 0;
+	*max_len = s.present ? fieldMaxLen(s, rawValue(field)) : 0;
 	return CONTACTS_ERROR_NONE;
 }
 
@@ -218,13 +219,13 @@ int contacts_sim_get_unused_field_count(int sim_slot_no, contacts_sim_field_e fi
 		"Invalid param : slot %d", sim_slot_no);
 	*count = 0;
 	ContactsSim::Slot s = ContactsSim::slot(sim_slot_no);
-	if (!s.present || fieldMaxLen(s, field) <= 0)
+	if (!s.present || fieldMaxLen(s, rawValue(field)) <= 0)
 		return CONTACTS_ERROR_NONE;
 	ContactsConnection* conn = connectionOrLog();
 	if (!conn)
 		return CONTACTS_ERROR_DB;
 	int book = ContactsSim::addressBookOf(*conn, sim_slot_no);
-	if (field == CONTACTS_SIM_FIELD_EMAIL) {
+	if (rawValue(field) == CONTACTS_SIM_FIELD_EMAIL) {
 		*count = s.emailCapacity - countIn(*conn, "SELECT count(*) FROM emails e JOIN contacts c ON "
 			"c.id = e.contact_id WHERE e.owner = 0 AND c.address_book_id = ?", book);
 	} else {

@@ -113,16 +113,20 @@ int ContactsWriter::__updateRow(const ViewInfo& view, const contacts_record_s& r
 		sets += (sets.empty() ? "" : ", ") + quoted(name.c_str()) + " = ?";
 		params.push_back(p);
 	};
+	// Only what the record holds is written, so a record read with a
+	// projection cannot clear the properties it did not read.
 	for (const PropertyInfo* p : view.columns)
-		if (!p->readOnly && !inExtra(extra, p->name))
+		if (!p->readOnly && !inExtra(extra, p->name) && record.values[p->slot].set)
 			add(p->name, paramOf(*p, record.values[p->slot]));
 	for (const auto& e : extra)
 		add(e.first, e.second);
-	if (view.number == kNumberView) {
+	if (view.number == kNumberView && record.value("number")->set) {
 		std::string cleaned = cleanedNumber(record.getStr("number"));
 		add("cleaned_number", textParam(cleaned));
 		add("normalized_number", textParam(cleaned));
 	}
+	if (sets.empty())
+		sets = "id = id";
 	params.push_back(intParam(id));
 	CachedStatement st(m_conn.statement(std::string("UPDATE ") + view.table + " SET " + sets + " WHERE id = ?"));
 	bindParams(*st, params);
@@ -355,11 +359,19 @@ int ContactsWriter::__updatePerson(contacts_record_s& record)
 	std::vector<int> contacts = m_reader.contactIdsOfPerson(personId);
 	if (contacts.empty())
 		return CONTACTS_ERROR_NO_DATA;
-	CachedStatement st(m_conn.statement("UPDATE contacts SET ringtone_path = ?, vibration = ?, message_alert = ?, "
-		"is_favorite = ?, changed_ver = ? WHERE person_id = ?"));
-	st->bind(1, record.getStr("ringtone_path")).bind(2, record.getStr("vibration"));
-	st->bind(3, record.getStr("message_alert")).bind(4, record.getInt("is_favorite") ? 1 : 0);
-	st->bind(5, m_ctx.version).bind(6, personId);
+	// The person's own settings live in its contacts; only those the record holds are written.
+	std::string sets = "changed_ver = ?";
+	std::vector<SqlParam> params = { intParam(m_ctx.version) };
+	for (const char* name : { "ringtone_path", "vibration", "message_alert", "is_favorite" }) {
+		const contacts_record_s::Value* v = record.value(name);
+		if (!v->set)
+			continue;
+		sets += std::string(", ") + name + " = ?";
+		params.push_back(paramOf(*record.view->findByName(name), *v));
+	}
+	params.push_back(intParam(personId));
+	CachedStatement st(m_conn.statement("UPDATE contacts SET " + sets + " WHERE person_id = ?"));
+	bindParams(*st, params);
 	int rc = st->run();
 	if (rc != SQLITE_DONE)
 		return m_conn.failed("update person", rc);
@@ -620,7 +632,7 @@ int ContactsWriter::unlinkContact(int personId, int contactId, int* newPersonId)
 	return err;
 }
 
-int ContactsWriter::setDefaultProperty(contacts_person_property_e property, int personId, int id)
+int ContactsWriter::setDefaultProperty(int property, int personId, int id)
 {
 	std::vector<int> contacts = m_reader.contactIdsOfPerson(personId);
 	if (contacts.empty())

@@ -25,7 +25,8 @@ public:
 
 	int linkPersons(int basePersonId, int personId);
 	int unlinkContact(int personId, int contactId, int* newPersonId);
-	int setDefaultProperty(contacts_person_property_e property, int personId, int id);
+	// property: a contacts_person_property_e value, checked here.
+	int setDefaultProperty(int property, int personId, int id);
 
 	// Recomputes what a contact derives from its children, refreshes its
 	// person and records the change.

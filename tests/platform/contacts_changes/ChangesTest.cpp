@@ -8,6 +8,7 @@
 #include <unistd.h>
 
 #include <set>
+#include <thread>
 
 using namespace ct::test;
 
@@ -203,5 +204,27 @@ TEST(Changes, AnotherProcessWriteReachesCallbacksWithinHalfASecond)
 	std::vector<Change> changes = changesSince(v0);
 	ASSERT_EQ(1u, changes.size());
 	EXPECT_EQ(CONTACTS_CHANGE_INSERTED, changes[0].type);
+	contacts_db_remove_changed_cb(_contacts_person._uri, Recorder::cb, &person);
+}
+
+TEST(Changes, EachThreadHasItsOwnConnectionAndItsWritesAreSeen)
+{
+	EcoreScope ecore;
+	ConnectedStore store;
+	Recorder person;
+	contacts_db_add_changed_cb(_contacts_person._uri, Recorder::cb, &person);
+	int threadResult = -1;
+	std::thread writer([&]() {
+		threadResult = contacts_connect_on_thread();
+		if (threadResult == CONTACTS_ERROR_NONE) {
+			RecordPtr contact = makeContact({ "Threaded", "" });
+			threadResult = contacts_db_insert_record(contact.get(), nullptr);
+			contacts_disconnect_on_thread();
+		}
+	});
+	writer.join();
+	ASSERT_EQ(CONTACTS_ERROR_NONE, threadResult);
+	EXPECT_TRUE(pumpUntil([&]() { return !person.uris.empty(); }, 5.0));
+	EXPECT_EQ(1, countOf(_contacts_person._uri));
 	contacts_db_remove_changed_cb(_contacts_person._uri, Recorder::cb, &person);
 }

@@ -189,3 +189,57 @@ TEST(ContactStore, UnwritableDataFolderFailsToConnect)
 	EXPECT_NE(CONTACTS_ERROR_NONE, contacts_connect());
 	setenv("CONTACTS_DATA_DIR", dir.path().c_str(), 1);
 }
+
+TEST(ContactStore, BatchWritesAreAllOrNothingAndReplaceKeepsTheId)
+{
+	ConnectedStore store;
+	contacts_list_h list = nullptr;
+	contacts_list_create(&list);
+	contacts_list_add(list, makeContact({ "One", "" }).release());
+	contacts_list_add(list, makeContact({ "Two", "", {}, {}, 99 }).release()); // no such address book
+	int* ids = nullptr;
+	int count = 0;
+	EXPECT_EQ(CONTACTS_ERROR_INVALID_PARAMETER, contacts_db_insert_records(list, &ids, &count));
+	EXPECT_EQ(0, countOf(_contacts_contact._uri));
+	contacts_record_h second = nullptr;
+	contacts_list_last(list);
+	contacts_list_get_current_record_p(list, &second);
+	contacts_record_set_int(second, _contacts_contact.address_book_id, 0);
+	ASSERT_EQ(CONTACTS_ERROR_NONE, contacts_db_insert_records(list, &ids, &count));
+	ASSERT_EQ(2, count);
+	int first = ids[0];
+	int secondId = ids[1];
+	free(ids);
+	contacts_list_destroy(list, true);
+
+	RecordPtr replacement = makeContact({ "Uno", "", { "1" } });
+	ASSERT_EQ(CONTACTS_ERROR_NONE, contacts_db_replace_record(replacement.get(), first));
+	RecordPtr read = getRecord(_contacts_contact._uri, first);
+	EXPECT_EQ("Uno", strOf(read.get(), _contacts_contact.display_name));
+	EXPECT_EQ(1, childCount(read.get(), _contacts_contact.name));
+	EXPECT_EQ(1, childCount(read.get(), _contacts_contact.number));
+	EXPECT_EQ(CONTACTS_ERROR_NO_DATA, contacts_db_replace_record(replacement.get(), 5000));
+
+	int both[] = { first, secondId };
+	ASSERT_EQ(CONTACTS_ERROR_NONE, contacts_db_delete_records(_contacts_contact._uri, both, 2));
+	EXPECT_EQ(0, countOf(_contacts_contact._uri));
+	int missing[] = { 12345 };
+	EXPECT_EQ(CONTACTS_ERROR_NO_DATA, contacts_db_delete_records(_contacts_contact._uri, missing, 1));
+}
+
+TEST(ContactStore, MegabyteTextsAreStoredWhole)
+{
+	ConnectedStore store;
+	std::string big(3 * 1024 * 1024, 'n');
+	big += "ünï";
+	RecordPtr contact = makeContact({ "Big", "" });
+	contacts_record_h note = addChild(contact.get(), _contacts_contact.note, _contacts_note._uri);
+	ASSERT_EQ(CONTACTS_ERROR_NONE, contacts_record_set_str(note, _contacts_note.note, big.c_str()));
+	int id = 0;
+	ASSERT_EQ(CONTACTS_ERROR_NONE, contacts_db_insert_record(contact.get(), &id));
+	store.reopen();
+	RecordPtr read = getRecord(_contacts_contact._uri, id);
+	contacts_record_h readNote = nullptr;
+	contacts_record_get_child_record_at_p(read.get(), _contacts_contact.note, 0, &readNote);
+	EXPECT_EQ(big, strOf(readNote, _contacts_note.note));
+}

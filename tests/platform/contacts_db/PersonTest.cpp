@@ -252,3 +252,32 @@ TEST(Emergency, EmergencyRecordsNameAPersonAndANumber)
 	contacts_filter_destroy(filter);
 	contacts_query_destroy(query);
 }
+
+TEST(Person, UpdatingAProjectedRecordWritesOnlyWhatItHolds)
+{
+	ConnectedStore store;
+	int a = insertContact({ "Ring", "" });
+	int person = personOf(a);
+	RecordPtr full = getRecord(_contacts_person._uri, person);
+	contacts_record_set_str(full.get(), _contacts_person.ringtone_path, "/keep.ogg");
+	ASSERT_EQ(CONTACTS_ERROR_NONE, contacts_db_update_record(full.get()));
+
+	contacts_query_h query = nullptr;
+	contacts_query_create(_contacts_person._uri, &query);
+	unsigned props[] = { _contacts_person.id };
+	contacts_query_set_projection(query, props, 1);
+	contacts_list_h list = nullptr;
+	ASSERT_EQ(CONTACTS_ERROR_NONE, contacts_db_get_records_with_query(query, 0, 0, &list));
+	ListPtr owner(list);
+	contacts_record_h projected = nullptr;
+	contacts_list_get_current_record_p(list, &projected);
+	contacts_record_set_bool(projected, _contacts_person.is_favorite, true);
+	ASSERT_EQ(CONTACTS_ERROR_NONE, contacts_db_update_record(projected));
+	contacts_query_destroy(query);
+
+	RecordPtr read = getRecord(_contacts_person._uri, person);
+	EXPECT_EQ("/keep.ogg", strOf(read.get(), _contacts_person.ringtone_path));
+	bool favorite = false;
+	contacts_record_get_bool(read.get(), _contacts_person.is_favorite, &favorite);
+	EXPECT_TRUE(favorite);
+}

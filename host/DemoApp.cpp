@@ -52,6 +52,10 @@ void applyLightLook()
 		{"/fg/normal/naviframe/text/title", 31, 35, 40},
 		{"/fg/normal/naviframe/text/subtitle", 107, 114, 128},
 		{"/fg/normal/naviframe/top/overlap", 227, 230, 235},
+		{"/bg/normal/button", 255, 255, 255},
+		{"/bg/pressed/button", 225, 238, 252},
+		{"/fg/normal/button", 30, 136, 229},
+		{"/fg/pressed/button", 30, 136, 229},
 	};
 	for (const ColourClass& c : classes)
 		edje_color_class_set(c.name, c.r, c.g, c.b, 255, 0, 0, 0, 0, 0, 0, 0, 0);

@@ -39,8 +39,12 @@ std::string roleOf(const std::string& appId, const std::string& operation)
 	return operation.empty() ? "Launch" : operation;
 }
 
-std::string takeText(int err, char* text)
+// Runs one of the app-control getters that hand out a copy, and frees it.
+template <typename Getter>
+std::string textFrom(Getter getter)
 {
+	char* text = nullptr;
+	int err = getter(&text);
 	std::string out = (err == APP_CONTROL_ERROR_NONE && text) ? text : "";
 	free(text);
 	return out;
@@ -49,14 +53,13 @@ std::string takeText(int err, char* text)
 // The most telling detail of a request: its URI, else a known extra.
 std::string detailOf(app_control_h request)
 {
-	char* text = nullptr;
-	std::string uri = takeText(app_control_get_uri(request, &text), text);
+	std::string uri = textFrom([request](char** text) { return app_control_get_uri(request, text); });
 	if (!uri.empty())
 		return uri;
 	for (const char* key : {APP_CONTROL_DATA_TEXT, APP_CONTROL_DATA_PHONE, APP_CONTROL_DATA_EMAIL, APP_CONTROL_DATA_URL,
 			 "path", "type"}) {
-		text = nullptr;
-		std::string value = takeText(app_control_get_extra_data(request, key, &text), text);
+		std::string value =
+			textFrom([request, key](char** text) { return app_control_get_extra_data(request, key, text); });
 		if (!value.empty())
 			return value;
 	}
@@ -114,10 +117,8 @@ void DemoAppControlHandlers::__byApp(const char* appId, Answer answer)
 
 std::string DemoAppControlHandlers::describe(app_control_h request)
 {
-	char* text = nullptr;
-	std::string appId = takeText(app_control_get_app_id(request, &text), text);
-	text = nullptr;
-	std::string operation = takeText(app_control_get_operation(request, &text), text);
+	std::string appId = textFrom([request](char** text) { return app_control_get_app_id(request, text); });
+	std::string operation = textFrom([request](char** text) { return app_control_get_operation(request, text); });
 	std::string notice = roleOf(appId, operation);
 	std::string detail = detailOf(request);
 	if (!detail.empty())

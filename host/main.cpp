@@ -2,6 +2,7 @@
 #include "ContactsCommon.h"
 #include "DemoApp.h"
 #include "DemoOptions.h"
+#include "LeakCheckSupport.h"
 
 #include <Elementary.h>
 
@@ -49,6 +50,7 @@ int main(int argc, char** argv)
 		ct::demo::DemoApp app(options);
 		code = app.run();
 	}
+	ct::demo::keepToolkitModulesLoaded();
 	elm_shutdown();
 	return code;
 }

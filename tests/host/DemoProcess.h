@@ -29,9 +29,16 @@ inline std::string shellQuoted(const std::string& arg)
 	return out + "'";
 }
 
-inline DemoRun runDemo(const std::string& dataDir, const std::string& args)
+inline std::string standInDetailsLibrary()
 {
-	std::string command = "CONTACTS_DATA_DIR=" + shellQuoted(dataDir) + " ELM_ENGINE=buffer " +
+	const char* dir = getenv("CONTACTS_TEST_BIN_DIR");
+	return std::string(dir ? dir : ".") + "/host/libcontacts-demo-stand-in-details.so";
+}
+
+// `env` is put before the command as is ("NAME=value ...").
+inline DemoRun runDemo(const std::string& dataDir, const std::string& args, const std::string& env = "")
+{
+	std::string command = env + " CONTACTS_DATA_DIR=" + shellQuoted(dataDir) + " ELM_ENGINE=buffer " +
 		shellQuoted(demoBinary()) + " " + args + " 2>&1";
 	DemoRun run;
 	FILE* pipe = popen(command.c_str(), "r");

@@ -237,8 +237,12 @@ int DemoApp::__saveScreenshots(const std::string& dir)
 				continue;
 			char name[64];
 			snprintf(name, sizeof(name), "/%02d-person-%d.png", shot++, person.id);
-			if (__openPerson(person.id) && __settle() && __save(dir + name))
-				printf("%s%s\n", dir.c_str(), name);
+			if (__openPerson(person.id)) {
+				// A screen that never stops drawing is still worth a picture.
+				__settle();
+				if (__save(dir + name))
+					printf("%s%s\n", dir.c_str(), name);
+			}
 			__popToList();
 			break;
 		}

@@ -1,5 +1,6 @@
 #include "ScreenHarness.h"
 
+#include "CanvasPng.h"
 #include "EflEnvironment.h"
 #include "LogSink.h"
 
@@ -317,23 +318,7 @@ bool ScreenHarness::logContains(const std::string& needle)
 
 bool ScreenHarness::savePng(const std::string& path) const
 {
-	Evas* canvas = evas_object_evas_get(win());
-	Ecore_Evas* ee = ecore_evas_ecore_evas_get(canvas);
-	if (!ee)
-		return false;
-	int w = 0, h = 0;
-	ecore_evas_geometry_get(ee, nullptr, nullptr, &w, &h);
-	const void* pixels = ecore_evas_buffer_pixels_get(ee);
-	if (!pixels || w <= 0 || h <= 0)
-		return false;
-	Evas_Object* image = evas_object_image_add(canvas);
-	evas_object_image_colorspace_set(image, EVAS_COLORSPACE_ARGB8888);
-	evas_object_image_alpha_set(image, EINA_FALSE);
-	evas_object_image_size_set(image, w, h);
-	evas_object_image_data_copy_set(image, const_cast<void*>(pixels));
-	bool saved = evas_object_image_save(image, path.c_str(), nullptr, "compress=6");
-	evas_object_del(image);
-	return saved;
+	return ct::platform::saveCanvasPng(win(), path);
 }
 
 } // namespace ct::test

@@ -1,0 +1,56 @@
+// contacts-demo: see DemoApp.h; `contacts-demo --help` lists the options.
+#include "ContactsCommon.h"
+#include "DemoApp.h"
+#include "DemoOptions.h"
+#include "LeakCheckSupport.h"
+
+#include <Elementary.h>
+
+#include <clocale>
+#include <cstdio>
+#include <cstdlib>
+
+namespace {
+
+bool hasDisplay()
+{
+	const char* x11 = getenv("DISPLAY");
+	const char* wayland = getenv("WAYLAND_DISPLAY");
+	return (x11 && *x11) || (wayland && *wayland);
+}
+
+} // namespace
+
+int main(int argc, char** argv)
+{
+	ct::demo::DemoOptions options;
+	std::string error;
+	if (!options.parse(argc, argv, error)) {
+		fprintf(stderr, "contacts-demo: %s\n%s", error.c_str(), ct::demo::DemoOptions::usage());
+		return 2;
+	}
+	if (options.help) {
+		printf("%s", ct::demo::DemoOptions::usage());
+		return 0;
+	}
+	// Pictures are read back from the buffer engine's pixels.
+	bool headless = !options.screenshotFile.empty() || !options.screenshotDir.empty() || !hasDisplay();
+	if (headless) {
+		setenv("ELM_ENGINE", "buffer", 1);
+		setenv("ECORE_EVAS_ENGINE", "buffer", 1);
+	}
+	setlocale(LC_ALL, "");
+	elm_init(argc, argv);
+	elm_config_scale_set(1.0);
+	if (headless)
+		elm_config_transition_duration_factor_set(0.0);
+	ContactsCommon::bindTextDomain();
+	int code;
+	{
+		ct::demo::DemoApp app(options);
+		code = app.run();
+	}
+	ct::demo::keepToolkitModulesLoaded();
+	elm_shutdown();
+	return code;
+}

@@ -1,0 +1,59 @@
+#include "DemoProcess.h"
+#include "TempDataDir.h"
+
+#include <gtest/gtest.h>
+
+#include <filesystem>
+
+namespace ct::test {
+namespace {
+
+std::string withStandIn()
+{
+	return "CONTACTS_LOG_LEVEL=info CONTACTS_DETAILS_LIBRARY=" + shellQuoted(standInDetailsLibrary());
+}
+
+TEST(DemoDetailLibraryTest, DetailScreenComesFromTheLoadedLibraryAndItsRequestsReachTheDemoHandlers)
+{
+	TempDataDir data;
+	std::string shot = data.file("person.png");
+	DemoRun run = runDemo(data.path(), "--person 2 --screenshot " + shellQuoted(shot), withStandIn());
+	ASSERT_EQ(0, run.exitCode) << run.output;
+	EXPECT_GT(std::filesystem::file_size(shot), 1000u);
+	EXPECT_EQ(std::string::npos, run.output.find("no detail screen")) << run.output;
+	// The stand-in's call request was answered by the demo's phone.
+	EXPECT_NE(std::string::npos, run.output.find("demo handler: Call: tel:+person2")) << run.output;
+	// Factories the library lacks are named, not fatal.
+	EXPECT_NE(std::string::npos, run.output.find("createCtInputView is not exported")) << run.output;
+	EXPECT_EQ(std::string::npos, run.output.find("createCtDetailView is not exported")) << run.output;
+}
+
+TEST(DemoDetailLibraryTest, ScreenshotsIncludeTheDetailScreensOfChosenPersons)
+{
+	TempDataDir data;
+	std::string dir = data.file("shots");
+	DemoRun run = runDemo(data.path(), "--screenshots " + shellQuoted(dir), withStandIn());
+	ASSERT_EQ(0, run.exitCode) << run.output;
+	int detailShots = 0;
+	for (const auto& entry : std::filesystem::directory_iterator(dir)) {
+		std::string name = entry.path().filename().string();
+		if (name.find("-person-") != std::string::npos) {
+			++detailShots;
+			EXPECT_NE(std::string::npos, run.output.find(entry.path().string())) << name;
+		}
+	}
+	EXPECT_GE(detailShots, 4) << run.output;
+}
+
+TEST(DemoDetailLibraryTest, UnloadableLibraryLeavesThePersonList)
+{
+	TempDataDir data;
+	DemoRun run = runDemo(data.path(), "--person 1 --screenshot " + shellQuoted(data.file("p.png")),
+			"CONTACTS_DETAILS_LIBRARY=" + shellQuoted(data.file("missing.so")));
+	EXPECT_EQ(0, run.exitCode) << run.output;
+	EXPECT_NE(std::string::npos, run.output.find("dlopen(")) << run.output;
+	EXPECT_NE(std::string::npos, run.output.find("no detail screen in this build")) << run.output;
+}
+
+} // namespace
+} // namespace ct::test

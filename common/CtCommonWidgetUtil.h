@@ -76,10 +76,6 @@ bool ctCommoncheckAccountAppEnable();
 // Returns whether `out` is non-empty.
 bool ctCommontGetMapsAppId(std::string& out);
 
-// `text` percent-encoded for a "geo:0,0?q=" query (RFC 3986 unreserved
-// characters kept). Returns false and leaves `out` empty for null input.
-bool ctCommontEncodeAddress(const char* text, std::string& out);
-
 // Whether a data network is connected: the vconf int
 // CT_NETWORK_STATUS_KEY, connected unless it is set to 0.
 bool ctCommonCheckNetworkEnable();

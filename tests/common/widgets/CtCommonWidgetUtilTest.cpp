@@ -1,6 +1,7 @@
 #include "AppControlRouter.h"
 #include "ContactsAppIds.h"
 #include "ContactsCommon.h"
+#include "CtCommonTextUtil.h"
 #include "CtCommonWidgetUtil.h"
 #include "LogSink.h"
 #include "ScreenHarness.h"

@@ -1,0 +1,242 @@
+#include "CtCommonTextUtil.h"
+
+#include "AppControlRouter.h"
+#include "DataDir.h"
+#include "TempDataDir.h"
+
+#include <Ecore.h>
+#include <glib.h>
+#include <gtest/gtest.h>
+
+#include <cerrno>
+#include <cstdlib>
+#include <fstream>
+#include <string>
+#include <sys/stat.h>
+
+namespace {
+
+std::string clean(const char* number, int size = 1024)
+{
+	char out[1024];
+	ctCommonCleanNumber(number, out, size);
+	return out;
+}
+
+std::string cleanForSim(const char* number, int size = 1024)
+{
+	char out[1024];
+	ctCommonCleanNumberForSim(number, out, size);
+	return out;
+}
+
+std::string displayName(const char* path, int size = 1024)
+{
+	char out[1024];
+	ctCommonGetDisplayfileName(path, out, size);
+	return out;
+}
+
+std::string readFile(const std::string& path)
+{
+	std::ifstream in(path, std::ios::binary);
+	return std::string((std::istreambuf_iterator<char>(in)), std::istreambuf_iterator<char>());
+}
+
+} // namespace
+
+TEST(CtCommonTextUtil, CleaningKeepsOnlyDialableCharacters)
+{
+	EXPECT_EQ(clean("+1 (201) 555-0123"), "+12015550123");
+	EXPECT_EQ(clean("*31#010,1;2"), "*31#010,1;2");
+	EXPECT_EQ(clean("call me"), "");
+	// Arabic-Indic digits are dialled as their ASCII digits.
+	EXPECT_EQ(clean("\xD9\xA1\xD9\xA2\xD9\xA3"), "123");
+	EXPECT_EQ(clean(nullptr), "");
+	// Only the valid UTF-8 prefix is read.
+	EXPECT_EQ(clean("12\xFF" "34"), "12");
+}
+
+TEST(CtCommonTextUtil, CleaningForSimKeepsOneLeadingPlusAndMapsPauses)
+{
+	EXPECT_EQ(cleanForSim("+49 30-1234"), "+49301234");
+	EXPECT_EQ(cleanForSim("0049+30+1"), "0049301");
+	EXPECT_EQ(cleanForSim("123p4w5P6W7"), "123,4;5,6;7");
+	EXPECT_EQ(cleanForSim("(555) abc"), "555");
+}
+
+TEST(CtCommonTextUtil, CleaningNeverOverflowsTheBuffer)
+{
+	std::string huge(5000, '7');
+	char out[16];
+	memset(out, 'x', sizeof(out));
+	EXPECT_EQ(ctCommonCleanNumber(huge.c_str(), out, sizeof(out)), 15);
+	EXPECT_EQ(std::string(out), std::string(15, '7'));
+	EXPECT_EQ(ctCommonCleanNumber("123", out, 1), 0);
+	EXPECT_STREQ(out, "");
+	EXPECT_EQ(ctCommonCleanNumber("123", nullptr, 10), 0);
+	EXPECT_EQ(clean(huge.c_str()).size(), 1023u);
+}
+
+TEST(CtCommonTextUtil, MarkupBecomesValidPlainText)
+{
+	char* text = ctCommonMarkupToUtf8("Tom &amp; Jerry<br/>Caf\xC3\xA9");
+	ASSERT_NE(text, nullptr);
+	EXPECT_STREQ(text, "Tom & Jerry\nCaf\xC3\xA9");
+	free(text);
+
+	text = ctCommonMarkupToUtf8("bad\xFF" "byte");
+	ASSERT_NE(text, nullptr);
+	EXPECT_TRUE(g_utf8_validate(text, -1, nullptr));
+	EXPECT_NE(strstr(text, "bad"), nullptr);
+	free(text);
+
+	EXPECT_EQ(ctCommonMarkupToUtf8(nullptr), nullptr);
+}
+
+TEST(CtCommonTextUtil, Utf8LengthFromLeadByte)
+{
+	EXPECT_EQ(ctCommonCheckUtf8('a'), 1);
+	EXPECT_EQ(ctCommonCheckUtf8('\xC3'), 2);
+	EXPECT_EQ(ctCommonCheckUtf8('\xE2'), 3);
+	EXPECT_EQ(ctCommonCheckUtf8('\xF0'), 4);
+	// Continuation and never-valid bytes still advance a walk by one.
+	EXPECT_EQ(ctCommonCheckUtf8('\x80'), 1);
+	EXPECT_EQ(ctCommonCheckUtf8('\xC0'), 1);
+	EXPECT_EQ(ctCommonCheckUtf8('\xFF'), 1);
+}
+
+TEST(CtCommonTextUtil, DisplayFileNameDropsFolderAndExtension)
+{
+	EXPECT_EQ(displayName("/usr/share/sounds/ringtones/Over the horizon.ogg"), "Over the horizon");
+	EXPECT_EQ(displayName("tone.v2.mp3"), "tone.v2");
+	EXPECT_EQ(displayName("/a.dir/noext"), "noext");
+	EXPECT_EQ(displayName("/music/.hidden"), ".hidden");
+	EXPECT_EQ(displayName(nullptr), "");
+	// Cut at a whole character: "é" does not fit in the last byte.
+	EXPECT_EQ(displayName("/x/ab\xC3\xA9.ogg", 4), "ab");
+}
+
+TEST(CtCommonTextUtil, CopiedImageIsANewFileInTheDataFolder)
+{
+	ct::test::TempDataDir dir;
+	std::string source = dir.file("picked.jpg");
+	std::ofstream(source) << "JPEGDATA";
+
+	std::string first, second;
+	ASSERT_EQ(ctCommonCopyImage(source.c_str(), first), 0);
+	ASSERT_EQ(ctCommonCopyImage(source.c_str(), second), 0);
+	EXPECT_NE(first, second);
+	EXPECT_EQ(first.rfind(ct::platform::dataDir(), 0), 0u);
+	EXPECT_EQ(first.substr(first.size() - 4), ".jpg");
+	EXPECT_EQ(readFile(first), "JPEGDATA");
+
+	EXPECT_EQ(ctCommonUnlinkFile(first.c_str()), 0);
+	EXPECT_EQ(ctCommonUnlinkFile(first.c_str()), -ENOENT);
+	EXPECT_EQ(readFile(second), "JPEGDATA");
+}
+
+TEST(CtCommonTextUtil, BadCopiesAndUnlinksFailCleanly)
+{
+	ct::test::TempDataDir dir;
+	std::string out = "stale";
+	EXPECT_LT(ctCommonCopyImage(nullptr, out), 0);
+	EXPECT_TRUE(out.empty());
+	EXPECT_EQ(ctCommonCopyImage(dir.file("missing.png").c_str(), out), -ENOENT);
+	EXPECT_LT(ctCommonCopyImage(dir.path().c_str(), out), 0); // a folder is no picture
+	EXPECT_TRUE(out.empty());
+
+	EXPECT_EQ(ctCommonUnlinkFile(nullptr), -EINVAL);
+	EXPECT_EQ(ctCommonUnlinkFile(""), -EINVAL);
+	EXPECT_EQ(ctCommonUnlinkFile(dir.path().c_str()), -EISDIR);
+	struct stat st;
+	EXPECT_EQ(stat(dir.path().c_str(), &st), 0);
+}
+
+TEST(CtCommonTextUtil, CopyFailsWhenTheDataFolderCannotBeMade)
+{
+	ct::test::TempDataDir dir;
+	std::string source = dir.file("picked.png");
+	std::ofstream(source) << "PNG";
+	// The image folder's place is taken by a regular file.
+	std::ofstream(ct::platform::dataPath("images")) << "x";
+	std::string out;
+	EXPECT_LT(ctCommonCopyImage(source.c_str(), out), 0);
+	EXPECT_TRUE(out.empty());
+}
+
+TEST(CtCommonTextUtil, AddressIsEncodedForAGeoQuery)
+{
+	std::string encoded;
+	ASSERT_TRUE(ctCommontEncodeAddress("1 Main St\nSpringfield & Co \"A\"", encoded));
+	EXPECT_EQ(encoded, "1%20Main%20St%20Springfield%20%26%20Co%20%22A%22");
+	ASSERT_TRUE(ctCommontEncodeAddress("Caf\xC3\xA9", encoded));
+	EXPECT_EQ(encoded, "Caf%C3%A9");
+	EXPECT_FALSE(ctCommontEncodeAddress(nullptr, encoded));
+	EXPECT_TRUE(encoded.empty());
+}
+
+namespace {
+
+struct ReplySeen {
+	bool called = false;
+	app_control_result_e result = APP_CONTROL_RESULT_SUCCEEDED;
+	std::string value;
+};
+
+void onReply(app_control_h, app_control_h reply, app_control_result_e result, void* data)
+{
+	auto* seen = static_cast<ReplySeen*>(data);
+	seen->called = true;
+	seen->result = result;
+	char* value = nullptr;
+	if (app_control_get_extra_data(reply, "is_success", &value) == APP_CONTROL_ERROR_NONE && value)
+		seen->value = value;
+	free(value);
+	ecore_main_loop_quit();
+}
+
+// Sends a request to a handler that keeps it, answers it with `answer` and
+// returns what the sender saw.
+template <typename Answer>
+ReplySeen roundTrip(Answer answer)
+{
+	ecore_init();
+	app_control_h kept = nullptr;
+	auto reg = ct::appcontrol::registerAppHandler("test.caller.app", [&](app_control_h request, const auto&) {
+		app_control_clone(&kept, request);
+		return 0;
+	});
+	app_control_h request = nullptr;
+	app_control_create(&request);
+	app_control_set_app_id(request, "test.caller.app");
+	ReplySeen seen;
+	EXPECT_EQ(app_control_send_launch_request(request, onReply, &seen), 0);
+	EXPECT_EQ(answer(kept), 0);
+	ecore_main_loop_begin();
+	app_control_destroy(kept);
+	app_control_destroy(request);
+	ecore_shutdown();
+	return seen;
+}
+
+} // namespace
+
+TEST(CtCommonTextUtil, SimpleResultReachesTheCaller)
+{
+	ReplySeen canceled = roundTrip([](app_control_h kept) {
+		return ctCommonSendSimpleAppControlResult(kept, nullptr, nullptr, APP_CONTROL_RESULT_CANCELED);
+	});
+	EXPECT_TRUE(canceled.called);
+	EXPECT_EQ(canceled.result, APP_CONTROL_RESULT_CANCELED);
+	EXPECT_TRUE(canceled.value.empty());
+
+	ReplySeen success = roundTrip([](app_control_h kept) {
+		return ctCommonSendSimpleAppControlResult(kept, "is_success", "1", APP_CONTROL_RESULT_SUCCEEDED);
+	});
+	EXPECT_EQ(success.result, APP_CONTROL_RESULT_SUCCEEDED);
+	EXPECT_EQ(success.value, "1");
+
+	EXPECT_EQ(ctCommonSendSimpleAppControlResult(nullptr, nullptr, nullptr, APP_CONTROL_RESULT_FAILED),
+		APP_CONTROL_ERROR_INVALID_PARAMETER);
+}

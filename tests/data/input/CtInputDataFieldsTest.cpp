@@ -1,0 +1,282 @@
+// The editable contact in memory: type tables, next types, name splits and
+// composed texts, addresses, bad texts.
+#include "CtInputData.h"
+#include "InputTestStore.h"
+
+#include <glib.h>
+
+#include <memory>
+
+using namespace ct::test;
+using namespace CtDataType;
+
+namespace {
+
+class CtInputDataFieldsTest : public InputStoreTest {
+protected:
+	void SetUp() override
+	{
+		InputStoreTest::SetUp();
+		m_data = std::make_unique<CtInputData>(nullptr);
+	}
+	void TearDown() override
+	{
+		m_data.reset();
+		InputStoreTest::TearDown();
+	}
+
+	contacts_record_h name()
+	{
+		return childAt(m_data->getContactRecord(), _contacts_contact.name, 0);
+	}
+
+	std::unique_ptr<CtInputData> m_data;
+};
+
+std::string str(const char* text)
+{
+	return text ? text : "<null>";
+}
+
+} // namespace
+
+TEST(CtDataTypeTables, NumberPositionsBothWays)
+{
+	const int types[] = {0, 1, 64, 12, 10, 1 << 29, 20, 18, 128};
+	for (int i = 0; i <= 8; ++i)
+		EXPECT_EQ(numberTypeByIndex(i), types[i]) << i;
+	EXPECT_EQ(numberTypeByIndex(9), 0);
+	EXPECT_EQ(numberTypeByIndex(-3), -3);
+
+	EXPECT_EQ(numberIndexByType(1 | 64), 9); // custom bit first
+	EXPECT_EQ(numberIndexByType(64 | 8), 2); // cell before voice
+	EXPECT_EQ(numberIndexByType(10), 4);
+	EXPECT_EQ(numberIndexByType(12), 3);
+	EXPECT_EQ(numberIndexByType(8), 2);
+	EXPECT_EQ(numberIndexByType(18), 7);
+	EXPECT_EQ(numberIndexByType(20), 6);
+	EXPECT_EQ(numberIndexByType(16), 2);
+	EXPECT_EQ(numberIndexByType(128), 8);
+	EXPECT_EQ(numberIndexByType(1 << 29), 5);
+	EXPECT_EQ(numberIndexByType(2), 4);
+	EXPECT_EQ(numberIndexByType(4), 3);
+	EXPECT_EQ(numberIndexByType(0), 9);
+	EXPECT_EQ(numberIndexByType(1 << 12), 9);
+	// The profile's rule for plain voice and fax.
+	EXPECT_EQ(numberIndexByType(8, 9), 9);
+}
+
+TEST(CtDataTypeTables, MessengerPositionsBothWays)
+{
+	const int types[] = {1, 7, 4, 10, 8, 2, 6, 9, 9};
+	for (int i = 0; i <= 8; ++i)
+		EXPECT_EQ(messengerTypeByIndex(i), types[i]) << i;
+	EXPECT_EQ(messengerTypeByIndex(-1), -1);
+	EXPECT_EQ(messengerTypeByIndex(5, CONTACTS_MESSENGER_TYPE_JABBER), 9);
+
+	const std::pair<int, int> reverse[] = {{1, 0}, {2, 5}, {4, 2}, {6, 6}, {7, 1}, {8, 4}, {10, 3},
+		{3, 7}, {5, 7}, {9, 7}, {0, 7}, {11, 7}};
+	for (const auto& r : reverse)
+		EXPECT_EQ(messengerIndexByType(r.first), r.second) << r.first;
+	EXPECT_EQ(messengerIndexByType(2, 7), 7);
+}
+
+TEST(CtDataTypeTables, NextTypes)
+{
+	EXPECT_EQ(nextNumberType({}), 64);
+	EXPECT_EQ(nextNumberType({64, 12, 10}), 1 << 29);
+	EXPECT_EQ(nextNumberType({64, 12, 10, 1 << 29, 20, 18, 128}), 0);
+	EXPECT_EQ(nextNumberType({64, 12, 10, 1 << 29, 20, 18}), 128);
+
+	EXPECT_EQ(nextHomeWorkType({}), 2);
+	EXPECT_EQ(nextHomeWorkType({2 | 1}), 4);
+	EXPECT_EQ(nextHomeWorkType({6}), 0);
+
+	EXPECT_EQ(nextEventType({}), 2);
+	EXPECT_EQ(nextEventType({2}), 3);
+	EXPECT_EQ(nextEventType({3, 2}), 0);
+	EXPECT_EQ(nextEventType({3}), 2);
+
+	EXPECT_EQ(nextRelationshipType({}), 1);
+	EXPECT_EQ(nextRelationshipType({1, 2, 0, 15, -4}), 3);
+	std::vector<int> all;
+	for (int t = 1; t <= 14; ++t)
+		all.push_back(t);
+	EXPECT_EQ(nextRelationshipType(all), 14);
+
+	EXPECT_EQ(nextMessengerType({}), 7);
+	EXPECT_EQ(nextMessengerType({7, 4}), 10);
+	EXPECT_EQ(nextMessengerType({7, 4, 10, 8, 2, 6}), 9);
+	EXPECT_EQ(nextMessengerType({7, 4, 10, 8, 2, 6}, CONTACTS_MESSENGER_TYPE_CUSTOM), 1);
+}
+
+TEST_F(CtInputDataFieldsTest, AddedChildrenTakeTheNextFreeType)
+{
+	for (const char* n : {"1", "2", "3"})
+		m_data->addNumber(n);
+	contacts_record_h fourth = m_data->addNumber("4");
+	EXPECT_EQ(m_data->getDataType(fourth, _contacts_number.type), 1 << 29);
+	for (const char* n : {"5", "6", "7"})
+		m_data->addNumber(n);
+	EXPECT_EQ(m_data->getNextNumberType(), 0);
+
+	contacts_record_h home = m_data->addEmail("a@x");
+	EXPECT_EQ(m_data->getDataType(home, _contacts_email.type), 2);
+	EXPECT_EQ(m_data->getNextEmailType(), 4);
+	EXPECT_EQ(m_data->getDataType(m_data->addEvent(20010203), _contacts_event.type), 2);
+	EXPECT_EQ(m_data->getNextEventType(), 3);
+	EXPECT_EQ(m_data->getDataType(m_data->addRelationship("Bo"), _contacts_relationship.type), 1);
+	EXPECT_EQ(m_data->getDataType(m_data->addMessenger("im"), _contacts_messenger.type), 7);
+	EXPECT_EQ(m_data->getNextAddressType(), 2);
+
+	// A negative type stores custom with its label.
+	ASSERT_EQ(m_data->setNumberType(fourth, -1, "Boat"), 0);
+	EXPECT_EQ(m_data->getDataType(fourth, _contacts_number.type), 1);
+	EXPECT_EQ(str(m_data->getDataTypeCustom(fourth, _contacts_number.label)), "Boat");
+	EXPECT_EQ(m_data->getNumberIndexType(m_data->getDataType(fourth, _contacts_number.type)), 9);
+
+	Eina_List* numbers = m_data->getNumberList();
+	EXPECT_EQ(eina_list_count(numbers), 7u);
+	EXPECT_EQ(eina_list_nth(numbers, 3), fourth);
+	eina_list_free(numbers);
+	EXPECT_EQ(m_data->removeNumber(fourth), 0);
+	EXPECT_EQ(m_data->getNextNumberType(), 1 << 29);
+	EXPECT_NE(m_data->removeNumber(nullptr), 0);
+}
+
+TEST_F(CtInputDataFieldsTest, FullNameSplitsFromTheBack)
+{
+	ASSERT_EQ(m_data->setFullName("Anna Maria Lopez Diaz, Jr. PhD"), 0);
+	EXPECT_EQ(str(m_data->getFirstName()), "Anna Maria");
+	EXPECT_EQ(str(m_data->getMiddleName()), "Lopez");
+	EXPECT_EQ(str(m_data->getLastName()), "Diaz");
+	EXPECT_EQ(str(m_data->getSuffixName()), "Jr. PhD");
+	EXPECT_EQ(m_data->getFullName(), "Anna Maria Lopez Diaz, Jr. PhD");
+
+	m_data->setPrefixName("Dr.");
+	ASSERT_EQ(m_data->setFullName(",Jr"), 0);
+	EXPECT_EQ(str(m_data->getPrefixName()), "<null>");
+	EXPECT_EQ(str(m_data->getFirstName()), "<null>");
+	EXPECT_EQ(str(m_data->getLastName()), "<null>");
+	EXPECT_EQ(str(m_data->getSuffixName()), "Jr");
+	EXPECT_EQ(m_data->getFullName(), "Jr");
+
+	m_data->setFullName("  Kim   Lee  ");
+	EXPECT_EQ(str(m_data->getFirstName()), "Kim");
+	EXPECT_EQ(str(m_data->getLastName()), "Lee");
+	EXPECT_EQ(str(m_data->getSuffixName()), "<null>");
+	m_data->setFullName("Cher, a, b");
+	EXPECT_EQ(str(m_data->getFirstName()), "Cher");
+	EXPECT_EQ(str(m_data->getSuffixName()), "a, b");
+
+	EXPECT_EQ(m_data->separateFullName(nullptr, "x"), -1);
+	EXPECT_EQ(m_data->separateFullName(name(), nullptr), -1);
+}
+
+TEST_F(CtInputDataFieldsTest, PhoneticNameSplitsFromTheFront)
+{
+	ASSERT_EQ(m_data->setPhoneticFullName("Ho Yun Jae Min"), 0);
+	EXPECT_EQ(str(m_data->getPhoneticFirstName()), "Ho");
+	EXPECT_EQ(str(m_data->getPhoneticMiddleName()), "Yun");
+	EXPECT_EQ(str(m_data->getPhoneticLastName()), "Jae Min");
+	EXPECT_EQ(m_data->getPhoneticFullName(), "Ho Yun Jae Min");
+
+	m_data->setPhoneticFullName("Ho Yun");
+	EXPECT_EQ(str(m_data->getPhoneticMiddleName()), "<null>");
+	EXPECT_EQ(str(m_data->getPhoneticLastName()), "Yun");
+	m_data->setPhoneticFullName("Ho");
+	EXPECT_EQ(m_data->getPhoneticFullName(), "Ho");
+	m_data->setPhoneticFullName(nullptr);
+	EXPECT_EQ(m_data->getPhoneticFullName(), "");
+	EXPECT_EQ(m_data->separatePhoneticFullName(nullptr, "x"), -1);
+}
+
+TEST_F(CtInputDataFieldsTest, LongAndInvalidTextsAreCutOrRefused)
+{
+	std::string longName = std::string(1020, 'a') + " \xC3\xA9\xC3\xA9\xC3\xA9 tail";
+	ASSERT_EQ(m_data->setFullName(longName.c_str()), 0);
+	std::string full = m_data->getFullName();
+	EXPECT_LT(full.size(), 1024u);
+	EXPECT_TRUE(g_utf8_validate(full.c_str(), -1, nullptr));
+	EXPECT_EQ(full.find("tail"), std::string::npos);
+
+	m_data->setFullName("Dr Kept Name, Sr");
+	EXPECT_NE(m_data->setFullName("Bad\xFF" "Name"), 0);
+	EXPECT_NE(m_data->setPhoneticFullName("\xC3"), 0);
+	EXPECT_EQ(m_data->getFullName(), "Dr Kept Name, Sr"); // nothing half-applied
+	contacts_record_h number = m_data->addNumber("123");
+	EXPECT_NE(m_data->setNumberNumber(number, "1\xFE"), 0);
+	EXPECT_EQ(str(m_data->getNumberNumber(number)), "123");
+	EXPECT_EQ(m_data->setNumberNumber(number, nullptr), 0);
+	EXPECT_EQ(str(m_data->getNumberNumber(number)), "123");
+}
+
+TEST_F(CtInputDataFieldsTest, CompanyAndAddressTexts)
+{
+	m_data->setCompany("Acme");
+	contacts_record_h company = childAt(m_data->getContactRecord(), _contacts_contact.company, 0);
+	contacts_record_set_str(company, _contacts_company.department, "Labs");
+	EXPECT_EQ(m_data->getCompany(), "Acme Labs");
+	m_data->setCompany("");
+	contacts_record_set_str(company, _contacts_company.department, "Labs");
+	EXPECT_EQ(m_data->getCompany(), "Labs");
+	m_data->setCompany("Acme");
+	EXPECT_EQ(m_data->getCompany(), "Acme");
+	m_data->setJobTitle("Boss");
+	EXPECT_EQ(str(m_data->getJobTitle()), "Boss");
+
+	contacts_record_h address = m_data->addAddress("1 Main St");
+	contacts_record_set_str(address, _contacts_address.postal_code, "12345");
+	contacts_record_set_str(address, _contacts_address.country, "Utopia");
+	char buffer[64];
+	ASSERT_EQ(m_data->getAddressAddress(address, buffer, sizeof(buffer)), 0);
+	EXPECT_STREQ(buffer, "12345\n1 Main St\nUtopia");
+	ASSERT_EQ(m_data->getAddressAddress(address, buffer, 8), 0);
+	EXPECT_STREQ(buffer, "12345\n1");
+	m_data->setAddressAddress(address, "Elsewhere");
+	ASSERT_EQ(m_data->getAddressAddress(address, buffer, sizeof(buffer)), 0);
+	EXPECT_STREQ(buffer, "Elsewhere");
+	EXPECT_NE(m_data->getAddressAddress(address, nullptr, 10), 0);
+}
+
+TEST_F(CtInputDataFieldsTest, ImagesEventsRingtoneAndFixedAnswers)
+{
+	EXPECT_EQ(m_data->getImagePath(), nullptr);
+	EXPECT_EQ(m_data->setImage(nullptr, "", 0), 0);
+	EXPECT_EQ(m_data->getImageRecord(), nullptr);
+	ASSERT_EQ(m_data->setImage(nullptr, "/pics/a.jpg", 0), 0);
+	EXPECT_EQ(str(m_data->getImagePath()), "/pics/a.jpg");
+	EXPECT_EQ(m_data->removeImage(m_data->getImageRecord()), 0);
+	EXPECT_EQ(m_data->getImagePath(), nullptr);
+	EXPECT_EQ(m_data->getImagePath(1), nullptr);
+	EXPECT_EQ(m_data->getImageRecord(1), nullptr);
+	EXPECT_EQ(m_data->getImageIndex(1), -1);
+	EXPECT_EQ(m_data->getImageCount(), 0);
+	EXPECT_EQ(m_data->getImageOrder(0), 0);
+
+	contacts_record_h event = m_data->addEvent(19991231);
+	EXPECT_EQ(m_data->getEventEvent(event), 19991231);
+	m_data->setCalendarType(event, 7);
+	EXPECT_EQ(m_data->getCalendarType(event), 0);
+	m_data->setCalendarType(event, 1);
+	m_data->setIsLeapMonth(event, true);
+	EXPECT_EQ(m_data->getCalendarType(event), 1);
+	EXPECT_TRUE(m_data->getIsLeapMonth(event));
+	EXPECT_EQ(m_data->getEventEvent(nullptr), 0);
+
+	m_data->setRingtone("/snd/a.ogg", "1500");
+	EXPECT_EQ(str(m_data->getRingtone()), "/snd/a.ogg");
+	m_data->setRingtone(nullptr);
+	EXPECT_EQ(m_data->getRingtone(), nullptr);
+
+	EXPECT_EQ(m_data->getContactId(), 0);
+	EXPECT_EQ(m_data->getPersonId(), 0);
+	EXPECT_EQ(m_data->getAddressbookId(), 0);
+	EXPECT_EQ(m_data->getSimNo(), 0);
+	EXPECT_EQ(m_data->getSimFieldTextMaxLen(0), 0);
+	EXPECT_FALSE(m_data->getAddressbookItemShown());
+	m_data->setAddressbookItemShown(true);
+	EXPECT_TRUE(m_data->getAddressbookItemShown());
+	EXPECT_EQ(m_data->getGroupsName(), "IDS_PB_BODY_NOT_ASSIGNED");
+	EXPECT_EQ(m_data->getEmergencyNumber(), nullptr);
+}

@@ -3,6 +3,26 @@
 #include "ContactsCommon.h"
 
 #include <cstring>
+#include <string>
+
+namespace {
+
+// Plain text as genlist markup: only the markup's own characters escaped.
+char* toMarkup(const char* text)
+{
+	std::string out;
+	for (const char* p = text; *p; ++p) {
+		switch (*p) {
+		case '<': out += "&lt;"; break;
+		case '>': out += "&gt;"; break;
+		case '&': out += "&amp;"; break;
+		default: out += *p;
+		}
+	}
+	return strdup(out.c_str());
+}
+
+} // namespace
 
 CtPersonPickerItem::CtPersonPickerItem(int id, std::string name, std::string subText, Chooser chooser)
 	: m_id(id)
@@ -43,9 +63,8 @@ char* CtPersonPickerItem::__getTextCb(void* data, Evas_Object*, const char* part
 	auto* row = static_cast<CtPersonPickerItem*>(data);
 	// The names come from the store as plain text; the genlist shows markup.
 	if (!strcmp(part, "elm.text"))
-		return elm_entry_utf8_to_markup(
-			row->m_name.empty() ? ContactsCommon::translate("IDS_LOGS_MBODY_UNKNOWN") : row->m_name.c_str());
+		return toMarkup(row->m_name.empty() ? ContactsCommon::translate("IDS_LOGS_MBODY_UNKNOWN") : row->m_name.c_str());
 	if (!strcmp(part, "elm.text.sub") && !row->m_subText.empty())
-		return elm_entry_utf8_to_markup(row->m_subText.c_str());
+		return toMarkup(row->m_subText.c_str());
 	return nullptr;
 }

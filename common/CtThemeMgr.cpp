@@ -1,6 +1,7 @@
 #include "CtThemeMgr.h"
 
 #include "ContactsDebug.h"
+#include "CtLightTheme.h"
 
 #include <cstring>
 
@@ -15,6 +16,8 @@ void CtThemeMgr::addExtensionTheme(const char* edjPath)
 	WPRET_M(!edjPath || !*edjPath, "Invalid param : edjPath");
 	if (hasExtensionTheme(edjPath))
 		return;
+	// The toolkit's widgets around the application's layouts look light too.
+	CtLightTheme::apply();
 	// Extensions of the default theme reach every widget, popups on the
 	// window included, not only those below one layout.
 	elm_theme_extension_add(nullptr, edjPath);

@@ -52,6 +52,8 @@ CtPersonPickerView::CtPersonPickerView(const char* titleId)
 
 CtPersonPickerView::~CtPersonPickerView()
 {
+	if (m_watching)
+		contacts_db_remove_changed_cb(_contacts_person._uri, __personsChangedCb, this);
 	if (m_connected)
 		contacts_disconnect();
 }
@@ -63,6 +65,10 @@ Evas_Object* CtPersonPickerView::onCreate(Evas_Object* parent, void*)
 	if (err != CONTACTS_ERROR_NONE)
 		WFAILED("contacts_connect", err);
 	m_connected = err == CONTACTS_ERROR_NONE;
+	err = contacts_db_add_changed_cb(_contacts_person._uri, __personsChangedCb, this);
+	if (err != CONTACTS_ERROR_NONE)
+		WFAILED("contacts_db_add_changed_cb", err);
+	m_watching = err == CONTACTS_ERROR_NONE;
 
 	Evas_Object* layout = createBaseLayout(parent, nullptr, nullptr);
 	WPRET_VM(!layout, nullptr, "createBaseLayout() is fail");
@@ -86,6 +92,9 @@ void CtPersonPickerView::onPushed(Elm_Object_Item* naviItem)
 void CtPersonPickerView::onDestroy()
 {
 	app_assist::WUiTimer::destroy(m_chooseIdler);
+	if (m_watching)
+		contacts_db_remove_changed_cb(_contacts_person._uri, __personsChangedCb, this);
+	m_watching = false;
 	m_entry = nullptr;
 	m_genlist = nullptr;
 }
@@ -216,4 +225,10 @@ void CtPersonPickerView::__searchChangedCb(void* data, Evas_Object* obj, void*)
 	char* text = elm_entry_markup_to_utf8(elm_entry_entry_get(obj));
 	view->setSearchText(text);
 	free(text);
+}
+
+void CtPersonPickerView::__personsChangedCb(const char*, void* data)
+{
+	WHIT();
+	static_cast<CtPersonPickerView*>(data)->reload();
 }

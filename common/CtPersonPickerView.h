@@ -10,7 +10,8 @@
 
 // A searchable list of people (or of one person's contacts) on the contacts
 // service: an entry on top filters the rows by name, tapping a row chooses
-// it. Subclasses say what the rows are and what choosing one does.
+// it. The list follows changes of the store while the view lives.
+// Subclasses say what the rows are and what choosing one does.
 class CtPersonPickerView : public app_assist::WView, public CtView {
 public:
 	struct Entry {
@@ -56,6 +57,7 @@ private:
 	void __fillList();
 	void __choose(int id);
 	static void __searchChangedCb(void* data, Evas_Object* obj, void* eventInfo);
+	static void __personsChangedCb(const char* viewUri, void* data);
 
 	std::string m_titleId;
 	std::vector<Entry> m_entries;
@@ -64,6 +66,7 @@ private:
 	Evas_Object* m_genlist = nullptr;
 	app_assist::WUiTimerHandle m_chooseIdler;
 	bool m_connected = false;
+	bool m_watching = false;
 };
 
 #endif

@@ -42,6 +42,8 @@ protected:
 			if (ScreenHarness::itemText(item, "elm.text") == name) {
 				ScreenHarness::selectItem(item);
 				screen.pumpUntilIdle();
+				// The choice runs from an idler, which a busy machine delays.
+				screen.pumpFor(0.2);
 				return;
 			}
 		ADD_FAILURE() << "no row " << name;
@@ -94,7 +96,7 @@ TEST_F(PickerViewsTest, RelationshipPickerFiltersByNameAndRaisesTheChosenPerson)
 
 		choose(screen, view, "Åne");
 		EXPECT_EQ(signals, (std::vector<std::pair<ctRegistryKey, int>>{{CT_REGISTRY_KEY_RELATIONSHIP_PERSON, aane}}));
-		EXPECT_EQ(screen.viewCount(), 0);
+		EXPECT_TRUE(pumpUntil([&] { return screen.viewCount() == 0; }, 3.0));
 	}
 	CtRegistryMgr::getInstance()->removeChangeListener(listener);
 	EXPECT_GT(anna, 0);
@@ -149,7 +151,7 @@ TEST_F(PickerViewsTest, LinkPickerLeavesOutTheBasePersonAndLinksTheChoiceForGood
 		EXPECT_EQ(view->getMaxCount(), 9);
 		EXPECT_EQ(names(view), (std::vector<std::string>{"Other", "Third"}));
 		choose(screen, view, "Other");
-		EXPECT_EQ(screen.viewCount(), 0);
+		EXPECT_TRUE(pumpUntil([&] { return screen.viewCount() == 0; }, 3.0));
 	}
 	reopenStore();
 	EXPECT_EQ(personOf(otherContact), base);
@@ -168,7 +170,7 @@ TEST_F(PickerViewsTest, LinkPickerWithNoRoomLeftRefusesEveryChoice)
 	app_control_destroy(request);
 	ASSERT_TRUE(screen.push(view));
 	choose(screen, view, "Other");
-	EXPECT_TRUE(ScreenHarness::logContains("ct_max 0"));
+	EXPECT_TRUE(pumpUntil([] { return ScreenHarness::logContains("ct_max 0"); }, 3.0));
 	EXPECT_EQ(screen.viewCount(), 1);
 	EXPECT_EQ(personOf(otherContact), other);
 }
@@ -241,16 +243,33 @@ TEST_F(PickerViewsTest, UnlinkListSplitsContactsOffUntilOneIsLeft)
 		EXPECT_FALSE(ScreenHarness::itemText(first, "elm.text.sub").empty());
 
 		choose(screen, view, "Beta");
+		EXPECT_TRUE(pumpUntil([&] { return names(view).size() == 2; }, 3.0));
 		EXPECT_EQ(names(view), (std::vector<std::string>{"Alpha", "Gamma"}));
 		EXPECT_NE(personOf(b), person);
 		choose(screen, view, "Gamma");
-		EXPECT_EQ(screen.viewCount(), 0);
+		EXPECT_TRUE(pumpUntil([&] { return screen.viewCount() == 0; }, 3.0));
 	}
 	reopenStore();
 	EXPECT_EQ(personOf(a), person);
 	EXPECT_NE(personOf(b), person);
 	EXPECT_NE(personOf(c), person);
 	EXPECT_NE(personOf(b), personOf(c));
+}
+
+TEST_F(PickerViewsTest, ListFollowsPersonsAddedAndDeletedElsewhereKeepingTheFilter)
+{
+	int anna = addSimplePerson("Anna");
+	ScreenHarness screen;
+	auto* view = static_cast<CtPersonPickerView*>(CtDllViewFactory::getInstance()->getCtListViewClassForRelationship());
+	ASSERT_TRUE(screen.push(view));
+	view->setSearchText("an");
+	addSimplePerson("Hannah");
+	addSimplePerson("Bert");
+	EXPECT_TRUE(pumpUntil([&] { return names(view).size() == 2; }, 2.0));
+	EXPECT_EQ(names(view), (std::vector<std::string>{"Anna", "Hannah"}));
+	ASSERT_EQ(CONTACTS_ERROR_NONE, contacts_db_delete_record(_contacts_person._uri, anna));
+	EXPECT_TRUE(pumpUntil([&] { return names(view).size() == 1; }, 2.0));
+	EXPECT_EQ(names(view), (std::vector<std::string>{"Hannah"}));
 }
 
 TEST_F(PickerViewsTest, FactoryRefusesMissingRequestsAndPersons)

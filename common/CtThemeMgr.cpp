@@ -14,10 +14,11 @@ CtThemeMgr* CtThemeMgr::getInstance()
 void CtThemeMgr::addExtensionTheme(const char* edjPath)
 {
 	WPRET_M(!edjPath || !*edjPath, "Invalid param : edjPath");
+	// The toolkit's widgets around the application's layouts look light too;
+	// the overlay also brings the application's base layout.
+	CtLightTheme::apply();
 	if (hasExtensionTheme(edjPath))
 		return;
-	// The toolkit's widgets around the application's layouts look light too.
-	CtLightTheme::apply();
 	// Extensions of the default theme reach every widget, popups on the
 	// window included, not only those below one layout.
 	elm_theme_extension_add(nullptr, edjPath);

@@ -84,10 +84,7 @@ Evas_Object* CtView::createBaseLayout(Evas_Object* parent, const char* edjName, 
 		loaded = elm_layout_file_set(layout, edjPath.c_str(), group);
 	} else {
 		CtThemeMgr::getInstance()->addExtensionTheme(edjPath.c_str());
-		// The toolkit's own base layout has the same content part, for
-		// resources that do not bring one.
-		loaded = elm_layout_theme_set(layout, "layout", "application", "default") ||
-			elm_layout_theme_set(layout, "layout", "application", "content-back");
+		loaded = elm_layout_theme_set(layout, "layout", "application", "default");
 	}
 	if (!loaded) {
 		WERROR("ctCommonCreateLayout() is fail");

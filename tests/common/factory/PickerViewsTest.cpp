@@ -15,12 +15,21 @@
 #include <app_control.h>
 #include <glib.h>
 
+#include <filesystem>
 #include <string>
 #include <vector>
 
 using namespace ct::test;
 
 namespace {
+
+std::string shotPath(const std::string& name)
+{
+	const char* bin = getenv("CONTACTS_TEST_BIN_DIR");
+	std::string dir = std::string(bin ? bin : "/tmp") + "/test-output/common";
+	std::filesystem::create_directories(dir);
+	return dir + "/" + name + ".png";
+}
 
 class PickerViewsTest : public ::testing::Test {
 protected:
@@ -79,6 +88,7 @@ TEST_F(PickerViewsTest, RelationshipPickerFiltersByNameAndRaisesTheChosenPerson)
 		ASSERT_TRUE(screen.push(view));
 		EXPECT_EQ(names(view), (std::vector<std::string>{"Anna", "Bert", "Åne"}));
 		EXPECT_EQ(ScreenHarness::naviText(view), "IDS_PB_OPT_RELATIONSHIP_ABB2");
+		EXPECT_TRUE(screen.savePng(shotPath("relationship-picker")));
 
 		// Typing goes through the entry, as markup; case does not matter.
 		elm_entry_entry_set(view->getSearchEntry(), "aN");

@@ -52,24 +52,13 @@ CtPersonPickerView::CtPersonPickerView(const char* titleId)
 
 CtPersonPickerView::~CtPersonPickerView()
 {
-	if (m_watching)
-		contacts_db_remove_changed_cb(_contacts_person._uri, __personsChangedCb, this);
-	if (m_connected)
-		contacts_disconnect();
+	__disconnectFromStore();
 }
 
 Evas_Object* CtPersonPickerView::onCreate(Evas_Object* parent, void*)
 {
 	WENTER();
-	int err = contacts_connect();
-	if (err != CONTACTS_ERROR_NONE)
-		WFAILED("contacts_connect", err);
-	m_connected = err == CONTACTS_ERROR_NONE;
-	err = contacts_db_add_changed_cb(_contacts_person._uri, __personsChangedCb, this);
-	if (err != CONTACTS_ERROR_NONE)
-		WFAILED("contacts_db_add_changed_cb", err);
-	m_watching = err == CONTACTS_ERROR_NONE;
-
+	__connectToStore();
 	Evas_Object* layout = createBaseLayout(parent, nullptr, nullptr);
 	WPRET_VM(!layout, nullptr, "createBaseLayout() is fail");
 	Evas_Object* box = elm_box_add(layout);
@@ -83,6 +72,28 @@ Evas_Object* CtPersonPickerView::onCreate(Evas_Object* parent, void*)
 	return layout;
 }
 
+void CtPersonPickerView::__connectToStore()
+{
+	int err = contacts_connect();
+	if (err != CONTACTS_ERROR_NONE)
+		WFAILED("contacts_connect", err);
+	m_connected = err == CONTACTS_ERROR_NONE;
+	err = contacts_db_add_changed_cb(_contacts_person._uri, __personsChangedCb, this);
+	if (err != CONTACTS_ERROR_NONE)
+		WFAILED("contacts_db_add_changed_cb", err);
+	m_watching = err == CONTACTS_ERROR_NONE;
+}
+
+void CtPersonPickerView::__disconnectFromStore()
+{
+	if (m_watching)
+		contacts_db_remove_changed_cb(_contacts_person._uri, __personsChangedCb, this);
+	m_watching = false;
+	if (m_connected)
+		contacts_disconnect();
+	m_connected = false;
+}
+
 void CtPersonPickerView::onPushed(Elm_Object_Item* naviItem)
 {
 	WENTER();
@@ -92,9 +103,7 @@ void CtPersonPickerView::onPushed(Elm_Object_Item* naviItem)
 void CtPersonPickerView::onDestroy()
 {
 	app_assist::WUiTimer::destroy(m_chooseIdler);
-	if (m_watching)
-		contacts_db_remove_changed_cb(_contacts_person._uri, __personsChangedCb, this);
-	m_watching = false;
+	__disconnectFromStore();
 	m_entry = nullptr;
 	m_genlist = nullptr;
 }

@@ -52,6 +52,8 @@ protected:
 	void onLanguageChanged() override;
 
 private:
+	void __connectToStore();
+	void __disconnectFromStore();
 	Evas_Object* __createSearchEntry(Evas_Object* parent);
 	Evas_Object* __createGenlist(Evas_Object* parent);
 	void __fillList();

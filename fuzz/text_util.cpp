@@ -53,11 +53,22 @@ void fuzzUtf8Walk(const std::string& text)
 	check(steps <= text.size());
 }
 
+bool startEvas()
+{
+	// Headless and quiet: no system modules (D-Bus) behind the main loop.
+	setenv("ECORE_NO_SYSTEM_MODULES", "1", 0);
+	setenv("EINA_LOG_LEVEL", "0", 0);
+	if (evas_init() <= 0)
+		return false;
+	atexit([] { evas_shutdown(); });
+	return true;
+}
+
 } // namespace
 
 extern "C" int LLVMFuzzerTestOneInput(const uint8_t* data, size_t size)
 {
-	static const bool evasReady = evas_init() > 0; // markup parsing logs through evas
+	static const bool evasReady = startEvas(); // markup parsing logs through evas
 	check(evasReady);
 	std::string text(reinterpret_cast<const char*>(data), size);
 	text = text.c_str(); // the helpers take NUL-terminated texts

@@ -4,7 +4,9 @@
 #include "ContactsDebug.h"
 #include "CtCommonAddressbookUtil.h"
 #include "CtCommonRecordUtil.h"
+#include "CtContactsAgentMgr.h"
 #include "CtDbChangeSubscription.h"
+#include "CtEsuAgentMgr.h"
 #include "CtRegistryMgr.h"
 
 #include <glib.h>
@@ -488,6 +490,8 @@ void CtDetailData::setFavorite(bool isFavorite)
 		return;
 	}
 	m_isFavorite = isFavorite;
+	if (CtEsuAgentMgr::getInstance()->getEasySignUpCscFeatureEnabled())
+		CtContactsAgentMgr::getInstance()->syncDataStart(m_personId, nullptr, nullptr);
 }
 
 void CtDetailData::setRingtone(const char* path)

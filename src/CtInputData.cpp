@@ -580,6 +580,9 @@ contacts_record_h CtInputData::getEmergencyNumber()
 	int numberId = m_personId > 0 ? emergencyNumberId(m_personId) : 0;
 	if (numberId <= 0)
 		return m_emergencyNumber;
+	// Callers keep the handle and edit it: the same number keeps its copy.
+	if (m_emergencyNumber && intOf(m_emergencyNumber, _contacts_number.id) == numberId)
+		return m_emergencyNumber;
 	Eina_List* contacts = ctCommonGetContactsList(m_personId);
 	contacts_record_h number = findNumber(contacts, numberId, nullptr);
 	if (number) {

@@ -1,6 +1,6 @@
 // Runs a libFuzzer-style target without libFuzzer: every file named on the
 // command line is one input, then `-runs=N` random inputs (default 1000) of
-// up to 4 KiB, biased towards UTF-8 and markup so the text paths are reached.
+// up to 1.5 KiB, biased towards UTF-8 and markup so the text paths are reached.
 // The seed is printed so that a failing run can be repeated (-seed=S).
 #include <cstdint>
 #include <cstdio>
@@ -25,7 +25,7 @@ const char* const kPieces[] = {
 std::vector<uint8_t> randomInput(std::mt19937& rng)
 {
 	std::vector<uint8_t> input;
-	size_t target = rng() % 4096;
+	size_t target = rng() % 1500;
 	while (input.size() < target) {
 		if (rng() % 3 == 0) {
 			const char* piece = kPieces[rng() % (sizeof(kPieces) / sizeof(kPieces[0]))];

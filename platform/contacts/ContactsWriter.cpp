@@ -220,6 +220,19 @@ int ContactsWriter::__logChange(int contactId, contacts_changed_e change, int ad
 	return rc == SQLITE_DONE ? CONTACTS_ERROR_NONE : m_conn.failed("change log", rc);
 }
 
+int ContactsWriter::__ensureDefaults(int contactId, int personId)
+{
+	for (const char* table : { "numbers", "emails" }) {
+		std::string sql = std::string("UPDATE ") + table + " SET is_default = 1 WHERE id = (SELECT min(id) FROM "
+			+ table + " WHERE contact_id = ? AND owner = 0) AND NOT EXISTS (SELECT 1 FROM " + table
+			+ " t JOIN contacts c ON c.id = t.contact_id WHERE c.person_id = ? AND t.owner = 0 AND t.is_default = 1)";
+		int err = __run(sql.c_str(), { contactId, personId });
+		if (err != CONTACTS_ERROR_NONE)
+			return err;
+	}
+	return CONTACTS_ERROR_NONE;
+}
+
 int ContactsWriter::touchContact(int contactId, contacts_changed_e change)
 {
 	static const ViewInfo* contactView = ContactsSchema::view("contacts.view.contact");
@@ -242,7 +255,9 @@ int ContactsWriter::touchContact(int contactId, contacts_changed_e change)
 	int rc = st->run();
 	if (rc != SQLITE_DONE)
 		return m_conn.failed("update contact", rc);
-	err = m_persons.refresh(record->getInt("person_id"));
+	err = __ensureDefaults(contactId, record->getInt("person_id"));
+	if (err == CONTACTS_ERROR_NONE)
+		err = m_persons.refresh(record->getInt("person_id"));
 	if (err == CONTACTS_ERROR_NONE)
 		err = __logChange(contactId, change, record->getInt("address_book_id"));
 	__touchContactViews();

@@ -53,6 +53,9 @@ private:
 	int __deleteStandaloneChild(const ViewInfo& view, int id);
 	int __deleteAddressBook(int id);
 	int __deleteGroup(int id);
+	// The first number and e-mail of a contact become the defaults when its
+	// person has none.
+	int __ensureDefaults(int contactId, int personId);
 	int __logChange(int contactId, contacts_changed_e change, int addressBookId = -1);
 	int __setIdAfterCommit(contacts_record_s& record, int id);
 	void __touchContactViews();

@@ -4,6 +4,7 @@
 #include "DetailTestStore.h"
 
 #include "ContactsCommon.h"
+#include "CtContactsAgentMgr.h"
 #include "CtCommonAddressbookUtil.h"
 #include "CtCommonRecordUtil.h"
 #include "LogSink.h"
@@ -358,4 +359,23 @@ TEST_F(CtDetailDataLoadTest, GalEntryBuildsInMemoryRecordsAndStoresNothing)
 	int count = -1;
 	ASSERT_EQ(CONTACTS_ERROR_NONE, contacts_db_get_count(_contacts_contact._uri, &count));
 	EXPECT_EQ(0, count);
+}
+
+TEST_F(CtDetailDataLoadTest, FavoriteStartsADataSyncOnlyWithEasySignUp)
+{
+	int personId = addSimplePerson("Synced");
+	CtContactsAgentMgr* agent = CtContactsAgentMgr::getInstance();
+	agent->clearSyncRequests();
+	CtDetailData data(personId);
+	data.setFavorite(true);
+	EXPECT_TRUE(agent->getSyncRequests().empty());
+
+	setenv("CONTACTS_FEATURES", "13", 1);
+	data.setFavorite(false);
+	unsetenv("CONTACTS_FEATURES");
+	ASSERT_EQ(1u, agent->getSyncRequests().size());
+	EXPECT_EQ(CtContactsAgentMgr::SyncKind::PersonData, agent->getSyncRequests().front().kind);
+	EXPECT_EQ(personId, agent->getSyncRequests().front().personId);
+	settle(0.1);
+	agent->clearSyncRequests();
 }

@@ -5,6 +5,7 @@
 #include "ICtChangeListener.h"
 #include "InputTestStore.h"
 
+#include "LogSink.h"
 #include "SqliteFaultInjector.h"
 
 #include <sys/wait.h>
@@ -114,14 +115,18 @@ TEST_F(CtInputDataStoreTest, LaunchRequestsWithBadOrMissingIdsGiveANewContact)
 	int id = storeAda();
 	int person = personOf(id);
 	ASSERT_EQ(contacts_db_delete_record(_contacts_person._uri, person), 0);
-	for (const char* badId : {"", "abc", "12abc", "99999999999999", std::to_string(person).c_str()}) {
+	const std::string deleted = std::to_string(person);
+	for (const std::string& badId : {std::string(), std::string("abc"), std::string("12abc"),
+			 std::string("99999999999999"), deleted}) {
 		Request request(APP_CONTROL_OPERATION_EDIT, {{APP_CONTROL_DATA_ID, badId}});
 		CtInputData data(nullptr, request.get());
 		EXPECT_EQ(data.getContactId(), 0) << badId;
 		EXPECT_EQ(data.getFullName(), "") << badId;
 	}
-	Request unknown("http://velmora.org/appcontrol/operation/pick", {{"name", "Nobody"}});
+	Request unknown(APP_CONTROL_OPERATION_PICK, {{"name", "Nobody"}});
+	ct::log::clear();
 	CtInputData data(nullptr, unknown.get());
+	EXPECT_TRUE(ct::log::contains("* Critical * wrong operation requested " APP_CONTROL_OPERATION_PICK));
 	EXPECT_EQ(data.getContactId(), 0);
 	EXPECT_EQ(data.getFullName(), "");
 	CtInputData noRequest(nullptr, nullptr);
@@ -536,10 +541,12 @@ TEST_F(CtInputDataStoreTest, EmergencyNumberAndStatusComeFromThePerson)
 	contacts_record_h copy = data.getEmergencyNumber();
 	ASSERT_NE(copy, nullptr);
 	EXPECT_EQ(textOf(copy, _contacts_number.number), "0101");
-	EXPECT_EQ(data.getEmergencyNumber(), data.getEmergencyNumber());
 
-	// The copy's text reaches the stored number on update.
+	// The copy's text reaches the stored number on update; asking again
+	// keeps the handle and the edit.
 	contacts_record_set_str(copy, _contacts_number.number, "0999");
+	EXPECT_EQ(data.getEmergencyNumber(), copy);
+	EXPECT_EQ(textOf(copy, _contacts_number.number), "0999");
 	ASSERT_EQ(data.updateContact(), 0);
 	reopen();
 	EXPECT_EQ(snapshot(id), "Ada|Byron|0999|");

@@ -94,3 +94,29 @@ TEST(Atomicity, InsertUpdateDeleteAndLinkLoseNothingWhenTheDiskFills)
 	expectAtomic(store, [&]() { return contacts_db_delete_record(_contacts_person._uri, base); });
 	EXPECT_EQ(0, countOf(_contacts_contact._uri));
 }
+
+TEST(Atomicity, ProfileGroupAndSettingWritesLoseNothingWhenTheDiskFills)
+{
+	ConnectedStore store;
+	insertContact({ "Ann", "Lee", { "1" } });
+	insertContact({ "Bo", "Kim", { "2" } });
+	expectAtomic(store, []() { return contacts_setting_set_name_display_order(CONTACTS_NAME_DISPLAY_ORDER_LASTFIRST); });
+
+	contacts_record_h group = nullptr;
+	contacts_record_create(_contacts_group._uri, &group);
+	RecordPtr groupOwner(group);
+	contacts_record_set_str(group, _contacts_group.name, "Team");
+	expectAtomic(store, [&]() { return contacts_db_insert_record(group, nullptr); });
+	int groupId = intOf(group, _contacts_group.id);
+	expectAtomic(store, [&]() { return contacts_group_add_contact(groupId, 1); });
+	expectAtomic(store, [&]() { return contacts_db_delete_record(_contacts_group._uri, groupId); });
+
+	contacts_record_h profile = nullptr;
+	contacts_record_create(_contacts_my_profile._uri, &profile);
+	RecordPtr profileOwner(profile);
+	contacts_record_h name = addChild(profile, _contacts_my_profile.name, _contacts_name._uri);
+	contacts_record_set_str(name, _contacts_name.first, "Me");
+	contacts_record_set_str(profile, _contacts_my_profile_ex.status, "Here");
+	expectAtomic(store, [&]() { return contacts_db_insert_record(profile, nullptr); });
+	EXPECT_EQ(1, countOf(_contacts_my_profile._uri));
+}

@@ -281,3 +281,33 @@ TEST(Person, UpdatingAProjectedRecordWritesOnlyWhatItHolds)
 	contacts_record_get_bool(read.get(), _contacts_person.is_favorite, &favorite);
 	EXPECT_TRUE(favorite);
 }
+
+TEST(Person, FirstNumberAndEmailBecomeDefaultsUntilAnotherIsChosen)
+{
+	ConnectedStore store;
+	int a = insertContact({ "A", "", { "1", "2" }, { "a@x", "b@x" } });
+	int b = insertContact({ "B", "", { "3" } });
+	int person = personOf(a);
+	RecordPtr contact = getRecord(_contacts_contact._uri, a);
+	contacts_record_h first = nullptr, second = nullptr;
+	contacts_record_get_child_record_at_p(contact.get(), _contacts_contact.number, 0, &first);
+	contacts_record_get_child_record_at_p(contact.get(), _contacts_contact.number, 1, &second);
+	bool isDefault = false;
+	contacts_record_get_bool(first, _contacts_number.is_default, &isDefault);
+	EXPECT_TRUE(isDefault);
+	contacts_record_get_bool(second, _contacts_number.is_default, &isDefault);
+	EXPECT_FALSE(isDefault);
+	int id = 0;
+	contacts_person_get_default_property(CONTACTS_PERSON_PROPERTY_NUMBER, person, &id);
+	EXPECT_EQ(intOf(first, _contacts_number.id), id);
+
+	ASSERT_EQ(CONTACTS_ERROR_NONE, contacts_person_link_person(person, personOf(b)));
+	int secondId = intOf(second, _contacts_number.id);
+	ASSERT_EQ(CONTACTS_ERROR_NONE, contacts_person_set_default_property(CONTACTS_PERSON_PROPERTY_NUMBER, person, secondId));
+	RecordPtr other = getRecord(_contacts_contact._uri, b);
+	ASSERT_EQ(CONTACTS_ERROR_NONE, contacts_db_update_record(other.get()));
+	contacts_person_get_default_property(CONTACTS_PERSON_PROPERTY_NUMBER, person, &id);
+	EXPECT_EQ(secondId, id);
+	contacts_person_get_default_property(CONTACTS_PERSON_PROPERTY_EMAIL, person, &id);
+	EXPECT_GT(id, 0);
+}

@@ -14,6 +14,7 @@ WPageSlideView::~WPageSlideView()
 		evas_object_event_callback_del_full(m_scroller, EVAS_CALLBACK_RESIZE, __scrollerResizeCb, this);
 		evas_object_event_callback_del_full(m_scroller, EVAS_CALLBACK_DEL, __scrollerDelCb, this);
 		evas_object_event_callback_del_full(m_box, EVAS_CALLBACK_RESIZE, __boxResizeCb, this);
+		evas_object_smart_callback_del_full(m_scroller, "scroll,drag,start", __dragStartCb, this);
 	}
 }
 
@@ -39,6 +40,8 @@ Evas_Object* WPageSlideView::createPageSlideContent(Evas_Object* parent)
 	evas_object_size_hint_align_set(m_scroller, EVAS_HINT_FILL, EVAS_HINT_FILL);
 	evas_object_event_callback_add(m_scroller, EVAS_CALLBACK_RESIZE, __scrollerResizeCb, this);
 	evas_object_event_callback_add(m_scroller, EVAS_CALLBACK_DEL, __scrollerDelCb, this);
+	// Once the user moves the pages, a page asked for earlier is no longer kept.
+	evas_object_smart_callback_add(m_scroller, "scroll,drag,start", __dragStartCb, this);
 
 	m_box = elm_box_add(m_scroller);
 	evas_object_event_callback_add(m_box, EVAS_CALLBACK_RESIZE, __boxResizeCb, this);
@@ -154,9 +157,22 @@ void WPageSlideView::__scrollToPage(int index, bool animate)
 void WPageSlideView::__boxResizeCb(void* data, Evas*, Evas_Object*, void*)
 {
 	// Pages grew after a page was asked for: show it again at the new size.
+	// The scroller learns the new content size in its own calculation, after
+	// this callback: showing the page now would be clamped to the old size.
 	auto* self = static_cast<WPageSlideView*>(data);
-	if (self->m_requestedPage >= 0 && self->m_requestedPage < self->getPageCount())
-		self->__scrollToPage(self->m_requestedPage, false);
+	if (self->m_requestedPage < 0)
+		return;
+	WUiTimer::destroy(self->m_reshowIdler);
+	self->m_reshowIdler = WUiTimer::addIdler([self](void*) {
+		if (self->m_requestedPage >= 0 && self->m_requestedPage < self->getPageCount())
+			self->__scrollToPage(self->m_requestedPage, false);
+		return false;
+	}, nullptr, self);
+}
+
+void WPageSlideView::__dragStartCb(void* data, Evas_Object*, void*)
+{
+	static_cast<WPageSlideView*>(data)->m_requestedPage = -1;
 }
 
 void WPageSlideView::__scrollerDelCb(void* data, Evas*, Evas_Object*, void*)

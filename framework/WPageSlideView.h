@@ -47,6 +47,7 @@ private:
 	};
 	static void __scrollerResizeCb(void* data, Evas* e, Evas_Object* obj, void* eventInfo);
 	static void __boxResizeCb(void* data, Evas* e, Evas_Object* obj, void* eventInfo);
+	static void __dragStartCb(void* data, Evas_Object* obj, void* eventInfo);
 	static void __scrollerDelCb(void* data, Evas* e, Evas_Object* obj, void* eventInfo);
 	void __resizePages();
 	void __scrollToPage(int index, bool animate);

@@ -39,9 +39,16 @@ int makeDirectories(const std::string& path)
 
 std::string dataDir()
 {
-	// Read every time: tests point each case at a fresh folder.
+	// The environment is read every time (tests point each case at a fresh
+	// folder); the folder is only created when that choice changes.
+	static thread_local std::string madeDir;
 	std::string dir = chooseDataDir();
-	return makeDirectories(dir) == 0 ? dir : std::string();
+	if (dir == madeDir)
+		return dir;
+	if (makeDirectories(dir) != 0)
+		return std::string();
+	madeDir = dir;
+	return dir;
 }
 
 std::string dataPath(const std::string& name)

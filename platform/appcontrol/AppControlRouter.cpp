@@ -73,6 +73,11 @@ Registration registerOperationHandler(const std::string& operation, Handler hand
 			LaunchRouter::instance().addHandler(false, operation, std::move(handler), std::move(onTerminate)));
 }
 
+bool hasHandler(const std::string& appIdOrOperation)
+{
+	return LaunchRouter::instance().hasHandler(appIdOrOperation);
+}
+
 ScopedReplyCancel::~ScopedReplyCancel()
 {
 	app_control_cancel_replies(m_userData);

@@ -63,6 +63,10 @@ Registration registerAppHandler(const std::string& appId, Handler handler, Termi
 Registration registerOperationHandler(const std::string& operation, Handler handler,
 		TerminateHook onTerminate = {});
 
+// Whether a handler is registered for `appIdOrOperation` (an application id
+// or an operation): whether such an application is installed.
+bool hasHandler(const std::string& appIdOrOperation);
+
 // Cancels the pending replies of one user data when it dies (calls
 // app_control_cancel_replies in the destructor).
 class ScopedReplyCancel {

@@ -174,6 +174,14 @@ std::vector<LaunchRecord> LaunchRouter::records() const
 	return out;
 }
 
+bool LaunchRouter::hasHandler(const std::string& key) const
+{
+	for (const HandlerEntry& entry : m_handlers)
+		if (entry.key == key)
+			return true;
+	return false;
+}
+
 const LaunchRouter::HandlerEntry* LaunchRouter::__findHandler(const app_control_s& h) const
 {
 	bool byAppId = h.appId.has_value() && !h.appId->empty();

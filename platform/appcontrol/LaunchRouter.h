@@ -27,6 +27,7 @@ public:
 
 	uint64_t addHandler(bool byAppId, const std::string& key, Handler handler, TerminateHook onTerminate);
 	void removeHandler(uint64_t id);
+	bool hasHandler(const std::string& key) const;
 
 	int send(app_control_h h, app_control_reply_cb replyCb, void* userData);
 	int reply(uint64_t launchId, app_control_h reply, app_control_result_e result);

@@ -1,0 +1,216 @@
+#include "CtDetailViewGenlistItem.h"
+
+#include "ContactsAppIds.h"
+#include "ContactsCommon.h"
+#include "ContactsDebug.h"
+#include "CtCommonWidgetUtil.h"
+#include "CtSimMgr.h"
+#include "ui_extension.h"
+
+#include <bundle.h>
+#include <velmora_log_manager.h>
+
+#include <cstring>
+
+namespace {
+
+const char* const kHighlightOpen = "<backing=on backing_color=#BFF6FF linesize=20>";
+const char* const kHighlightClose = "</backing>";
+const char* const kIconEdj = "contacts/image_layout.edj";
+const char* const kDefaultIconColor = "A03O004";
+const char* const kValueTextStyle = "DEFAULT='font=Sans font_size=16 wrap=none'";
+const int kCopyAreaMaxW = 656;
+const int kCopyAreaMaxH = 54;
+
+// The swallow part of the icon layout that a touch part covers.
+const char* iconPartOf(const char* touchPart)
+{
+	if (strcmp(touchPart, "touch.call") == 0)
+		return "elm.icon1";
+	if (strcmp(touchPart, "touch.message") == 0)
+		return "elm.icon3";
+	return "elm.icon";
+}
+
+void recolorIcon(Evas_Object* layout, const char* touchPart, const std::string& code)
+{
+	Evas_Object* button = elm_object_part_content_get(layout, iconPartOf(touchPart));
+	Evas_Object* image = button ? elm_object_content_get(button) : nullptr;
+	if (image)
+		ctCommonSetImageColor(image, code.c_str());
+}
+
+} // namespace
+
+CtDetailViewGenlistItem::CtDetailViewGenlistItem(CtDetailDataBase* data) : m_data(data)
+{
+}
+
+CtDetailViewGenlistItem::~CtDetailViewGenlistItem() = default;
+
+std::string CtDetailViewGenlistItem::getCopyText()
+{
+	return std::string();
+}
+
+int CtDetailViewGenlistItem::getItemType()
+{
+	return DETAIL_ITEM_NONE;
+}
+
+void CtDetailViewGenlistItem::setPowerSaving(bool)
+{
+}
+
+std::string CtDetailViewGenlistItem::getIconColorCode()
+{
+	CtSimMgr* sim = CtSimMgr::getInstance();
+	const char* code = sim ? sim->getSimColor(sim->getAvailableSimForIcon()) : nullptr;
+	return code && *code ? code : kDefaultIconColor;
+}
+
+Elm_Genlist_Item_Class* CtDetailViewGenlistItem::getItemClassNew()
+{
+	Elm_Genlist_Item_Class* itc = elm_genlist_item_class_new();
+	WPRET_VM(!itc, nullptr, "elm_genlist_item_class_new() is fail");
+	itc->item_style = getItemStyle();
+	itc->func.text_get = __textGetCb;
+	itc->func.content_get = __contentGetCb;
+	return itc;
+}
+
+std::string CtDetailViewGenlistItem::getText(const char*)
+{
+	return std::string();
+}
+
+Evas_Object* CtDetailViewGenlistItem::getContent(Evas_Object*, const char*)
+{
+	return nullptr;
+}
+
+void CtDetailViewGenlistItem::onIconClicked(const char*)
+{
+}
+
+std::string CtDetailViewGenlistItem::highlightMain(const std::string& markup) const
+{
+	if (!highlighted || markup.empty())
+		return markup;
+	return kHighlightOpen + markup + kHighlightClose;
+}
+
+std::string CtDetailViewGenlistItem::toMarkup(const char* text)
+{
+	if (!text || !*text)
+		return std::string();
+	char* markup = elm_entry_utf8_to_markup(text);
+	std::string result = markup ? markup : "";
+	free(markup);
+	return result;
+}
+
+std::string CtDetailViewGenlistItem::translate(const char* textId)
+{
+	return ContactsCommon::translate(textId);
+}
+
+std::string CtDetailViewGenlistItem::typeLabel(const char* label)
+{
+	return label && *label ? toMarkup(ContactsCommon::translate(label)) : std::string();
+}
+
+Evas_Object* CtDetailViewGenlistItem::createCopyArea(Evas_Object* parent, const std::string& text)
+{
+	Evas* evas = evas_object_evas_get(parent);
+	Evas_Object* measure = evas_object_textblock_add(evas);
+	Evas_Textblock_Style* style = evas_textblock_style_new();
+	evas_textblock_style_set(style, kValueTextStyle);
+	evas_object_textblock_style_set(measure, style);
+	evas_object_textblock_text_markup_set(measure, toMarkup(text.c_str()).c_str());
+	Evas_Coord w = 0, h = 0;
+	evas_object_textblock_size_native_get(measure, &w, &h);
+	evas_object_del(measure);
+	evas_textblock_style_free(style);
+
+	double scale = ctCommonGetScale();
+	w = std::min<Evas_Coord>((Evas_Coord)(w * elm_config_scale_get()), (Evas_Coord)(kCopyAreaMaxW * scale));
+	h = std::min<Evas_Coord>((Evas_Coord)(h * elm_config_scale_get()), (Evas_Coord)(kCopyAreaMaxH * scale));
+	Evas_Object* area = evas_object_rectangle_add(evas);
+	evas_object_color_set(area, 0, 0, 0, 0);
+	evas_object_size_hint_min_set(area, w, h);
+	evas_object_pass_events_set(area, EINA_TRUE);
+	evas_object_show(area);
+	return area;
+}
+
+Evas_Object* CtDetailViewGenlistItem::createIconLayout(Evas_Object* parent, const char* group)
+{
+	Evas_Object* layout = ctCommonCreateLayout(parent, "contacts/detail_layout.edj", group);
+	if (!layout)
+		WERROR("ctCommonCreateLayout() is fail");
+	return layout;
+}
+
+void CtDetailViewGenlistItem::addIconButton(Evas_Object* layout, const char* part, const char* image,
+		const char* touchPart, bool disabled)
+{
+	WPRET_M(!layout, "Invalid param : layout");
+	Evas_Object* button = uxt_button_add(layout, "btn_with_swallow");
+	WPRET_M(!button, "uxt_button_add() is fail");
+	std::string code = getIconColorCode() + (disabled ? "D" : "");
+	Evas_Object* icon = ctCommonCreateImage(button, kIconEdj, image, code.c_str());
+	elm_object_content_set(button, icon);
+	evas_object_propagate_events_set(button, EINA_FALSE);
+	elm_object_part_content_set(layout, part, button);
+	if (disabled)
+		return;
+	elm_layout_signal_callback_add(layout, "mouse,clicked,*", touchPart, __iconClickedCb, this);
+	elm_layout_signal_callback_add(layout, "mouse,down,*", touchPart, __iconPressedCb, this);
+	elm_layout_signal_callback_add(layout, "mouse,up,*", touchPart, __iconReleasedCb, this);
+}
+
+void CtDetailViewGenlistItem::insertUsageLog(const char* feature, const char* extra)
+{
+	bundle* b = bundle_create();
+	WPRET_M(!b, "bundle_create() is fail");
+	bundle_add_str(b, "app_id", CONTACTS_APP_ID);
+	bundle_add_str(b, "feature", feature);
+	if (extra)
+		bundle_add_str(b, "extra", extra);
+	velmora_log_manager_h handle = nullptr;
+	if (velmora_log_manager_create(&handle) == 0) {
+		velmora_log_manager_insert(handle, USAGE_LOG_FEATURE_URI, b, 0, 0, nullptr);
+		velmora_log_manager_destroy(handle);
+	}
+	bundle_free(b);
+}
+
+char* CtDetailViewGenlistItem::__textGetCb(void* data, Evas_Object*, const char* part)
+{
+	auto* row = static_cast<CtDetailViewGenlistItem*>(data);
+	std::string text = row ? row->getText(part) : std::string();
+	return text.empty() ? nullptr : strdup(text.c_str());
+}
+
+Evas_Object* CtDetailViewGenlistItem::__contentGetCb(void* data, Evas_Object* obj, const char* part)
+{
+	auto* row = static_cast<CtDetailViewGenlistItem*>(data);
+	return row ? row->getContent(obj, part) : nullptr;
+}
+
+void CtDetailViewGenlistItem::__iconClickedCb(void* data, Evas_Object*, const char*, const char* source)
+{
+	WHIT();
+	static_cast<CtDetailViewGenlistItem*>(data)->onIconClicked(source);
+}
+
+void CtDetailViewGenlistItem::__iconPressedCb(void*, Evas_Object* obj, const char*, const char* source)
+{
+	recolorIcon(obj, source, getIconColorCode() + "P");
+}
+
+void CtDetailViewGenlistItem::__iconReleasedCb(void*, Evas_Object* obj, const char*, const char* source)
+{
+	recolorIcon(obj, source, getIconColorCode());
+}

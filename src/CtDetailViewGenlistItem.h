@@ -1,0 +1,96 @@
+#ifndef _CT_DETAIL_VIEW_GENLIST_ITEM_H_
+#define _CT_DETAIL_VIEW_GENLIST_ITEM_H_
+
+#include "CtDetailDataBase.h"
+#include "WGenlistItem.h"
+
+#include <string>
+
+// Row kinds of the detail lists, as getItemType() answers them.
+enum CtDetailItemType {
+	DETAIL_ITEM_NONE = -1,
+	DETAIL_ITEM_MULTI_IMAGE = 1,
+	DETAIL_ITEM_PROFILE_MULTI_IMAGE = 2,
+	DETAIL_ITEM_STATUS = 3,
+	DETAIL_ITEM_BASIC_INFO = 4,
+	DETAIL_ITEM_PROFILE_SHARING = 6,
+	DETAIL_ITEM_NUMBER = 7,
+	DETAIL_ITEM_VIDEO_CALL = 8,
+	DETAIL_ITEM_EMAIL = 9,
+	DETAIL_ITEM_FACEBOOK = 10,
+	DETAIL_ITEM_ADDRESS = 11,
+	DETAIL_ITEM_MESSENGER = 12,
+	DETAIL_ITEM_WEBSITE = 13,
+	DETAIL_ITEM_RELATION = 14,
+	DETAIL_ITEM_EVENT = 15,
+	DETAIL_ITEM_NOTE = 16,
+	DETAIL_ITEM_RINGTONE = 17,
+	DETAIL_ITEM_GROUPS = 18,
+	DETAIL_ITEM_LINK = 19,
+};
+
+// Base of every row of the contact detail list: the item class built from
+// the row's style, text and content, the copy text for the long-press popup
+// and the highlight while that popup is open.
+class CtDetailViewGenlistItem : public app_assist::WGenlistItem {
+public:
+	// `data` is not owned and must outlive the row.
+	explicit CtDetailViewGenlistItem(CtDetailDataBase* data);
+	~CtDetailViewGenlistItem() override;
+
+	// The text the copy popup copies; empty when the row has nothing to copy.
+	virtual std::string getCopyText();
+	virtual int getItemType();
+	// Rows that depend on power saving (video call, e-mail, address) take the
+	// new state; the caller updates the item.
+	virtual void setPowerSaving(bool on);
+
+	void setHighlighted(bool on) { highlighted = on; }
+	bool isHighlighted() const { return highlighted; }
+	CtDetailDataBase* getData() const { return m_data; }
+
+	// The colour code of action icons: the SIM colour when one SIM is in use, else "A03O004".
+	static std::string getIconColorCode();
+
+public: // WGenlistItem
+	Elm_Genlist_Item_Class* getItemClassNew() override;
+
+protected:
+	virtual const char* getItemStyle() = 0;
+	// Text of `part`, markup; empty for none.
+	virtual std::string getText(const char* part);
+	virtual Evas_Object* getContent(Evas_Object* genlist, const char* part);
+	// An action icon of the row ("touch.call", "touch.message" or "touch.icon") was tapped.
+	virtual void onIconClicked(const char* touchPart);
+
+	// `markup` wrapped in the highlight backing while the copy popup is open.
+	std::string highlightMain(const std::string& markup) const;
+	static std::string toMarkup(const char* text);
+	static std::string translate(const char* textId);
+	// A type label of the common library (a translation id or a custom label) as markup.
+	static std::string typeLabel(const char* label);
+	// A transparent rectangle as large as `text` is drawn in the value font,
+	// at most 656 x 54 (scaled).
+	static Evas_Object* createCopyArea(Evas_Object* parent, const std::string& text);
+	// The icon layout `group` of "contacts/detail_layout.edj" with the
+	// buttons added by addIconButton.
+	static Evas_Object* createIconLayout(Evas_Object* parent, const char* group);
+	// Puts a "btn_with_swallow" button showing `image` into `part` of the
+	// icon layout; taps on `touchPart` run onIconClicked.
+	void addIconButton(Evas_Object* layout, const char* part, const char* image, const char* touchPart, bool disabled);
+	// A usage-log record of `feature` (and `extra` when not null); the result is ignored.
+	static void insertUsageLog(const char* feature, const char* extra);
+
+	bool highlighted = false;
+
+private:
+	static char* __textGetCb(void* data, Evas_Object* obj, const char* part);
+	static Evas_Object* __contentGetCb(void* data, Evas_Object* obj, const char* part);
+	static void __iconClickedCb(void* data, Evas_Object* obj, const char* emission, const char* source);
+	static void __iconPressedCb(void* data, Evas_Object* obj, const char* emission, const char* source);
+	static void __iconReleasedCb(void* data, Evas_Object* obj, const char* emission, const char* source);
+
+	CtDetailDataBase* m_data;
+};
+
+#endif

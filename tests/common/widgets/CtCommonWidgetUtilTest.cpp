@@ -1,0 +1,231 @@
+#include "AppControlRouter.h"
+#include "ContactsAppIds.h"
+#include "ContactsCommon.h"
+#include "CtCommonWidgetUtil.h"
+#include "LogSink.h"
+#include "ScreenHarness.h"
+#include "TempDataDir.h"
+
+#include <gtest/gtest.h>
+#include <vconf.h>
+
+#include <cstdlib>
+
+using namespace ct::test;
+
+namespace {
+
+const char* const kImageEdj = "contacts/image_layout.edj";
+
+class WidgetUtilTest : public ::testing::Test {
+protected:
+	Evas_Object* parent() { return m_screen.win(); }
+	std::string picture(int w, int h)
+	{
+		std::string path = m_dir.path() + "/pic" + std::to_string(w) + "x" + std::to_string(h) + ".png";
+		Evas_Object* image = evas_object_image_filled_add(evas_object_evas_get(parent()));
+		evas_object_image_size_set(image, w, h);
+		evas_object_image_data_update_add(image, 0, 0, w, h);
+		EXPECT_TRUE(evas_object_image_save(image, path.c_str(), nullptr, nullptr));
+		evas_object_del(image);
+		return path;
+	}
+	static bool colorClass(Evas_Object* image, int* r, int* g, int* b, int* a)
+	{
+		int r2, g2, b2, a2, r3, g3, b3, a3;
+		return edje_object_color_class_get(elm_image_object_get(image), "ct_icon", r, g, b, a, &r2, &g2, &b2, &a2,
+				&r3, &g3, &b3, &a3);
+	}
+
+	TempDataDir m_dir;
+	ScreenHarness m_screen;
+};
+
+void countCb(void* data, Evas_Object*, void*)
+{
+	++*static_cast<int*>(data);
+}
+
+} // namespace
+
+TEST_F(WidgetUtilTest, LayoutComesFromAResourceNameOrAPathAndBadInputGivesNull)
+{
+	Evas_Object* layout = ctCommonCreateLayout(parent(), "contacts/detail_layout.edj", "list/C/detail/icon");
+	ASSERT_NE(nullptr, layout);
+	const char* group = nullptr;
+	elm_layout_file_get(layout, nullptr, &group);
+	EXPECT_STREQ("list/C/detail/icon", group);
+	std::string path;
+	ASSERT_TRUE(ContactsCommon::getAppEdjePath("contacts/detail_layout.edj", path, true));
+	EXPECT_NE(nullptr, ctCommonCreateLayout(parent(), path.c_str(), "layout/multi_image"));
+
+	ct::log::clear();
+	EXPECT_EQ(nullptr, ctCommonCreateLayout(nullptr, "contacts/detail_layout.edj", "list/C/detail/icon"));
+	EXPECT_EQ(nullptr, ctCommonCreateLayout(parent(), "contacts/missing.edj", "list/C/detail/icon"));
+	EXPECT_EQ(nullptr, ctCommonCreateLayout(parent(), "contacts/detail_layout.edj", "no/such/group"));
+	EXPECT_EQ(nullptr, ctCommonCreateLayout(parent(), "contacts/detail_layout.edj", nullptr));
+	EXPECT_TRUE(ct::log::contains("* Critical * "));
+}
+
+TEST_F(WidgetUtilTest, ImageTakesTheColourOfItsCodeWithPressedAndDisabledVariants)
+{
+	int r, g, b, a, br, bg, bb, ba;
+	ASSERT_TRUE(ctCommonGetThemeColor("A03O004", &br, &bg, &bb, &ba));
+	Evas_Object* normal = ctCommonCreateImage(parent(), kImageEdj, "contacts_btn_ic_call.png", "A03O004");
+	ASSERT_NE(nullptr, normal);
+	ASSERT_TRUE(colorClass(normal, &r, &g, &b, &a));
+	EXPECT_EQ(br, r);
+	EXPECT_EQ(bg, g);
+	EXPECT_EQ(ba, a);
+
+	Evas_Object* pressed = ctCommonCreateImage(parent(), kImageEdj, "contacts_btn_ic_call.png", "A03O004P");
+	ASSERT_TRUE(colorClass(pressed, &r, &g, &b, &a));
+	EXPECT_LT(r + g + b, br + bg + bb);
+	EXPECT_EQ(ba, a);
+	Evas_Object* disabled = ctCommonCreateImage(parent(), kImageEdj, "contacts_btn_ic_call.png", "A03O004D");
+	ASSERT_TRUE(colorClass(disabled, &r, &g, &b, &a));
+	EXPECT_EQ(br, r);
+	EXPECT_LT(a, ba);
+
+	// A SIM colour code works like the default one.
+	EXPECT_TRUE(ctCommonGetThemeColor("A03O011", &r, &g, &b, &a));
+	EXPECT_TRUE(ctCommonGetThemeColor("A03O012D", &r, &g, &b, &a));
+	EXPECT_FALSE(ctCommonGetThemeColor("NOPE", &r, &g, &b, &a));
+	EXPECT_FALSE(ctCommonGetThemeColor("NOPEP", &r, &g, &b, &a));
+	EXPECT_FALSE(ctCommonGetThemeColor("P", &r, &g, &b, &a));
+	// An unknown code still gives the image, in its own colours.
+	EXPECT_NE(nullptr, ctCommonCreateImage(parent(), kImageEdj, "contacts_btn_ic_call.png", "NOPE"));
+	EXPECT_EQ(nullptr, ctCommonCreateImage(parent(), kImageEdj, "no_such.png"));
+	EXPECT_EQ(nullptr, ctCommonCreateImage(parent(), "/no/such/file.png", nullptr));
+	EXPECT_EQ(nullptr, ctCommonCreateImage(nullptr, kImageEdj, "contacts_btn_ic_call.png"));
+
+	// A plain picture file is tinted as a whole.
+	Evas_Object* plain = ctCommonCreateImage(parent(), picture(8, 8).c_str(), nullptr);
+	ASSERT_NE(nullptr, plain);
+	ASSERT_TRUE(ctCommonSetImageColor(plain, "A03O004"));
+	evas_object_color_get(plain, &r, &g, &b, &a);
+	EXPECT_EQ(ba, a);
+	EXPECT_FALSE(ctCommonSetImageColor(plain, "NOPE"));
+}
+
+TEST_F(WidgetUtilTest, ButtonAndDeleteButtonCallBackWhenClicked)
+{
+	int clicks = 0;
+	Evas_Object* button = ctCommonCreateButton(parent(), "bottom", "IDS_PB_BUTTON_SHARE_ABB6", countCb, &clicks);
+	ASSERT_NE(nullptr, button);
+	EXPECT_STREQ("bottom", elm_object_style_get(button));
+	EXPECT_EQ(ContactsCommon::translate("IDS_PB_BUTTON_SHARE_ABB6"), ScreenHarness::buttonLabel(button));
+	evas_object_smart_callback_call(button, "clicked", nullptr);
+	Evas_Object* remove = ctCommonCreateDeleteImage(parent(), countCb, &clicks);
+	ASSERT_NE(nullptr, remove);
+	evas_object_smart_callback_call(remove, "clicked", nullptr);
+	EXPECT_EQ(2, clicks);
+	EXPECT_EQ(nullptr, ctCommonCreateButton(nullptr, nullptr, nullptr, nullptr, nullptr));
+}
+
+TEST_F(WidgetUtilTest, SmallPicturesAreLowSizeAndUnreadableOnesAreNot)
+{
+	EXPECT_TRUE(ctCommonIsLowSizeImage(parent(), picture(120, 120).c_str()));
+	EXPECT_TRUE(ctCommonIsLowSizeImage(parent(), picture(900, 100).c_str()));
+	EXPECT_FALSE(ctCommonIsLowSizeImage(parent(), picture(720, 540).c_str()));
+	EXPECT_FALSE(ctCommonIsLowSizeImage(parent(), "/no/such/picture.png"));
+	EXPECT_FALSE(ctCommonIsLowSizeImage(nullptr, picture(10, 10).c_str()));
+	EXPECT_FALSE(ctCommonIsLowSizeImage(parent(), nullptr));
+
+	std::string path = picture(100, 80);
+	Evas_Object* low = ctCommonCreateMaskImageForLowSizeImage(parent(), path.c_str());
+	ASSERT_NE(nullptr, low);
+	Eina_Bool up = EINA_TRUE, down = EINA_FALSE;
+	elm_image_resizable_get(low, &up, &down);
+	EXPECT_FALSE(up);
+	Evas_Object* callerId = ctCommonCreateMaskImageForCallerId(parent(), path.c_str(), 56);
+	ASSERT_NE(nullptr, callerId);
+	EXPECT_TRUE(elm_image_fill_outside_get(callerId));
+	EXPECT_EQ(nullptr, ctCommonCreateMaskImageForCallerId(parent(), "", 56));
+}
+
+TEST_F(WidgetUtilTest, CheckStateIsSetWithoutAChangeEvent)
+{
+	Evas_Object* check = elm_check_add(parent());
+	int changes = 0;
+	evas_object_smart_callback_add(check, "changed", countCb, &changes);
+	ctCommonChecktStateSet(check, EINA_TRUE, 0);
+	EXPECT_TRUE(elm_check_state_get(check));
+	ctCommonChecktStateSet(check, EINA_FALSE, 0);
+	EXPECT_FALSE(elm_check_state_get(check));
+	EXPECT_EQ(0, changes);
+	ctCommonChecktStateSet(nullptr, EINA_TRUE, 0);
+
+	int before = ctCommonGetCpuBoostCount();
+	ctCommonInvokeDbusCpuBoost();
+	EXPECT_EQ(before + 1, ctCommonGetCpuBoostCount());
+}
+
+TEST_F(WidgetUtilTest, ApplicationsAreAvailableWhileTheirHandlersAreRegistered)
+{
+	auto accept = [](app_control_h, const ct::appcontrol::Reply&) { return 0; };
+	std::string maps;
+	EXPECT_FALSE(ctCommoncheckEmailAppEnable());
+	EXPECT_FALSE(ctCommoncheckAccountAppEnable());
+	EXPECT_FALSE(ctCommontGetMapsAppId(maps));
+	EXPECT_EQ("", maps);
+	{
+		auto email = ct::appcontrol::registerOperationHandler(APP_CONTROL_OPERATION_COMPOSE, accept);
+		auto account = ct::appcontrol::registerAppHandler(CT_ACCOUNT_APP_ID, accept);
+		auto viewer = ct::appcontrol::registerOperationHandler(APP_CONTROL_OPERATION_VIEW, accept);
+		EXPECT_TRUE(ctCommoncheckEmailAppEnable());
+		EXPECT_TRUE(ctCommoncheckAccountAppEnable());
+		EXPECT_TRUE(ctCommontGetMapsAppId(maps));
+		EXPECT_EQ(CT_GEO_VIEWER_ID, maps);
+		auto mapsApp = ct::appcontrol::registerAppHandler(MAPS_APP_ID, accept);
+		EXPECT_TRUE(ctCommontGetMapsAppId(maps));
+		EXPECT_EQ(MAPS_APP_ID, maps);
+	}
+	EXPECT_FALSE(ctCommoncheckEmailAppEnable());
+	EXPECT_FALSE(ctCommontGetMapsAppId(maps));
+}
+
+TEST_F(WidgetUtilTest, AddressIsPercentEncodedForAGeoQuery)
+{
+	std::string out = "stale";
+	EXPECT_TRUE(ctCommontEncodeAddress("12 Main St, Springfield", out));
+	EXPECT_EQ("12%20Main%20St%2C%20Springfield", out);
+	EXPECT_TRUE(ctCommontEncodeAddress("\"Quoted\" & <tag>?#", out));
+	EXPECT_EQ("%22Quoted%22%20%26%20%3Ctag%3E%3F%23", out);
+	EXPECT_TRUE(ctCommontEncodeAddress("Straße 5", out));
+	EXPECT_EQ("Stra%C3%9Fe%205", out);
+	EXPECT_TRUE(ctCommontEncodeAddress("a-b_c.d~e", out));
+	EXPECT_EQ("a-b_c.d~e", out);
+	EXPECT_FALSE(ctCommontEncodeAddress(nullptr, out));
+	EXPECT_EQ("", out);
+}
+
+TEST_F(WidgetUtilTest, NetworkIsConnectedUnlessTheStatusSaysOff)
+{
+	EXPECT_TRUE(ctCommonCheckNetworkEnable());
+	ASSERT_EQ(0, vconf_set_int(CT_NETWORK_STATUS_KEY, 0));
+	EXPECT_FALSE(ctCommonCheckNetworkEnable());
+	ASSERT_EQ(0, vconf_set_int(CT_NETWORK_STATUS_KEY, 2));
+	EXPECT_TRUE(ctCommonCheckNetworkEnable());
+}
+
+TEST_F(WidgetUtilTest, HighlightIsOffForScriptsThatJoinLetters)
+{
+	const char* saved = getenv("LANGUAGE");
+	std::string previous = saved ? saved : "";
+	setenv("LANGUAGE", "ar_AE", 1);
+	EXPECT_FALSE(ctCommonCheckHighlightSupported());
+	setenv("LANGUAGE", "en_US", 1);
+	EXPECT_TRUE(ctCommonCheckHighlightSupported());
+	if (saved)
+		setenv("LANGUAGE", previous.c_str(), 1);
+	else
+		unsetenv("LANGUAGE");
+}
+
+TEST_F(WidgetUtilTest, ScaleIsTheToolkitScaleOverTheBaseScale)
+{
+	EXPECT_DOUBLE_EQ(elm_config_scale_get() / (elm_app_base_scale_get() > 0 ? elm_app_base_scale_get() : 1.0),
+			ctCommonGetScale());
+	EXPECT_GT(ctCommonGetScale(), 0.0);
+}

@@ -205,23 +205,6 @@ bool ctCommontGetMapsAppId(std::string& out)
 	return !out.empty();
 }
 
-bool ctCommontEncodeAddress(const char* text, std::string& out)
-{
-	out.clear();
-	WPRET_VM(!text, false, "Invalid param : text");
-	static const char kHex[] = "0123456789ABCDEF";
-	for (const unsigned char* p = (const unsigned char*)text; *p; ++p) {
-		if (isalnum(*p) || strchr("-._~", *p)) {
-			out += (char)*p;
-		} else {
-			out += '%';
-			out += kHex[*p >> 4];
-			out += kHex[*p & 0x0F];
-		}
-	}
-	return true;
-}
-
 bool ctCommonCheckNetworkEnable()
 {
 	int status = 1;

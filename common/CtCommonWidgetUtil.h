@@ -3,6 +3,8 @@
 
 #include <Elementary.h>
 
+#include "CtCommonTextUtil.h"
+
 #include <string>
 
 // Widget helpers shared by the contacts screens. All run on the main loop;
@@ -76,9 +78,8 @@ bool ctCommoncheckAccountAppEnable();
 // Returns whether `out` is non-empty.
 bool ctCommontGetMapsAppId(std::string& out);
 
-// `text` percent-encoded for a "geo:0,0?q=" query (RFC 3986 unreserved
-// characters kept). Returns false and leaves `out` empty for null input.
-bool ctCommontEncodeAddress(const char* text, std::string& out);
+// ctCommontEncodeAddress (the "geo:" query text of an address) lives with
+// the text helpers (CtCommonTextUtil.h).
 
 // Whether a data network is connected: the vconf int
 // CT_NETWORK_STATUS_KEY, connected unless it is set to 0.

@@ -2,6 +2,7 @@
 #include "../../data/detail/DetailTestStore.h"
 
 #include "ContactsCommon.h"
+#include "CtCommonAddressbookUtil.h"
 #include "CtGroupGroupInfo.h"
 #include "ScreenHarness.h"
 #include "TempDataDir.h"
@@ -45,7 +46,7 @@ TEST_F(CtGroupGroupInfoTest, GroupsOfSeveralAddressbooksGatherUnderTheirShownNam
 	int phoneFriends = addGroup(0, "Friends club");
 	// A system group shows its translated name whatever its stored name.
 	int accountCoworkers = addGroup(account, "coworkers-raw", "coworkers");
-	std::string coworkers = ContactsCommon::translate("IDS_PB_BODY_CO_WORKERS");
+	std::string coworkers = ctCommonGetDisplayGroupName("coworkers");
 
 	auto infos = CtGroupGroupInfo::gatherByDisplayName(
 		{phoneFamily, accountCoworkers, accountFamily, phoneFriends, phoneFamily});

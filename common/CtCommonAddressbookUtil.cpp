@@ -200,20 +200,19 @@ std::string ctCommonGetDisplayGroupName(const char* systemId)
 {
 	if (!systemId)
 		return "";
-	// The catalogue has no ids for the system groups yet: their English names.
 	static const struct {
 		const char* systemId;
-		const char* name;
+		const char* textId;
 	} kSystemGroups[] = {
-		{"coworkers", "Co-workers"},
-		{"family", "Family"},
-		{"friends", "Friends"},
-		{"emergency", "Emergency contacts"},
-		{"contacts", "My contacts"},
+		{"coworkers", "IDS_PB_BODY_CO_WORKERS"},
+		{"family", "IDS_PB_BODY_FAMILY"},
+		{"friends", "IDS_PB_OPT_FRIENDS"},
+		{"emergency", "IDS_PB_HEADER_EMERGENCY_CONTACTS"},
+		{"contacts", "IDS_PB_BODY_MY_CONTACTS"},
 	};
 	for (const auto& group : kSystemGroups)
 		if (!strcmp(group.systemId, systemId))
-			return group.name;
+			return ContactsCommon::translate(group.textId);
 	return systemId;
 }
 

@@ -37,8 +37,8 @@ std::string ctCommonGetAccountIconPathByAddressbookId(int addressbookId);
 // at most `maxCount` of them (0: all): a new Eina_List of contact records
 // that the caller frees with ctCommonDestroyRecordList. Null when none.
 Eina_List* ctCommonGetWritableContactList(int personId, int maxCount);
-// The shown name of a group with a system id ("coworkers" -> "Co-workers",
-// "family", "friends", "emergency", "contacts"); the system id itself when
+// The shown name of a group with a system id ("coworkers" ->
+// the translated "IDS_PB_BODY_CO_WORKERS", ...); the system id itself when
 // it is not one of the known ones, empty for null.
 std::string ctCommonGetDisplayGroupName(const char* systemId);
 // Id of the default group of an Exchange (EAS) address book: its group with

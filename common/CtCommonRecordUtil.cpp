@@ -353,10 +353,9 @@ const char* CtCommonGetAddressTypeStr(contacts_record_h record, int type)
 
 const char* CtCommonGetMessengerTypeStr(int type, const char* customLabel)
 {
-	// Brand names the catalogue has no id for are shown as they are.
 	static const char* const kIds[] = {"IDS_PB_OPT_OTHER", nullptr, "IDS_PB_OPT_HANGOUTS",
-		"Windows Live Messenger", "IDS_PB_OPT_YAHOO_E", "Facebook", "IDS_PB_OPT_ICQ",
-		"IDS_PB_OPT_AIM", "IDS_PB_OPT_QQ", "IDS_PB_OPT_JABBER", "IDS_PB_BODY_SKYPE", "IRC"};
+		"IDS_PB_OPT_WINDOWS_LIVE_MESSENGER", "IDS_PB_OPT_YAHOO_E", "IDS_PB_OPT_FACEBOOK", "IDS_PB_OPT_ICQ",
+		"IDS_PB_OPT_AIM", "IDS_PB_OPT_QQ", "IDS_PB_OPT_JABBER", "IDS_PB_BODY_SKYPE", "IDS_PB_OPT_IRC"};
 	if (type == CONTACTS_MESSENGER_TYPE_CUSTOM)
 		return customOr(customLabel);
 	if (type < 0 || type >= (int)(sizeof(kIds) / sizeof(kIds[0])))

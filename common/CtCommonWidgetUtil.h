@@ -3,6 +3,8 @@
 
 #include <Elementary.h>
 
+#include "CtCommonTextUtil.h"
+
 #include <string>
 
 // Widget helpers shared by the contacts screens. All run on the main loop;

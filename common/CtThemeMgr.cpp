@@ -1,6 +1,7 @@
 #include "CtThemeMgr.h"
 
 #include "ContactsDebug.h"
+#include "CtLightTheme.h"
 
 #include <cstring>
 
@@ -13,6 +14,9 @@ CtThemeMgr* CtThemeMgr::getInstance()
 void CtThemeMgr::addExtensionTheme(const char* edjPath)
 {
 	WPRET_M(!edjPath || !*edjPath, "Invalid param : edjPath");
+	// The toolkit's widgets around the application's layouts look light too;
+	// the overlay also brings the application's base layout.
+	CtLightTheme::apply();
 	if (hasExtensionTheme(edjPath))
 		return;
 	// Extensions of the default theme reach every widget, popups on the

@@ -168,7 +168,7 @@ TEST_F(CtCommonRecordUtilTest, GroupNamesUseSystemNamesOnceEach)
 	contacts_group_add_contact(hikers, b);
 	int personId = linkContacts({a, b});
 	Eina_List* contacts = ctCommonGetContactsList(personId);
-	EXPECT_EQ("Hikers, Family", ctCommonGetGroupNames(contacts));
+	EXPECT_EQ("Hikers, " + ctCommonGetDisplayGroupName("family"), ctCommonGetGroupNames(contacts));
 	ctCommonDestroyRecordList(contacts);
 	EXPECT_EQ("", ctCommonGetGroupNames(nullptr));
 	EXPECT_EQ("custom_sys", ctCommonGetDisplayGroupName("custom_sys"));
@@ -234,9 +234,9 @@ TEST_F(CtCommonRecordUtilTest, TypeLabelsCoverEveryTypeAndCustomLabels)
 	EXPECT_EQ(tr("IDS_PB_OPT_OTHER"), CtCommonGetAddressTypeStr(CONTACTS_ADDRESS_TYPE_PARCEL, nullptr));
 	EXPECT_STREQ("Cabin", CtCommonGetAddressTypeStr(CONTACTS_ADDRESS_TYPE_CUSTOM, "Cabin"));
 
-	const char* messengers[] = {"IDS_PB_OPT_OTHER", nullptr, "IDS_PB_OPT_HANGOUTS", "Windows Live Messenger",
-		"IDS_PB_OPT_YAHOO_E", "Facebook", "IDS_PB_OPT_ICQ", "IDS_PB_OPT_AIM", "IDS_PB_OPT_QQ",
-		"IDS_PB_OPT_JABBER", "IDS_PB_BODY_SKYPE", "IRC"};
+	const char* messengers[] = {"IDS_PB_OPT_OTHER", nullptr, "IDS_PB_OPT_HANGOUTS", "IDS_PB_OPT_WINDOWS_LIVE_MESSENGER",
+		"IDS_PB_OPT_YAHOO_E", "IDS_PB_OPT_FACEBOOK", "IDS_PB_OPT_ICQ", "IDS_PB_OPT_AIM", "IDS_PB_OPT_QQ",
+		"IDS_PB_OPT_JABBER", "IDS_PB_BODY_SKYPE", "IDS_PB_OPT_IRC"};
 	for (int type = 0; type <= CONTACTS_MESSENGER_TYPE_IRC; ++type)
 		if (messengers[type]) {
 			EXPECT_EQ(tr(messengers[type]), CtCommonGetMessengerTypeStr(type, nullptr)) << type;

@@ -1,0 +1,300 @@
+// The list screens of CtDllViewFactory, pushed headless: what they list, how
+// the search entry filters, and what choosing a row does to the store, the
+// caller's request and the registry signal.
+#include "../../data/detail/DetailTestStore.h"
+
+#include "AppControlRouter.h"
+#include "CtContactPickerView.h"
+#include "CtDllViewFactory.h"
+#include "CtPersonPickerItem.h"
+#include "CtRegistryMgr.h"
+#include "CtUnlinkContactView.h"
+#include "ScreenHarness.h"
+#include "TempDataDir.h"
+
+#include <app_control.h>
+#include <glib.h>
+
+#include <filesystem>
+#include <string>
+#include <vector>
+
+using namespace ct::test;
+
+namespace {
+
+std::string shotPath(const std::string& name)
+{
+	const char* bin = getenv("CONTACTS_TEST_BIN_DIR");
+	std::string dir = std::string(bin ? bin : "/tmp") + "/test-output/common";
+	std::filesystem::create_directories(dir);
+	return dir + "/" + name + ".png";
+}
+
+class PickerViewsTest : public ::testing::Test {
+protected:
+	void SetUp() override { ASSERT_EQ(CONTACTS_ERROR_NONE, contacts_connect()); }
+	void TearDown() override { contacts_disconnect(); }
+
+	static std::vector<std::string> names(CtPersonPickerView* view)
+	{
+		std::vector<std::string> out;
+		for (Elm_Object_Item* item : ScreenHarness::genlistItems(view->getGenlist()))
+			out.push_back(ScreenHarness::itemText(item, "elm.text"));
+		return out;
+	}
+
+	// Taps the row named `name` and lets the choice run.
+	void choose(ScreenHarness& screen, CtPersonPickerView* view, const std::string& name)
+	{
+		for (Elm_Object_Item* item : ScreenHarness::genlistItems(view->getGenlist()))
+			if (ScreenHarness::itemText(item, "elm.text") == name) {
+				ScreenHarness::selectItem(item);
+				screen.pumpUntilIdle();
+				// The choice runs from an idler, which a busy machine delays.
+				screen.pumpFor(0.2);
+				return;
+			}
+		ADD_FAILURE() << "no row " << name;
+	}
+
+	static app_control_h linkRequest(int personId, int max)
+	{
+		app_control_h request = nullptr;
+		app_control_create(&request);
+		app_control_add_extra_data(request, "type", "131");
+		app_control_add_extra_data(request, "ct_selected_person_id", std::to_string(personId).c_str());
+		app_control_add_extra_data(request, "ct_max", std::to_string(max).c_str());
+		app_control_add_extra_data(request, "hide_create_button", "1");
+		return request;
+	}
+
+	TempDataDir m_dir;
+};
+
+} // namespace
+
+TEST_F(PickerViewsTest, RelationshipPickerFiltersByNameAndRaisesTheChosenPerson)
+{
+	int anna = addSimplePerson("Anna");
+	addSimplePerson("Bert");
+	int aane = addSimplePerson("Åne");
+	std::vector<std::pair<ctRegistryKey, int>> signals;
+	int listener = CtRegistryMgr::getInstance()->addChangeListener(
+		[&](ctRegistryKey key, int value) { signals.emplace_back(key, value); });
+	{
+		ScreenHarness screen;
+		auto* view = static_cast<CtPersonPickerView*>(CtDllViewFactory::getInstance()->getCtListViewClassForRelationship());
+		ASSERT_TRUE(screen.push(view));
+		EXPECT_EQ(names(view), (std::vector<std::string>{"Anna", "Bert", "Åne"}));
+		EXPECT_EQ(ScreenHarness::naviText(view), "IDS_PB_OPT_RELATIONSHIP_ABB2");
+		EXPECT_TRUE(screen.savePng(shotPath("relationship-picker")));
+
+		// Typing goes through the entry, as markup; case does not matter.
+		elm_entry_entry_set(view->getSearchEntry(), "aN");
+		screen.pumpUntilIdle();
+		EXPECT_EQ(names(view), (std::vector<std::string>{"Anna"}));
+		elm_entry_entry_set(view->getSearchEntry(), "ÅN");
+		screen.pumpUntilIdle();
+		EXPECT_EQ(names(view), (std::vector<std::string>{"Åne"}));
+		elm_entry_entry_set(view->getSearchEntry(), "zz");
+		screen.pumpUntilIdle();
+		EXPECT_TRUE(names(view).empty());
+		elm_entry_entry_set(view->getSearchEntry(), "");
+		screen.pumpUntilIdle();
+		ASSERT_EQ(names(view).size(), 3u);
+
+		choose(screen, view, "Åne");
+		EXPECT_EQ(signals, (std::vector<std::pair<ctRegistryKey, int>>{{CT_REGISTRY_KEY_RELATIONSHIP_PERSON, aane}}));
+		EXPECT_TRUE(pumpUntil([&] { return screen.viewCount() == 0; }, 3.0));
+	}
+	CtRegistryMgr::getInstance()->removeChangeListener(listener);
+	EXPECT_GT(anna, 0);
+}
+
+TEST_F(PickerViewsTest, SearchSurvivesInvalidUtf8AndOverlongTexts)
+{
+	addSimplePerson("Anna");
+	addSimplePerson("Ann <b>&amp;</b>");
+	ScreenHarness screen;
+	auto* view = static_cast<CtPersonPickerView*>(CtDllViewFactory::getInstance()->getCtListViewClassForRelationship());
+	ASSERT_TRUE(screen.push(view));
+
+	view->setSearchText("\xc3\x28\xff");
+	EXPECT_TRUE(view->getShownEntries().empty());
+	view->setSearchText("ANN\xff");
+	EXPECT_TRUE(view->getShownEntries().empty());
+	// Names are plain text: markup characters are matched and shown as typed.
+	view->setSearchText("<b>&");
+	ASSERT_EQ(view->getShownEntries().size(), 1u);
+	Elm_Object_Item* row = ScreenHarness::genlistItems(view->getGenlist()).front();
+	EXPECT_EQ(ScreenHarness::itemText(row, "elm.text"), "Ann &lt;b&gt;&amp;amp;&lt;/b&gt;");
+
+	std::string huge(100000, 'a');
+	huge += "\xc3\xa9";
+	view->setSearchText(huge.c_str());
+	EXPECT_TRUE(ScreenHarness::logContains("search text too long"));
+	EXPECT_LE(view->getSearchText().size(), 256u);
+	EXPECT_TRUE(g_utf8_validate(view->getSearchText().c_str(), -1, nullptr));
+	EXPECT_TRUE(view->getShownEntries().empty());
+	view->setSearchText(nullptr);
+	EXPECT_EQ(view->getShownEntries().size(), 2u);
+}
+
+TEST_F(PickerViewsTest, LinkPickerLeavesOutTheBasePersonAndLinksTheChoiceForGood)
+{
+	int baseContact = 0;
+	int base = addSimplePerson("Base", &baseContact);
+	int otherContact = 0;
+	addSimplePerson("Other", &otherContact);
+	addSimplePerson("Third");
+	app_control_h request = linkRequest(base, 9);
+	ContactsData data;
+	data.appControl = request;
+	{
+		ScreenHarness screen;
+		auto* view = static_cast<CtContactPickerView*>(CtDllViewFactory::getInstance()->getCtListViewClass(&data));
+		// The picker keeps its own copy of the request.
+		app_control_destroy(request);
+		ASSERT_TRUE(screen.push(view));
+		EXPECT_EQ(view->getLaunchType(), CtContactPickerView::kTypeLinkContacts);
+		EXPECT_EQ(view->getMaxCount(), 9);
+		EXPECT_EQ(names(view), (std::vector<std::string>{"Other", "Third"}));
+		choose(screen, view, "Other");
+		EXPECT_TRUE(pumpUntil([&] { return screen.viewCount() == 0; }, 3.0));
+	}
+	reopenStore();
+	EXPECT_EQ(personOf(otherContact), base);
+	EXPECT_EQ(personOf(baseContact), base);
+}
+
+TEST_F(PickerViewsTest, LinkPickerWithNoRoomLeftRefusesEveryChoice)
+{
+	int base = addSimplePerson("Base");
+	int otherContact = 0;
+	int other = addSimplePerson("Other", &otherContact);
+	app_control_h request = linkRequest(base, 0);
+	ContactsData data{0, request, nullptr, 0};
+	ScreenHarness screen;
+	auto* view = static_cast<CtPersonPickerView*>(CtDllViewFactory::getInstance()->getCtListViewClass(&data));
+	app_control_destroy(request);
+	ASSERT_TRUE(screen.push(view));
+	choose(screen, view, "Other");
+	EXPECT_TRUE(pumpUntil([] { return ScreenHarness::logContains("ct_max 0"); }, 3.0));
+	EXPECT_EQ(screen.viewCount(), 1);
+	EXPECT_EQ(personOf(otherContact), other);
+}
+
+TEST_F(PickerViewsTest, PickerAnswersTheRequestThatStartedIt)
+{
+	int anna = addSimplePerson("Anna");
+	app_control_h received = nullptr;
+	auto registration = ct::appcontrol::registerAppHandler("org.test.picker", [&](app_control_h request, const auto&) {
+		app_control_clone(&received, request);
+		return 0;
+	});
+	std::vector<std::string> selected;
+	std::string replyId;
+	app_control_h request = nullptr;
+	app_control_create(&request);
+	app_control_set_app_id(request, "org.test.picker");
+	struct Answer {
+		std::vector<std::string>* selected;
+		std::string* id;
+	} answer{&selected, &replyId};
+	ASSERT_EQ(APP_CONTROL_ERROR_NONE, app_control_send_launch_request(request,
+		[](app_control_h, app_control_h reply, app_control_result_e result, void* data) {
+			auto* out = static_cast<Answer*>(data);
+			EXPECT_EQ(result, APP_CONTROL_RESULT_SUCCEEDED);
+			char** values = nullptr;
+			int count = 0;
+			if (app_control_get_extra_data_array(reply, APP_CONTROL_DATA_SELECTED, &values, &count) == 0) {
+				for (int i = 0; i < count; ++i) {
+					out->selected->push_back(values[i]);
+					free(values[i]);
+				}
+				free(values);
+			}
+			char* id = nullptr;
+			if (app_control_get_extra_data(reply, APP_CONTROL_DATA_ID, &id) == 0)
+				*out->id = id;
+			free(id);
+		},
+		&answer));
+	ASSERT_NE(received, nullptr);
+	{
+		ScreenHarness screen;
+		ContactsData data{0, received, nullptr, 0};
+		auto* view = static_cast<CtPersonPickerView*>(CtDllViewFactory::getInstance()->getCtListViewClass(&data));
+		ASSERT_TRUE(screen.push(view));
+		choose(screen, view, "Anna");
+		screen.pumpFor(0.1);
+	}
+	EXPECT_EQ(selected, (std::vector<std::string>{std::to_string(anna)}));
+	EXPECT_EQ(replyId, std::to_string(anna));
+	app_control_destroy(received);
+	app_control_destroy(request);
+}
+
+TEST_F(PickerViewsTest, UnlinkListSplitsContactsOffUntilOneIsLeft)
+{
+	int a = 0, b = 0, c = 0;
+	addSimplePerson("Alpha", &a);
+	addSimplePerson("Beta", &b);
+	addSimplePerson("Gamma", &c);
+	int person = linkContacts({a, b, c});
+	{
+		ScreenHarness screen;
+		auto* view = static_cast<CtUnlinkContactView*>(
+			CtDllViewFactory::getInstance()->getCtListUnlinkContactViewClass(person));
+		ASSERT_TRUE(screen.push(view));
+		EXPECT_EQ(names(view), (std::vector<std::string>{"Alpha", "Beta", "Gamma"}));
+		Elm_Object_Item* first = ScreenHarness::genlistItems(view->getGenlist()).front();
+		EXPECT_FALSE(ScreenHarness::itemText(first, "elm.text.sub").empty());
+
+		choose(screen, view, "Beta");
+		EXPECT_TRUE(pumpUntil([&] { return names(view).size() == 2; }, 3.0));
+		EXPECT_EQ(names(view), (std::vector<std::string>{"Alpha", "Gamma"}));
+		EXPECT_NE(personOf(b), person);
+		choose(screen, view, "Gamma");
+		EXPECT_TRUE(pumpUntil([&] { return screen.viewCount() == 0; }, 3.0));
+	}
+	reopenStore();
+	EXPECT_EQ(personOf(a), person);
+	EXPECT_NE(personOf(b), person);
+	EXPECT_NE(personOf(c), person);
+	EXPECT_NE(personOf(b), personOf(c));
+}
+
+TEST_F(PickerViewsTest, ListFollowsPersonsAddedAndDeletedElsewhereKeepingTheFilter)
+{
+	int anna = addSimplePerson("Anna");
+	ScreenHarness screen;
+	auto* view = static_cast<CtPersonPickerView*>(CtDllViewFactory::getInstance()->getCtListViewClassForRelationship());
+	ASSERT_TRUE(screen.push(view));
+	view->setSearchText("an");
+	addSimplePerson("Hannah");
+	addSimplePerson("Bert");
+	EXPECT_TRUE(pumpUntil([&] { return names(view).size() == 2; }, 2.0));
+	EXPECT_EQ(names(view), (std::vector<std::string>{"Anna", "Hannah"}));
+	ASSERT_EQ(CONTACTS_ERROR_NONE, contacts_db_delete_record(_contacts_person._uri, anna));
+	EXPECT_TRUE(pumpUntil([&] { return names(view).size() == 1; }, 2.0));
+	EXPECT_EQ(names(view), (std::vector<std::string>{"Hannah"}));
+}
+
+TEST_F(PickerViewsTest, FactoryRefusesMissingRequestsAndPersons)
+{
+	auto* factory = CtDllViewFactory::getInstance();
+	EXPECT_EQ(factory->getCtListViewClass(nullptr), nullptr);
+	EXPECT_TRUE(ScreenHarness::logContains("* Critical * Invalid param : data"));
+	ContactsData empty;
+	EXPECT_EQ(factory->getCtListViewClass(&empty), nullptr);
+	EXPECT_EQ(factory->getCtListUnlinkContactViewClass(0), nullptr);
+	EXPECT_EQ(factory->getCtListUnlinkContactViewClass(-4), nullptr);
+
+	// A person that does not exist gives an empty list, not a crash.
+	ScreenHarness screen;
+	auto* view = static_cast<CtUnlinkContactView*>(factory->getCtListUnlinkContactViewClass(999));
+	ASSERT_TRUE(screen.push(view));
+	EXPECT_TRUE(names(view).empty());
+}

@@ -1,0 +1,87 @@
+// Groups of several address books gathered under the name a person sees.
+#include "../../data/detail/DetailTestStore.h"
+
+#include "ContactsCommon.h"
+#include "CtCommonAddressbookUtil.h"
+#include "CtGroupGroupInfo.h"
+#include "ScreenHarness.h"
+#include "TempDataDir.h"
+
+#include <string>
+#include <vector>
+
+using namespace ct::test;
+
+namespace {
+
+int addGroup(int addressbookId, const char* name, const char* systemId = nullptr)
+{
+	contacts_record_h group = nullptr;
+	contacts_record_create(_contacts_group._uri, &group);
+	contacts_record_set_int(group, _contacts_group.address_book_id, addressbookId);
+	if (name)
+		contacts_record_set_str(group, _contacts_group.name, name);
+	if (systemId)
+		contacts_record_set_str(group, _contacts_group.system_id, systemId);
+	int id = 0;
+	EXPECT_EQ(CONTACTS_ERROR_NONE, contacts_db_insert_record(group, &id));
+	contacts_record_destroy(group, true);
+	return id;
+}
+
+class CtGroupGroupInfoTest : public ::testing::Test {
+protected:
+	void SetUp() override { ASSERT_EQ(CONTACTS_ERROR_NONE, contacts_connect()); }
+	void TearDown() override { contacts_disconnect(); }
+	TempDataDir m_dir;
+};
+
+} // namespace
+
+TEST_F(CtGroupGroupInfoTest, GroupsOfSeveralAddressbooksGatherUnderTheirShownName)
+{
+	int account = addAddressbook("work@example.com", 0, 1, "Exchange");
+	int phoneFamily = addGroup(0, "Family");
+	int accountFamily = addGroup(account, "Family");
+	int phoneFriends = addGroup(0, "Friends club");
+	// A system group shows its translated name whatever its stored name.
+	int accountCoworkers = addGroup(account, "coworkers-raw", "coworkers");
+	std::string coworkers = ctCommonGetDisplayGroupName("coworkers");
+
+	auto infos = CtGroupGroupInfo::gatherByDisplayName(
+		{phoneFamily, accountCoworkers, accountFamily, phoneFriends, phoneFamily});
+	ASSERT_EQ(infos.size(), 3u);
+	EXPECT_EQ(infos[0].getName(), "Family");
+	ASSERT_EQ(infos[0].getMembers().size(), 2u);
+	EXPECT_EQ(infos[0].getGroupIdInAddressbook(0), phoneFamily);
+	EXPECT_EQ(infos[0].getGroupIdInAddressbook(account), accountFamily);
+	EXPECT_EQ(infos[1].getName(), coworkers);
+	EXPECT_EQ(infos[1].getSystemId(), "coworkers");
+	EXPECT_EQ(infos[1].getGroupIdInAddressbook(0), 0);
+	EXPECT_EQ(infos[2].getName(), "Friends club");
+
+	// Looking a shown name up in one address book, after a reopen.
+	reopenStore();
+	EXPECT_EQ(CtGroupGroupInfo::findGroupInAddressbook("Family", account), accountFamily);
+	EXPECT_EQ(CtGroupGroupInfo::findGroupInAddressbook(coworkers, account), accountCoworkers);
+	EXPECT_EQ(CtGroupGroupInfo::findGroupInAddressbook("Friends club", account), 0);
+}
+
+TEST_F(CtGroupGroupInfoTest, UnknownIdsNamelessGroupsAndBadTextsAreLeftOutWithALogLine)
+{
+	int family = addGroup(0, "Family");
+	int nameless = addGroup(0, nullptr);
+	auto infos = CtGroupGroupInfo::gatherByDisplayName({9999, -1, 0, nameless, family});
+	ASSERT_EQ(infos.size(), 1u);
+	EXPECT_EQ(infos[0].getName(), "Family");
+	EXPECT_TRUE(ScreenHarness::logContains("contacts_db_get_record() Failed("));
+	EXPECT_TRUE(ScreenHarness::logContains(("group " + std::to_string(nameless) + " has no name").c_str()));
+	EXPECT_TRUE(CtGroupGroupInfo::gatherByDisplayName({}).empty());
+
+	EXPECT_EQ(CtGroupGroupInfo::getDisplayName("Fam\xff" "ily", nullptr), "Fam\xef\xbf\xbdily");
+	EXPECT_EQ(CtGroupGroupInfo::getDisplayName(nullptr, nullptr), "");
+	EXPECT_EQ(CtGroupGroupInfo::getDisplayName("Own", "not-a-system-group"), "Own");
+	EXPECT_EQ(CtGroupGroupInfo::findGroupInAddressbook("", 0), 0);
+	EXPECT_EQ(CtGroupGroupInfo::findGroupInAddressbook("Family", 4242), 0);
+	EXPECT_EQ(CtGroupGroupInfo::findGroupInAddressbook(std::string(100000, 'x'), 0), 0);
+}

@@ -1,0 +1,220 @@
+// The light overlay theme: the toolkit's widgets and every detail list item
+// style rendered headless, saved as pictures for review, with the colours a
+// person sees checked at a few points.
+#include "CtLightTheme.h"
+#include "CtThemeMgr.h"
+#include "ContactsCommon.h"
+#include "ScreenHarness.h"
+#include "WPopup.h"
+
+#include <Ecore_Evas.h>
+#include <gtest/gtest.h>
+
+#include <cstdlib>
+#include <filesystem>
+#include <map>
+#include <string>
+#include <vector>
+
+using namespace ct::test;
+
+namespace {
+
+struct Rgb {
+	int r, g, b;
+	int luma() const { return (r * 299 + g * 587 + b * 114) / 1000; }
+};
+
+Rgb pixelAt(Evas_Object* win, int x, int y)
+{
+	Ecore_Evas* ee = ecore_evas_ecore_evas_get(evas_object_evas_get(win));
+	int w = 0;
+	ecore_evas_geometry_get(ee, nullptr, nullptr, &w, nullptr);
+	auto* pixels = static_cast<const unsigned int*>(ecore_evas_buffer_pixels_get(ee));
+	unsigned int argb = pixels[y * w + x];
+	return {int((argb >> 16) & 0xff), int((argb >> 8) & 0xff), int(argb & 0xff)};
+}
+
+std::string shotPath(const std::string& name)
+{
+	const char* bin = getenv("CONTACTS_TEST_BIN_DIR");
+	std::string dir = std::string(bin ? bin : "/tmp") + "/test-output/common";
+	std::filesystem::create_directories(dir);
+	return dir + "/" + name + ".png";
+}
+
+// One row per detail item style, with the texts its screen puts in it.
+struct StyleRow {
+	const char* style;
+	std::map<std::string, std::string> texts;
+};
+
+const std::vector<StyleRow>& detailStyles()
+{
+	static const std::vector<StyleRow> rows = {
+		{"display_name_1line", {{"main.name", "Anna Berg"}}},
+		{"display_name_4line", {{"main.name", "Anna Berg"}, {"sub.name1", "Annie"}, {"sub.name2", "Velmora Ltd"}}},
+		{"detail/2line.bottom", {{"elm.text.sub.left.top", "Mobile"}, {"elm.text.main.left.bottom", "+44 20 7946 0958"}}},
+		{"detail/multiline_main.sub", {{"elm.text.sub", "Notes"}, {"elm.text.multiline", "Met at the spring fair; likes tea."}}},
+		{"detail/multiline_main.sub.1icon", {{"elm.text.main", "Home"}, {"elm.text.multiline", "12 Rosewood Court"}}},
+		{"detail/multiline_main.sub.1icon.2",
+			{{"elm.text.main", "Work"}, {"elm.text.multiline", "221 Long Meadow Road, Little Hampton"}}},
+		{"1line", {{"elm.text.main.left", "Video call"}}},
+		{"2line.bottom", {{"elm.text.main.left.top", "Ringtone"}, {"elm.text.sub.left.bottom", "Over the horizon"}}},
+		{"linked.1text.8icon", {{"elm.text", "Linked contacts"}}},
+	};
+	return rows;
+}
+
+char* styleTextCb(void* data, Evas_Object*, const char* part)
+{
+	auto* row = static_cast<const StyleRow*>(data);
+	auto it = row->texts.find(part);
+	return it == row->texts.end() ? nullptr : strdup(it->second.c_str());
+}
+
+// A screen that loads no application theme.
+class PlainView : public app_assist::WView {
+protected:
+	Evas_Object* onCreate(Evas_Object* parent, void*) override { return elm_box_add(parent); }
+};
+
+// A screen with the toolkit's widgets over a list of every detail style.
+class ShowcaseView : public app_assist::WView {
+public:
+	std::vector<Elm_Genlist_Item_Class*> classes;
+	Evas_Object* genlist = nullptr;
+
+protected:
+	~ShowcaseView() override
+	{
+		for (auto* itc : classes)
+			elm_genlist_item_class_free(itc);
+	}
+	Evas_Object* onCreate(Evas_Object* parent, void*) override
+	{
+		CtThemeMgr::getInstance()->addExtensionTheme(edj("contacts/contacts.edj").c_str());
+		CtThemeMgr::getInstance()->addExtensionTheme(edj("contacts/detail_layout.edj").c_str());
+		Evas_Object* box = elm_box_add(parent);
+		evas_object_size_hint_weight_set(box, EVAS_HINT_EXPAND, EVAS_HINT_EXPAND);
+		Evas_Object* entry = elm_entry_add(box);
+		elm_entry_single_line_set(entry, EINA_TRUE);
+		elm_object_text_set(entry, "Search");
+		pack(box, entry, 0.0);
+		Evas_Object* row = elm_box_add(box);
+		elm_box_horizontal_set(row, EINA_TRUE);
+		Evas_Object* button = elm_button_add(row);
+		elm_object_text_set(button, "Button");
+		pack(row, button, 0.0);
+		Evas_Object* check = elm_check_add(row);
+		elm_object_text_set(check, "Check");
+		elm_check_state_set(check, EINA_TRUE);
+		pack(row, check, 0.0);
+		Evas_Object* radio = elm_radio_add(row);
+		elm_object_text_set(radio, "Radio");
+		pack(row, radio, 0.0);
+		pack(box, row, 0.0);
+		pack(box, __createGenlist(box), EVAS_HINT_EXPAND);
+		return box;
+	}
+
+private:
+	static std::string edj(const char* name)
+	{
+		std::string path;
+		ContactsCommon::getAppEdjePath(name, path);
+		return path;
+	}
+	static void pack(Evas_Object* box, Evas_Object* obj, double weightY)
+	{
+		evas_object_size_hint_weight_set(obj, EVAS_HINT_EXPAND, weightY);
+		evas_object_size_hint_align_set(obj, EVAS_HINT_FILL, EVAS_HINT_FILL);
+		evas_object_show(obj);
+		elm_box_pack_end(box, obj);
+	}
+	Evas_Object* __createGenlist(Evas_Object* parent)
+	{
+		genlist = elm_genlist_add(parent);
+		elm_genlist_mode_set(genlist, ELM_LIST_COMPRESS);
+		for (const StyleRow& row : detailStyles()) {
+			Elm_Genlist_Item_Class* itc = elm_genlist_item_class_new();
+			itc->item_style = row.style;
+			itc->func.text_get = styleTextCb;
+			classes.push_back(itc);
+			elm_genlist_item_append(genlist, itc, &row, nullptr, ELM_GENLIST_ITEM_NONE, nullptr, nullptr);
+		}
+		return genlist;
+	}
+};
+
+// Collects the toolkit's complaints about item styles it could not find.
+class MissingStyleLog {
+public:
+	MissingStyleLog() { eina_log_print_cb_set(&MissingStyleLog::printCb, this); }
+	~MissingStyleLog() { eina_log_print_cb_set(eina_log_print_cb_stderr, nullptr); }
+	std::vector<std::string> lines;
+
+private:
+	static void printCb(const Eina_Log_Domain*, Eina_Log_Level, const char*, const char*, int, const char* fmt,
+		void* data, va_list args)
+	{
+		char text[512];
+		vsnprintf(text, sizeof(text), fmt, args);
+		if (strstr(text, "item style"))
+			static_cast<MissingStyleLog*>(data)->lines.emplace_back(text);
+	}
+};
+
+} // namespace
+
+TEST(LightTheme, ToolkitWidgetsAndDetailStylesLookLight)
+{
+	CtLightTheme::remove();
+	Rgb darkTitle{0, 0, 0};
+	{
+		ScreenHarness screen(360, 640);
+		ASSERT_TRUE(screen.push(new PlainView));
+		darkTitle = pixelAt(screen.win(), 180, 5);
+	}
+	// Screens pick the light look up through the theme manager.
+	EXPECT_FALSE(CtLightTheme::isApplied());
+	MissingStyleLog log;
+	ScreenHarness screen(360, 640);
+	auto* view = new ShowcaseView;
+	ASSERT_TRUE(screen.push(view));
+	EXPECT_TRUE(CtLightTheme::isApplied());
+	EXPECT_TRUE(CtLightTheme::apply());
+	screen.pumpUntilIdle();
+	EXPECT_EQ(ScreenHarness::genlistItems(view->genlist).size(), detailStyles().size());
+	EXPECT_TRUE(log.lines.empty()) << log.lines.front();
+	ASSERT_TRUE(screen.savePng(shotPath("light-widgets-and-detail-styles")));
+
+	Rgb title = pixelAt(screen.win(), 180, 5);
+	EXPECT_LT(darkTitle.luma(), 100);
+	EXPECT_GT(title.luma(), 200) << title.r << "," << title.g << "," << title.b;
+	Rgb content = pixelAt(screen.win(), 5, 630);
+	EXPECT_GT(content.luma(), 200);
+
+	auto* popup = new app_assist::WPopup("Delete", "This contact will be deleted.");
+	popup->addButton("Cancel", nullptr);
+	popup->addButton("Delete", nullptr);
+	popup->attachToView(view);
+	screen.pumpUntilIdle();
+	ASSERT_TRUE(screen.savePng(shotPath("light-popup")));
+	// Popups sit at the bottom of the window.
+	EXPECT_GT(pixelAt(screen.win(), 60, 560).luma(), 220);
+	CtLightTheme::remove();
+	EXPECT_FALSE(CtLightTheme::isApplied());
+}
+
+TEST(LightTheme, MissingOverlayKeepsTheDefaultLook)
+{
+	CtLightTheme::remove();
+	const char* previous = getenv("CONTACTS_RES_DIR");
+	std::string saved = previous ? previous : "";
+	setenv("CONTACTS_RES_DIR", "/nonexistent-res", 1);
+	EXPECT_FALSE(CtLightTheme::apply());
+	EXPECT_FALSE(CtLightTheme::isApplied());
+	EXPECT_TRUE(ScreenHarness::logContains("contacts/light.edj is missing"));
+	setenv("CONTACTS_RES_DIR", saved.c_str(), 1);
+}

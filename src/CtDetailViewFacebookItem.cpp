@@ -3,6 +3,7 @@
 #include "ContactsAppIds.h"
 #include "ContactsDebug.h"
 
+#include <contacts.h>
 #include <glib.h>
 
 #include <cstring>
@@ -71,11 +72,34 @@ void CtDetailViewFacebookItem::onIconClicked(const char*)
 	openProfile();
 }
 
-bool CtDetailViewFacebookItem::readFirstProfile(SocialProfile&)
+namespace {
+
+std::string readText(contacts_record_h record, unsigned int property)
 {
-	// The contacts service keeps no social profiles on contacts yet.
-	WDEBUG("no social profile record");
-	return false;
+	char* text = nullptr;
+	if (contacts_record_get_str_p(record, property, &text) != CONTACTS_ERROR_NONE || !text)
+		return "";
+	return text;
+}
+
+} // namespace
+
+bool CtDetailViewFacebookItem::readFirstProfile(SocialProfile& profile)
+{
+	Eina_List* contacts = getData() ? getData()->getContactsList() : nullptr;
+	WPRET_VM(!contacts, false, "list is nullptr");
+	auto contact = static_cast<contacts_record_h>(eina_list_data_get(contacts));
+	contacts_record_h record = nullptr;
+	int err = contacts_record_get_child_record_at_p(contact, _contacts_contact.profile, 0, &record);
+	if (err != CONTACTS_ERROR_NONE || !record) {
+		WDEBUG("no social profile record");
+		return false;
+	}
+	profile.appId = readText(record, _contacts_profile.app_id);
+	profile.operation = readText(record, _contacts_profile.service_operation);
+	profile.uri = readText(record, _contacts_profile.uri);
+	profile.extraData = readText(record, _contacts_profile.extra_data);
+	return true;
 }
 
 void CtDetailViewFacebookItem::openProfile()

@@ -102,12 +102,28 @@ int ContactsConnection::__checkOrCreateSchema()
 		tables = st.columnInt(0);
 	}
 	if (tables > 0) {
-		db::Statement st = m_db.prepare("SELECT value FROM meta WHERE key = 'schema'");
-		if (!st.valid() || st.step() != SQLITE_ROW || st.columnText(0) != ContactsSchema::schemaTag()) {
+		std::string tag;
+		{
+			db::Statement st = m_db.prepare("SELECT value FROM meta WHERE key = 'schema'");
+			if (st.valid() && st.step() == SQLITE_ROW)
+				tag = st.columnText(0);
+		}
+		if (tag == ContactsSchema::schemaTag())
+			return CONTACTS_ERROR_NONE;
+		const char* upgrade = tag.empty() ? nullptr : ContactsSchema::upgradeSql(tag);
+		if (!upgrade) {
 			WERROR("%s is not a contacts database; left untouched", m_db.path().c_str());
 			return CONTACTS_ERROR_DB;
 		}
-		return CONTACTS_ERROR_NONE;
+		int rc = m_db.exec(upgrade);
+		if (rc != SQLITE_OK)
+			return failed("upgrade schema", rc);
+		db::Statement st = m_db.prepare("UPDATE meta SET value = ? WHERE key = 'schema'");
+		rc = st.bind(1, ContactsSchema::schemaTag()).run();
+		if (rc != SQLITE_DONE)
+			return failed("schema tag", rc);
+		rc = tx.commit();
+		return rc == SQLITE_OK ? CONTACTS_ERROR_NONE : failed("COMMIT", rc);
 	}
 	int rc = m_db.exec(ContactsSchema::createSql());
 	if (rc != SQLITE_OK)

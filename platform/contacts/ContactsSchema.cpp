@@ -41,6 +41,7 @@ const TableInfo kTables[] = {
 	{ 20, "contact_changes", "contact_changes", nullptr, false },
 	{ 21, "phone_logs", "phone_logs", nullptr, false },
 	{ 22, "emergencies", "emergencies", nullptr, false },
+	{ 23, "profiles", "profiles", "owner=0", true },
 };
 
 struct Registry {
@@ -170,7 +171,19 @@ const std::vector<const ViewInfo*>& ContactsSchema::childViews(const ViewInfo& p
 	return it == r.children.end() ? none : it->second;
 }
 
-const char* ContactsSchema::schemaTag() { return "contacts-service/1"; }
+const char* ContactsSchema::schemaTag() { return "contacts-service/2"; }
+
+const char* ContactsSchema::upgradeSql(const std::string& fromTag)
+{
+	if (fromTag == "contacts-service/1")
+		return R"SQL(
+CREATE TABLE profiles(id INTEGER PRIMARY KEY, contact_id INTEGER, owner INTEGER DEFAULT 0, type INTEGER DEFAULT 0,
+	label TEXT, uid TEXT, text TEXT, service_operation TEXT, mime TEXT, app_id TEXT, uri TEXT, category TEXT,
+	extra_data TEXT);
+CREATE INDEX profiles_contact ON profiles(contact_id, owner);
+)SQL";
+	return nullptr;
+}
 
 const char* ContactsSchema::createSql()
 {
@@ -227,6 +240,9 @@ CREATE TABLE notes(id INTEGER PRIMARY KEY, contact_id INTEGER, owner INTEGER DEF
 CREATE TABLE images(id INTEGER PRIMARY KEY, contact_id INTEGER, owner INTEGER DEFAULT 0, type INTEGER DEFAULT 0,
 	label TEXT, path TEXT, is_default INTEGER DEFAULT 0, "order" INTEGER DEFAULT 0);
 CREATE TABLE nicknames(id INTEGER PRIMARY KEY, contact_id INTEGER, owner INTEGER DEFAULT 0, name TEXT);
+CREATE TABLE profiles(id INTEGER PRIMARY KEY, contact_id INTEGER, owner INTEGER DEFAULT 0, type INTEGER DEFAULT 0,
+	label TEXT, uid TEXT, text TEXT, service_operation TEXT, mime TEXT, app_id TEXT, uri TEXT, category TEXT,
+	extra_data TEXT);
 CREATE TABLE companies(id INTEGER PRIMARY KEY, contact_id INTEGER, owner INTEGER DEFAULT 0, type INTEGER DEFAULT 0,
 	label TEXT, name TEXT, department TEXT, job_title TEXT, assistant_name TEXT, role TEXT, logo TEXT,
 	location TEXT, description TEXT, phonetic_name TEXT);
@@ -244,6 +260,7 @@ CREATE INDEX events_contact ON events(contact_id, owner);
 CREATE INDEX notes_contact ON notes(contact_id, owner);
 CREATE INDEX images_contact ON images(contact_id, owner);
 CREATE INDEX nicknames_contact ON nicknames(contact_id, owner);
+CREATE INDEX profiles_contact ON profiles(contact_id, owner);
 CREATE INDEX companies_contact ON companies(contact_id, owner);
 CREATE INDEX group_relations_contact ON group_relations(contact_id, owner);
 CREATE INDEX group_relations_group ON group_relations(group_id);

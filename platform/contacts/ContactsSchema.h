@@ -60,6 +60,9 @@ public:
 	static const std::vector<const ViewInfo*>& childViews(const ViewInfo& parent);
 	// SQL that creates every table, index, trigger and default row.
 	static const char* createSql();
+	// SQL that brings a database of an older schema tag to the current one,
+	// null when there is no way from `fromTag`.
+	static const char* upgradeSql(const std::string& fromTag);
 	// Stored in the meta table; a database without it is foreign.
 	static const char* schemaTag();
 };

@@ -99,6 +99,7 @@ CONTACTS_CHILD(_contacts_contact, url, _contacts_url)
 CONTACTS_CHILD(_contacts_contact, nickname, _contacts_nickname)
 CONTACTS_CHILD(_contacts_contact, relationship, _contacts_relationship)
 CONTACTS_CHILD(_contacts_contact, group_relation, _contacts_group_relation)
+CONTACTS_CHILD(_contacts_contact, profile, _contacts_profile)
 CONTACTS_VIEW_END(_contacts_contact)
 
 CONTACTS_VIEW(_contacts_my_profile, 6, "contacts.view.my_profile", 0)
@@ -279,6 +280,23 @@ CONTACTS_PROP(_contacts_phone_log, log_type, INT, RW)
 CONTACTS_PROP(_contacts_phone_log, extra_data1, INT, RW)
 CONTACTS_PROP(_contacts_phone_log, extra_data2, STR, RW)
 CONTACTS_VIEW_END(_contacts_phone_log)
+
+/* Social-network profiles of a contact: the application that shows it and
+ * how to launch it (extra_data: Base64 "key:value" pairs joined by ","). */
+CONTACTS_VIEW(_contacts_profile, 23, "contacts.view.profile", 0)
+CONTACTS_PROP(_contacts_profile, id, INT, RO)
+CONTACTS_PROP(_contacts_profile, contact_id, INT, RW)
+CONTACTS_PROP(_contacts_profile, type, INT, RW)
+CONTACTS_PROP(_contacts_profile, label, STR, RW)
+CONTACTS_PROP(_contacts_profile, uid, STR, RW)
+CONTACTS_PROP(_contacts_profile, text, STR, RW)
+CONTACTS_PROP(_contacts_profile, service_operation, STR, RW)
+CONTACTS_PROP(_contacts_profile, mime, STR, RW)
+CONTACTS_PROP(_contacts_profile, app_id, STR, RW)
+CONTACTS_PROP(_contacts_profile, uri, STR, RW)
+CONTACTS_PROP(_contacts_profile, category, STR, RW)
+CONTACTS_PROP(_contacts_profile, extra_data, STR, RW)
+CONTACTS_VIEW_END(_contacts_profile)
 
 /* Emergency contacts: a person and the number to call (value 1: active). */
 CONTACTS_VIEW(_contacts_emergency, 22, "contacts.view.emergency", 0)

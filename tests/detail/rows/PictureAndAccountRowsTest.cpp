@@ -293,13 +293,29 @@ TEST_F(PictureAndAccountRowsTest, SocialProfileOpensInTheSocialAppWithDecodedExt
 	EXPECT_EQ("https://social.example/ari", extraOf(handle, "fb.appcontrol.launch.info"));
 	app_control_destroy(handle);
 
-	CtDetailData* data = load(addSimplePerson("Ari"));
-	auto* row = new CtDetailViewFacebookItem(data);
+	CtDetailData* bare = load(addSimplePerson("Ari"));
+	auto* row = new CtDetailViewFacebookItem(bare);
 	Elm_Object_Item* item = show(row);
 	EXPECT_EQ(DETAIL_ITEM_FACEBOOK, row->getItemType());
 	EXPECT_EQ(ContactsCommon::translate("IDS_PB_MBODY_VIEW_FACEBOOK_PROFILE"), text(item, "elm.text.main.left"));
 	ScreenHarness::selectItem(item);
-	EXPECT_TRUE(m_launches->launches().empty());
+	EXPECT_TRUE(m_launches->launches().empty()) << "a contact without a profile opens nothing";
+
+	contacts_record_h contact = newContact(0, "Bea");
+	contacts_record_h profile = nullptr;
+	ASSERT_EQ(CONTACTS_ERROR_NONE, contacts_record_create(_contacts_profile._uri, &profile));
+	contacts_record_set_str(profile, _contacts_profile.app_id, FACEBOOK_APP_ID);
+	contacts_record_set_str(profile, _contacts_profile.service_operation, APP_CONTROL_OPERATION_VIEW);
+	contacts_record_set_str(profile, _contacts_profile.uri, "fb://profile/7");
+	contacts_record_set_str(profile, _contacts_profile.extra_data, (b64("profile_id") + ":" + b64("7")).c_str());
+	ASSERT_EQ(CONTACTS_ERROR_NONE, contacts_record_add_child_record(contact, _contacts_contact.profile, profile));
+	Elm_Object_Item* stored = show(new CtDetailViewFacebookItem(load(storePerson(contact))));
+	ScreenHarness::selectItem(stored);
+	auto launches = m_launches->launches();
+	ASSERT_EQ(1u, launches.size());
+	EXPECT_EQ(FACEBOOK_APP_ID, launches[0].appId);
+	EXPECT_EQ("fb://profile/7", launches[0].uri);
+	EXPECT_EQ("7", launches[0].extra("profile_id"));
 }
 
 TEST_F(PictureAndAccountRowsTest, ProfileSharingRowTellsTheSharingState)

@@ -154,6 +154,31 @@ TEST(ContactStore, CallsWithoutAConnectionFail)
 	EXPECT_EQ(CONTACTS_ERROR_DB, contacts_db_get_current_version(&version));
 }
 
+TEST(ContactStore, DatabaseOfTheFirstSchemaIsUpgradedKeepingItsContacts)
+{
+	TempDataDir dir;
+	ASSERT_EQ(CONTACTS_ERROR_NONE, contacts_connect());
+	int id = insertContact({ "Old", "", { "555" } });
+	contacts_disconnect();
+	{
+		// What a store written before social profiles existed looks like.
+		ct::db::Database old;
+		ASSERT_EQ(SQLITE_OK, old.open(dir.file("contacts.db"), ct::db::OpenMode::ReadWrite));
+		ASSERT_EQ(SQLITE_OK, old.exec("DROP TABLE profiles; UPDATE meta SET value = 'contacts-service/1' WHERE key = 'schema';"))
+			<< old.errorMessage();
+	}
+	ASSERT_EQ(CONTACTS_ERROR_NONE, contacts_connect());
+	RecordPtr contact = getRecord(_contacts_contact._uri, id);
+	EXPECT_EQ("Old", strOf(contact.get(), _contacts_contact.display_name));
+	contacts_record_h profile = nullptr;
+	ASSERT_EQ(CONTACTS_ERROR_NONE, contacts_record_create(_contacts_profile._uri, &profile));
+	contacts_record_set_str(profile, _contacts_profile.uri, "fb://profile/1");
+	ASSERT_EQ(CONTACTS_ERROR_NONE, contacts_record_add_child_record(contact.get(), _contacts_contact.profile, profile));
+	EXPECT_EQ(CONTACTS_ERROR_NONE, contacts_db_update_record(contact.get()));
+	EXPECT_EQ(1, childCount(getRecord(_contacts_contact._uri, id).get(), _contacts_contact.profile));
+	contacts_disconnect();
+}
+
 TEST(ContactStore, ForeignOrCorruptDatabaseIsReportedAndLeftAlone)
 {
 	TempDataDir dir;

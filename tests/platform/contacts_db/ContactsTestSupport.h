@@ -63,38 +63,38 @@ struct ContactSpec {
 	std::string image;
 };
 
-inline RecordPtr makeContact(const ContactSpec& spec)
+inline RecordPtr makeContact(const ContactSpec& wanted)
 {
 	contacts_record_h contact = nullptr;
 	contacts_record_create(_contacts_contact._uri, &contact);
-	contacts_record_set_int(contact, _contacts_contact.address_book_id, spec.addressBook);
-	if (!spec.first.empty() || !spec.last.empty()) {
+	contacts_record_set_int(contact, _contacts_contact.address_book_id, wanted.addressBook);
+	if (!wanted.first.empty() || !wanted.last.empty()) {
 		contacts_record_h name = addChild(contact, _contacts_contact.name, _contacts_name._uri);
-		if (!spec.first.empty())
-			contacts_record_set_str(name, _contacts_name.first, spec.first.c_str());
-		if (!spec.last.empty())
-			contacts_record_set_str(name, _contacts_name.last, spec.last.c_str());
+		if (!wanted.first.empty())
+			contacts_record_set_str(name, _contacts_name.first, wanted.first.c_str());
+		if (!wanted.last.empty())
+			contacts_record_set_str(name, _contacts_name.last, wanted.last.c_str());
 	}
-	for (const auto& n : spec.numbers) {
+	for (const auto& n : wanted.numbers) {
 		contacts_record_h number = addChild(contact, _contacts_contact.number, _contacts_number._uri);
 		contacts_record_set_str(number, _contacts_number.number, n.c_str());
 		contacts_record_set_int(number, _contacts_number.type, CONTACTS_NUMBER_TYPE_CELL);
 	}
-	for (const auto& e : spec.emails) {
+	for (const auto& e : wanted.emails) {
 		contacts_record_h email = addChild(contact, _contacts_contact.email, _contacts_email._uri);
 		contacts_record_set_str(email, _contacts_email.email, e.c_str());
 	}
-	if (!spec.image.empty()) {
+	if (!wanted.image.empty()) {
 		contacts_record_h image = addChild(contact, _contacts_contact.image, _contacts_image._uri);
-		contacts_record_set_str(image, _contacts_image.path, spec.image.c_str());
+		contacts_record_set_str(image, _contacts_image.path, wanted.image.c_str());
 	}
 	return RecordPtr(contact);
 }
 
 // Inserts the contact; returns its id (0 on failure).
-inline int insertContact(const ContactSpec& spec)
+inline int insertContact(const ContactSpec& wanted)
 {
-	RecordPtr contact = makeContact(spec);
+	RecordPtr contact = makeContact(wanted);
 	int id = 0;
 	EXPECT_EQ(CONTACTS_ERROR_NONE, contacts_db_insert_record(contact.get(), &id));
 	return id;

@@ -2,7 +2,7 @@
 #include "ContactsCommon.h"
 #include "DemoApp.h"
 #include "DemoOptions.h"
-#include "LeakCheckSupport.h"
+#include "ToolkitModules.h"
 
 #include <Elementary.h>
 
@@ -50,7 +50,7 @@ int main(int argc, char** argv)
 		ct::demo::DemoApp app(options);
 		code = app.run();
 	}
-	ct::demo::keepToolkitModulesLoaded();
+	ct::platform::keepToolkitModulesLoaded();
 	elm_shutdown();
 	return code;
 }

@@ -2,16 +2,13 @@
 // name. Each returns a new view for the host to push on its naviframe.
 #pragma once
 
-#include <CtLaunchRequest.h>
-
-namespace app_assist {
-class WView;
-}
+#include <ContactsDetails.h>
 
 namespace ct::demo {
 
-using CreateDetailViewFn = app_assist::WView* (*)(int personId, CtLaunchRequest* request);
-using CreateMyProfileDetailViewFn = app_assist::WView* (*)();
+using CreateDetailViewFn = decltype(&createCtDetailView);
+using CreateGalDetailViewFn = decltype(&createCtDetailViewForGalSearch);
+using CreateMyProfileDetailViewFn = decltype(&createCtMyProfileDetailView);
 
 // Every export, in the order the host reports them.
 inline constexpr const char* kFactoryNames[] = {

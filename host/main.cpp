@@ -9,6 +9,7 @@
 #include <clocale>
 #include <cstdio>
 #include <cstdlib>
+#include <cstring>
 
 namespace {
 
@@ -17,6 +18,15 @@ bool hasDisplay()
 	const char* x11 = getenv("DISPLAY");
 	const char* wayland = getenv("WAYLAND_DISPLAY");
 	return (x11 && *x11) || (wayland && *wayland);
+}
+
+// The screens show translation ids under the plain "C" locale, which
+// machines without a configured language have: show the English texts.
+void useEnglishTextsOnPlainLocale()
+{
+	const char* messages = setlocale(LC_MESSAGES, nullptr);
+	if (messages && (strcmp(messages, "C") == 0 || strncmp(messages, "C.", 2) == 0 || strcmp(messages, "POSIX") == 0))
+		setlocale(LC_MESSAGES, "en_US.UTF-8");
 }
 
 } // namespace
@@ -40,6 +50,7 @@ int main(int argc, char** argv)
 		setenv("ECORE_EVAS_ENGINE", "buffer", 1);
 	}
 	setlocale(LC_ALL, "");
+	useEnglishTextsOnPlainLocale();
 	elm_init(argc, argv);
 	elm_config_scale_set(1.0);
 	if (headless)

@@ -1,14 +1,12 @@
 #include "CtDetailViewGenlistItem.h"
 
-#include "ContactsAppIds.h"
 #include "ContactsCommon.h"
 #include "ContactsDebug.h"
+#include "CtCommonUsageLog.h"
 #include "CtCommonWidgetUtil.h"
 #include "CtSimMgr.h"
 #include "ui_extension.h"
 
-#include <bundle.h>
-#include <velmora_log_manager.h>
 
 #include <cstring>
 
@@ -172,18 +170,7 @@ void CtDetailViewGenlistItem::addIconButton(Evas_Object* layout, const char* par
 
 void CtDetailViewGenlistItem::insertUsageLog(const char* feature, const char* extra)
 {
-	bundle* b = bundle_create();
-	WPRET_M(!b, "bundle_create() is fail");
-	bundle_add_str(b, "app_id", CONTACTS_APP_ID);
-	bundle_add_str(b, "feature", feature);
-	if (extra)
-		bundle_add_str(b, "extra", extra);
-	velmora_log_manager_h handle = nullptr;
-	if (velmora_log_manager_create(&handle) == 0) {
-		velmora_log_manager_insert(handle, USAGE_LOG_FEATURE_URI, b, 0, 0, nullptr);
-		velmora_log_manager_destroy(handle);
-	}
-	bundle_free(b);
+	ctCommonInsertUsageLog(feature, extra);
 }
 
 char* CtDetailViewGenlistItem::__textGetCb(void* data, Evas_Object*, const char* part)

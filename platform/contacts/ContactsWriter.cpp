@@ -3,6 +3,7 @@
 #include "ContactsDebug.h"
 
 #include <ctime>
+#include <cstring>
 #include <set>
 
 namespace ct::contacts {
@@ -58,6 +59,8 @@ std::string cleanedNumber(const char* number)
 }
 
 bool isContactOwned(const ViewInfo& v) { return v.isChild; }
+
+bool isImageTable(const ViewInfo& v) { return strcmp(v.table, "images") == 0; }
 
 } // namespace
 
@@ -169,10 +172,16 @@ int ContactsWriter::__writeChildren(contacts_record_s& record, int ownerId, int 
 				stored.insert(st->columnInt(0));
 		}
 		std::set<int> kept;
+		int position = 0;
 		for (contacts_record_s* c : record.childLists[p.slot]) {
 			int err = __checkChild(child, *c);
 			if (err != CONTACTS_ERROR_NONE)
 				return err;
+			++position;
+			// Pictures keep their place in the picture order: one stored
+			// without an order takes its position among the contact's.
+			if (isImageTable(child) && c->getInt("order") <= 0)
+				c->setInt("order", position);
 			Extra extra = { { "contact_id", intParam(ownerId) }, { "owner", intParam(owner) } };
 			int id = c->getInt("id");
 			if (stored.count(id) && !kept.count(id)) {

@@ -1,0 +1,19 @@
+// The library's entry points for the detail screen.
+#include "ContactsDetails.h"
+
+#include "ContactsDebug.h"
+#include "CtDetailView.h"
+
+app_assist::WView* createCtDetailView(int personId, CtLaunchRequest* request)
+{
+	WENTER();
+	if (personId < 1)
+		return new CtDetailView(request);
+	return new CtDetailView(personId, request);
+}
+
+app_assist::WView* createCtDetailViewForGalSearch(void* galData)
+{
+	WENTER();
+	return new CtDetailView(static_cast<const CtGalSearchData*>(galData));
+}

@@ -1,0 +1,937 @@
+#include "CtDetailView.h"
+
+#include "ContactsAppControlLauncher.h"
+#include "ContactsAppIds.h"
+#include "ContactsCommon.h"
+#include "ContactsDebug.h"
+#include "CtCommonTextUtil.h"
+#include "CtCommonUsageLog.h"
+#include "CtCommonWidgetUtil.h"
+#include "CtDetailData.h"
+#include "CtDetailViewAddressItem.h"
+#include "CtDetailViewCtxPopup.h"
+#include "CtDetailViewEmailItem.h"
+#include "CtDetailViewEventItem.h"
+#include "CtDetailViewFacebookItem.h"
+#include "CtDetailViewGroupsItem.h"
+#include "CtDetailViewLinkItem.h"
+#include "CtDetailViewMessengerItem.h"
+#include "CtDetailViewMultiImageItem.h"
+#include "CtDetailViewNoteItem.h"
+#include "CtDetailViewNumberItem.h"
+#include "CtDetailViewRelationItem.h"
+#include "CtDetailViewRingtoneItem.h"
+#include "CtDetailViewStatusItem.h"
+#include "CtDetailViewVideoCallItem.h"
+#include "CtDetailViewWebsiteItem.h"
+#include "CtEsuAgentMgr.h"
+#include "CtRegistryMgr.h"
+#include "CtSimMgr.h"
+#include "CtThemeMgr.h"
+#include "WNaviframe.h"
+#include "WPopup.h"
+
+#include <app_control.h>
+#include <csc_feature.h>
+#include <ui_extension.h>
+
+#include <cerrno>
+#include <climits>
+#include <cstdlib>
+#include <cstring>
+#include <string>
+
+namespace {
+
+// Row kinds in the order the list shows them.
+enum RowKind {
+	KIND_PICTURE = 0,
+	KIND_STATUS,
+	KIND_NUMBERS,
+	KIND_EMAILS,
+	KIND_SOCIAL_ACCOUNT,
+	KIND_ADDRESSES,
+	KIND_MESSENGERS,
+	KIND_WEBSITES,
+	KIND_RELATIONSHIPS,
+	KIND_EVENTS,
+	KIND_NOTES,
+	KIND_RINGTONE,
+	KIND_GROUPS,
+	KIND_LINKED_ACCOUNTS,
+	KIND_DONE,
+};
+
+constexpr int kFirstFrameRows = 6;
+constexpr double kChangeCoalescingSeconds = 2.0;
+constexpr double kFavoriteSettleSeconds = 0.7;
+constexpr const char* kEdjFiles[] = {"contacts/contacts.edj", "contacts/detail_layout.edj"};
+constexpr const char* kInputNaviItemKey = "input_navi_item";
+constexpr int kMaxAddressBytes = 1024;
+
+// Base-10 strtol as the request gives it; a value outside int is no id.
+int parseId(const char* text)
+{
+	if (!text)
+		return 0;
+	errno = 0;
+	long value = strtol(text, nullptr, 10);
+	if (errno == ERANGE || value > INT_MAX || value < INT_MIN) {
+		WERROR("id out of range : %s", text);
+		return 0;
+	}
+	return static_cast<int>(value);
+}
+
+int readExtraId(app_control_h request, const char* key, bool* present = nullptr)
+{
+	char* value = nullptr;
+	int err = app_control_get_extra_data(request, key, &value);
+	if (present)
+		*present = err == APP_CONTROL_ERROR_NONE && value;
+	int id = parseId(value);
+	free(value);
+	return id;
+}
+
+std::string toMarkup(const char* text)
+{
+	if (!text || !*text)
+		return std::string();
+	char* markup = elm_entry_utf8_to_markup(text);
+	std::string result = markup ? markup : "";
+	free(markup);
+	return result;
+}
+
+void appendNonEmpty(std::string& joined, const char* part)
+{
+	if (!part || !*part)
+		return;
+	if (!joined.empty())
+		joined += ",";
+	joined += part;
+}
+
+CtDetailViewGenlistItem* rowOf(Elm_Object_Item* item)
+{
+	auto* base = static_cast<app_assist::WGenlistItem*>(elm_object_item_data_get(item));
+	return dynamic_cast<CtDetailViewGenlistItem*>(base);
+}
+
+const char* powerSavingIconPart(int itemType)
+{
+	switch (itemType) {
+	case DETAIL_ITEM_VIDEO_CALL:
+	case DETAIL_ITEM_EMAIL:
+		return "elm.icon.2";
+	case DETAIL_ITEM_ADDRESS:
+		return "elm.icon.right";
+	default:
+		return nullptr;
+	}
+}
+
+} // namespace
+
+CtDetailView::CtDetailView(CtLaunchRequest* request)
+{
+	WENTER();
+	__initialize(request);
+	__createData(personIdFromRequest(request));
+}
+
+CtDetailView::CtDetailView(int personId, CtLaunchRequest* request)
+{
+	WENTER();
+	__initialize(request);
+	__createData(personId);
+}
+
+CtDetailView::CtDetailView(const CtGalSearchData* galData)
+{
+	WENTER();
+	__initialize(nullptr);
+	if (!galData) {
+		WERROR("Invalid param : galData");
+		__createData(0);
+		return;
+	}
+	m_galData = galData;
+	m_detailData.reset(new CtDetailData(galData));
+	m_isSimContact = m_detailData->isSimContact();
+}
+
+CtDetailView::~CtDetailView()
+{
+	WENTER();
+	__closePopup();
+	CtRegistryMgr::getInstance()->unRegisterVconfChangedCb(VCONFKEY_SETAPPL_PSMODE, __powerSavingModeChangedCb, this);
+	if (!m_galData) {
+		CtSimMgr::getInstance()->detach(this);
+		__disconnectCallBlock();
+	}
+	if (m_detailData)
+		m_detailData->detachListener();
+	m_detailData.reset();
+}
+
+int CtDetailView::personIdFromRequest(CtLaunchRequest* request)
+{
+	WPRET_VM(!request || !request->appControl, 0, "Invalid param : request");
+	char* operation = nullptr;
+	app_control_get_operation(request->appControl, &operation);
+	int personId = 0;
+	if (!operation || strcmp(operation, APP_CONTROL_OPERATION_DEFAULT) == 0) {
+		personId = readExtraId(request->appControl, "person_id");
+		bool present = false;
+		int ctPersonId = readExtraId(request->appControl, "ct_person_id", &present);
+		if (present)
+			personId = ctPersonId;
+	} else if (strcmp(operation, APP_CONTROL_OPERATION_VIEW) == 0) {
+		personId = readExtraId(request->appControl, APP_CONTROL_DATA_ID);
+	} else {
+		WERROR("wrong operation requested %s", operation);
+	}
+	free(operation);
+	return personId;
+}
+
+int CtDetailView::getPersoinId()
+{
+	WPRET_VM(!m_detailData, 0, "WASSERT! __detailData is null");
+	return m_detailData->getPersonId();
+}
+
+const char* CtDetailView::getClassName()
+{
+	return "CtDetailView";
+}
+
+void CtDetailView::__initialize(CtLaunchRequest* request)
+{
+	m_request = request;
+	CtRegistryMgr::getInstance()->registerVconfChangedCb(VCONFKEY_SETAPPL_PSMODE, __powerSavingModeChangedCb, this);
+	int powerSaving = 0;
+	int err = vconf_get_int(VCONFKEY_SETAPPL_PSMODE, &powerSaving);
+	if (err != VCONF_OK)
+		WWARNING("vconf_get_int() Failed(%d)", err);
+	m_isPowerSaving = powerSaving != 0;
+}
+
+void CtDetailView::__createData(int personId)
+{
+	if (personId < 1)
+		WERROR("no person to show : %d", personId);
+	m_detailData.reset(new CtDetailData(personId));
+	m_isSimContact = m_detailData->isSimContact();
+	m_isCompactLayout = eina_list_count(m_detailData->getAddressList()) <= 1
+		&& eina_list_count(m_detailData->getNoteList()) <= 1;
+}
+
+Evas_Object* CtDetailView::onCreate(Evas_Object* parent, void*)
+{
+	WENTER();
+	Evas_Object* layout = createBaseLayout(parent, nullptr, nullptr);
+	WPRET_VM(!layout, nullptr, "createBaseLayout() failed");
+	__addExtensionThemes();
+	CtThemeMgr::getInstance()->setObjectTheme(layout);
+
+	m_genlist = elm_genlist_add(layout);
+	evas_object_size_hint_weight_set(m_genlist, EVAS_HINT_EXPAND, EVAS_HINT_EXPAND);
+	evas_object_size_hint_align_set(m_genlist, EVAS_HINT_FILL, EVAS_HINT_FILL);
+	elm_genlist_mode_set(m_genlist, ELM_LIST_COMPRESS);
+	elm_genlist_homogeneous_set(m_genlist, m_isCompactLayout ? EINA_TRUE : EINA_FALSE);
+	elm_object_part_content_set(layout, "elm.swallow.content", m_genlist);
+
+	if (!m_galData)
+		__connectCallBlock();
+	evas_object_smart_callback_add(m_genlist, "longpressed", __genlistLongpressedCb, this);
+	evas_object_smart_callback_add(m_genlist, "pressed", __genlistPressedCb, this);
+	evas_object_smart_callback_add(m_genlist, "released", __genlistReleasedCb, this);
+	return layout;
+}
+
+void CtDetailView::__addExtensionThemes()
+{
+	for (const char* edj : kEdjFiles) {
+		std::string path;
+		ContactsCommon::getAppEdjePath(edj, path, true);
+		CtThemeMgr::getInstance()->addExtensionTheme(path.c_str());
+	}
+}
+
+void CtDetailView::__connectCallBlock()
+{
+	int err = phone_misc_connect(&m_callBlock);
+	if (err != PHONE_MISC_ERROR_NONE) {
+		WERROR("phone_misc_connect failed (%d)", err);
+		m_callBlock = nullptr;
+		return;
+	}
+	err = phone_misc_add_block_db_change_cb(m_callBlock, __blockListChangedCb, this);
+	if (err != PHONE_MISC_ERROR_NONE)
+		WWARNING("phone_misc_add_block_db_change_cb() Failed(%d)", err);
+}
+
+void CtDetailView::__disconnectCallBlock()
+{
+	if (!m_callBlock)
+		return;
+	// A UI-gadget host tears the gadget down with its own connections.
+	if (!m_request || !m_request->ug)
+		phone_misc_remove_block_db_change_cb(m_callBlock, __blockListChangedCb);
+	phone_misc_disconnect(m_callBlock);
+	m_callBlock = nullptr;
+}
+
+void CtDetailView::onDestroy()
+{
+	WENTER();
+	if (m_naviframeObj)
+		evas_object_smart_callback_del_full(m_naviframeObj, "transition,finished", __naviTransitionFinishedCb, this);
+	m_naviframeObj = nullptr;
+}
+
+void CtDetailView::onPushed(Elm_Object_Item* naviItem)
+{
+	WENTER();
+	__addAllItems();
+	if (app_assist::WNaviframe* naviframe = getNaviframe()) {
+		m_naviframeObj = naviframe->getEvasObj();
+		evas_object_smart_callback_add(m_naviframeObj, "transition,finished", __naviTransitionFinishedCb, this);
+	}
+	__updateTitle();
+	__updateFavoriteBtn();
+	__showBackButton();
+	if (!m_galData) {
+		m_detailData->attachListener(this);
+		CtSimMgr::getInstance()->attach(this);
+	}
+	enableMoreButton(naviItem, __moreButtonCb, this);
+}
+
+bool CtDetailView::onPop()
+{
+	return true;
+}
+
+void CtDetailView::__addAllItems()
+{
+	if (m_galData) {
+		__addPictureItem();
+		m_currentKind = KIND_NUMBERS;
+		for (int budget = INT_MAX; m_currentKind <= KIND_EMAILS;)
+			__addItemOfKind(budget);
+		m_currentKind = KIND_DONE;
+		return;
+	}
+	m_numberIndex = m_emailIndex = m_noteIndex = m_addressIndex = 0;
+	m_eventIndex = m_relationshipIndex = m_websiteIndex = m_messengerIndex = 0;
+	m_currentKind = KIND_PICTURE;
+	app_assist::WUiTimer::destroy(m_rowAnimator);
+	// The first rows go in at once, so the screen's first frame shows them.
+	if (__addItemsForFrame())
+		m_rowAnimator = app_assist::WUiTimer::addAnimator(
+			[this](void*) { return __addItemsForFrame(); }, nullptr, this);
+}
+
+bool CtDetailView::__addItemsForFrame()
+{
+	if (m_currentKind >= KIND_DONE)
+		return false;
+	int budget = m_currentKind == KIND_PICTURE ? kFirstFrameRows : 1;
+	while (budget > 0 && m_currentKind < KIND_DONE) {
+		if (!__addItemOfKind(budget))
+			break;
+	}
+	return true;
+}
+
+// Adds the next row of the current kind (or moves past it). Returns false
+// when the frame must end now.
+bool CtDetailView::__addItemOfKind(int& budget)
+{
+	CtDetailData* data = m_detailData.get();
+	switch (m_currentKind) {
+	case KIND_PICTURE:
+		if (!m_isSimContact) {
+			__addPictureItem();
+			--budget;
+		}
+		break;
+	case KIND_STATUS: {
+		const char* status = data->getStatus();
+		if (CtEsuAgentMgr::getInstance()->getEasySignUpCscFeatureEnabled() && status && *status) {
+			__appendItem(new CtDetailViewStatusItem(data));
+			--budget;
+		}
+		break;
+	}
+	case KIND_NUMBERS:
+		if (__addListItem(data->getNumberList(), m_numberIndex, budget, &CtDetailView::__makeNumberItem))
+			return true;
+		if (m_numberIndex > 0 && !m_galData) {
+			__appendItem(new CtDetailViewVideoCallItem(this, data, m_isPowerSaving));
+			--budget;
+		}
+		break;
+	case KIND_EMAILS:
+		if (__addListItem(data->getEmailList(), m_emailIndex, budget, &CtDetailView::__makeEmailItem))
+			return true;
+		break;
+	case KIND_SOCIAL_ACCOUNT:
+		if (eina_list_count(data->getContactsList()) == 1 && data->getFacebookMode()) {
+			__appendItem(new CtDetailViewFacebookItem(data));
+			--budget;
+		}
+		break;
+	case KIND_ADDRESSES:
+		if (__addListItem(data->getAddressList(), m_addressIndex, budget, &CtDetailView::__makeAddressItem))
+			return true;
+		break;
+	case KIND_MESSENGERS:
+		if (__addListItem(data->getMessengerList(), m_messengerIndex, budget, &CtDetailView::__makeMessengerItem))
+			return true;
+		break;
+	case KIND_WEBSITES:
+		if (__addListItem(data->getUrlList(), m_websiteIndex, budget, &CtDetailView::__makeWebsiteItem))
+			return true;
+		break;
+	case KIND_RELATIONSHIPS:
+		if (__addListItem(data->getRelationshipList(), m_relationshipIndex, budget, &CtDetailView::__makeRelationItem))
+			return true;
+		break;
+	case KIND_EVENTS:
+		if (__addListItem(data->getEventList(), m_eventIndex, budget, &CtDetailView::__makeEventItem))
+			return true;
+		break;
+	case KIND_NOTES:
+		if (__addListItem(data->getNoteList(), m_noteIndex, budget, &CtDetailView::__makeNoteItem))
+			return true;
+		break;
+	case KIND_RINGTONE: {
+		const char* ringtone = data->getRingtonePath();
+		if (!m_isSimContact && ringtone && *ringtone) {
+			__appendItem(new CtDetailViewRingtoneItem(data));
+			--budget;
+		}
+		break;
+	}
+	case KIND_GROUPS:
+		if (!m_isSimContact && data->getGroupNames() != ContactsCommon::translate("IDS_PB_BODY_NOT_ASSIGNED")) {
+			__appendItem(new CtDetailViewGroupsItem(data));
+			--budget;
+		}
+		break;
+	case KIND_LINKED_ACCOUNTS:
+		__appendItem(new CtDetailViewLinkItem(data));
+		++m_currentKind;
+		return false;
+	default:
+		return false;
+	}
+	++m_currentKind;
+	return true;
+}
+
+// Adds the row at `index` of `list`; false (adding nothing) once the list is done.
+bool CtDetailView::__addListItem(Eina_List* list, int& index, int& budget,
+		CtDetailViewGenlistItem* (CtDetailView::*make)(contacts_record_h))
+{
+	auto* record = static_cast<contacts_record_h>(eina_list_nth(list, index));
+	if (!record)
+		return false;
+	++index;
+	__appendItem((this->*make)(record));
+	--budget;
+	return true;
+}
+
+Elm_Object_Item* CtDetailView::__appendItem(CtDetailViewGenlistItem* row)
+{
+	Elm_Object_Item* item = elm_genlist_item_append(m_genlist, row->getItemClass(), row, nullptr,
+			ELM_GENLIST_ITEM_NONE, row->getSelectCb(), nullptr);
+	if (!item) {
+		WERROR("elm_genlist_item_append() failed");
+		delete row;
+		return nullptr;
+	}
+	row->setElmObjectItem(item);
+	row->attachToView(this);
+	if (row->getItemType() == DETAIL_ITEM_NUMBER) {
+		if (!m_firstNumberItem)
+			m_firstNumberItem = item;
+		m_lastNumberItem = item;
+	}
+	if (powerSavingIconPart(row->getItemType()))
+		elm_object_item_disabled_set(item, m_isPowerSaving ? EINA_TRUE : EINA_FALSE);
+	return item;
+}
+
+CtDetailViewGenlistItem* CtDetailView::__makeNumberItem(contacts_record_h record)
+{
+	return new CtDetailViewNumberItem(m_detailData.get(), record, __getNumberCallBlockStatus(record), m_isSimContact);
+}
+
+CtDetailViewGenlistItem* CtDetailView::__makeEmailItem(contacts_record_h record)
+{
+	return new CtDetailViewEmailItem(m_detailData.get(), record, m_isPowerSaving);
+}
+
+CtDetailViewGenlistItem* CtDetailView::__makeAddressItem(contacts_record_h record)
+{
+	return new CtDetailViewAddressItem(this, m_detailData.get(), record, m_isPowerSaving);
+}
+
+CtDetailViewGenlistItem* CtDetailView::__makeMessengerItem(contacts_record_h record)
+{
+	return new CtDetailViewMessengerItem(m_detailData.get(), record);
+}
+
+CtDetailViewGenlistItem* CtDetailView::__makeWebsiteItem(contacts_record_h record)
+{
+	return new CtDetailViewWebsiteItem(m_detailData.get(), record);
+}
+
+CtDetailViewGenlistItem* CtDetailView::__makeRelationItem(contacts_record_h record)
+{
+	return new CtDetailViewRelationItem(m_detailData.get(), record);
+}
+
+CtDetailViewGenlistItem* CtDetailView::__makeEventItem(contacts_record_h record)
+{
+	return new CtDetailViewEventItem(m_detailData.get(), record);
+}
+
+CtDetailViewGenlistItem* CtDetailView::__makeNoteItem(contacts_record_h record)
+{
+	return new CtDetailViewNoteItem(m_detailData.get(), record);
+}
+
+void CtDetailView::__addPictureItem()
+{
+	__appendItem(new CtDetailViewMultiImageItem(this, m_detailData.get(), __isLowSizePicture()));
+}
+
+bool CtDetailView::__isLowSizePicture()
+{
+	char* first = m_detailData->getImagePath(1);
+	char* second = m_detailData->getImagePath(2);
+	bool lowSize = first && *first && !(second && *second) && ctCommonIsLowSizeImage(getEvasObj(), first);
+	free(first);
+	free(second);
+	return lowSize;
+}
+
+bool CtDetailView::__getNumberCallBlockStatus(contacts_record_h number)
+{
+	WPRET_VM(!number, false, "paramter(number) is nullptr");
+	if (!m_callBlock)
+		return false;
+	char* text = nullptr;
+	contacts_record_get_str_p(number, _contacts_number.number, &text);
+	if (!text || !*text)
+		return false;
+	std::string digits = ContactsCommon::removeNumberDashes(text);
+	int blocked = 0;
+	int result = phone_misc_block_find(m_callBlock, PHONE_MISC_BLOCK_TYPE_CALL, digits.c_str(), &blocked);
+	return result > 0;
+}
+
+void CtDetailView::__updateTitle()
+{
+	Elm_Object_Item* naviItem = getNaviItem();
+	WPRET_M(!naviItem, "naviItem is nullptr");
+	std::string title = toMarkup(m_detailData->getDisplayName());
+	if (title.empty())
+		title = ContactsCommon::translate("IDS_LOGS_MBODY_UNKNOWN");
+	elm_object_item_part_text_set(naviItem, "elm.text.title", title.c_str());
+
+	std::string subtitle;
+	appendNonEmpty(subtitle, m_detailData->getExtraName2());
+	appendNonEmpty(subtitle, m_detailData->getExtraName1First());
+	appendNonEmpty(subtitle, m_detailData->getCompany());
+	elm_object_item_part_text_set(naviItem, "subtitle", subtitle.empty() ? nullptr : toMarkup(subtitle.c_str()).c_str());
+}
+
+void CtDetailView::__updateFavoriteBtn()
+{
+	Elm_Object_Item* naviItem = getNaviItem();
+	WPRET_M(!naviItem, "naviItem is nullptr");
+	WPRET_M(m_isSimContact, "__isSimContact == true");
+	if (elm_object_item_part_content_get(naviItem, "title_right_btn"))
+		return;
+	std::string edj;
+	ContactsCommon::getAppEdjePath("contacts/detail_layout.edj", edj, true);
+	Evas_Object* layout = ctCommonCreateLayout(m_naviframeObj ? m_naviframeObj : getEvasObj(), edj.c_str(), "layout/favorite");
+	WPRET_M(!layout, "layout/favorite is missing");
+	CtThemeMgr::getInstance()->setObjectTheme(layout);
+	Evas_Object* check = elm_check_add(layout);
+	elm_object_style_set(check, "favorite_contact");
+	ctCommonChecktStateSet(check, m_detailData->isFavorite() ? EINA_TRUE : EINA_FALSE, 0);
+	evas_object_smart_callback_add(check, "changed", __favoriteCheckClickedCb, this);
+	evas_object_show(check);
+	elm_object_part_content_set(layout, "icon.favorite", check);
+	elm_object_item_part_content_set(naviItem, "title_right_btn", layout);
+}
+
+void CtDetailView::__showBackButton()
+{
+	Elm_Object_Item* naviItem = getNaviItem();
+	WPRET_M(!naviItem || !m_naviframeObj, "naviItem or naviframe is nullptr");
+	if (elm_object_item_part_content_get(naviItem, "elm.swallow.prev_btn"))
+		return;
+	Evas_Object* button = uxt_button_add(m_naviframeObj, "naviframe/back_btn/default");
+	WPRET_M(!button, "uxt_button_add() failed");
+	evas_object_smart_callback_add(button, "clicked", __backButtonClickedCb, this);
+	elm_object_item_part_content_set(naviItem, "elm.swallow.prev_btn", button);
+}
+
+void CtDetailView::onDbChanged(const char* viewUri)
+{
+	WDEBUG("changed : %s", viewUri ? viewUri : "");
+	if (m_isClosing || app_assist::WUiTimer::isAlive(m_favoriteSettleTimer))
+		return;
+	__addExtensionThemes();
+	CtThemeMgr::getInstance()->setObjectTheme(getEvasObj());
+	if (m_galData)
+		return;
+	if (!m_detailData->isCurrentPersonValid()) {
+		__closeWithScreensAbove();
+		return;
+	}
+	if (app_assist::WUiTimer::isAlive(m_changeTimer)) {
+		++m_pendingChangeCount;
+		return;
+	}
+	__startChangeTimer();
+	__closePopup();
+	__updateGenlist();
+	m_rebuiltWhileShown = true;
+}
+
+void CtDetailView::__startChangeTimer()
+{
+	m_changeTimer = app_assist::WUiTimer::addTimer(kChangeCoalescingSeconds, [this](void*) {
+		m_changeTimer.reset();
+		if (m_pendingChangeCount > 0) {
+			m_pendingChangeCount = 0;
+			onDbChanged(nullptr);
+		}
+		return false;
+	}, nullptr, this);
+}
+
+void CtDetailView::__closeWithScreensAbove()
+{
+	WENTER();
+	m_isClosing = true;
+	Elm_Object_Item* naviItem = getNaviItem();
+	if (naviItem && m_naviframeObj) {
+		while (Elm_Object_Item* top = elm_naviframe_top_item_get(m_naviframeObj)) {
+			if (top == naviItem)
+				break;
+			elm_object_item_del(top);
+		}
+	}
+	popOut();
+}
+
+void CtDetailView::__updateGenlist()
+{
+	WENTER();
+	if (m_galData)
+		return;
+	int personId = m_detailData->getPersonId();
+	app_assist::WUiTimer::destroy(m_rowAnimator);
+	m_detailData->detachListener();
+	// The rows borrow the old data's records: they go before it does.
+	elm_genlist_clear(m_genlist);
+	m_firstNumberItem = m_lastNumberItem = nullptr;
+	m_detailData.reset(new CtDetailData(personId));
+	m_isSimContact = m_detailData->isSimContact();
+	m_detailData->attachListener(this);
+	__applyCompactLayout();
+	++m_rebuildCount;
+	__updateTitle();
+	__updateFavoriteBtn();
+	__addAllItems();
+}
+
+void CtDetailView::__applyCompactLayout()
+{
+	m_isCompactLayout = eina_list_count(m_detailData->getAddressList()) <= 1
+		&& eina_list_count(m_detailData->getNoteList()) <= 1;
+	elm_genlist_homogeneous_set(m_genlist, m_isCompactLayout ? EINA_TRUE : EINA_FALSE);
+}
+
+void CtDetailView::onCompleteGetContacts()
+{
+	WHIT();
+}
+
+void CtDetailView::onConditionChagned()
+{
+	WHIT();
+}
+
+void CtDetailView::onSimChanged()
+{
+	WHIT();
+	if (m_genlist)
+		elm_genlist_realized_items_update(m_genlist);
+}
+
+void CtDetailView::onLanguageChanged()
+{
+	WHIT();
+	__updateTitle();
+	if (m_genlist)
+		elm_genlist_realized_items_update(m_genlist);
+}
+
+void CtDetailView::__onBlockListChanged()
+{
+	WHIT();
+	if (!m_firstNumberItem || !m_lastNumberItem)
+		return;
+	for (Elm_Object_Item* item = m_firstNumberItem; item; item = elm_genlist_item_next_get(item)) {
+		if (auto* row = dynamic_cast<CtDetailViewNumberItem*>(rowOf(item))) {
+			row->setBlocked(__getNumberCallBlockStatus(row->getRecord()));
+			elm_genlist_item_fields_update(item, "elm.icon.left.bottom", ELM_GENLIST_ITEM_FIELD_CONTENT);
+		}
+		if (item == m_lastNumberItem)
+			break;
+	}
+}
+
+void CtDetailView::__onPowerSavingChanged(bool on)
+{
+	m_isPowerSaving = on;
+	WPRET_M(!m_genlist, "__genlist is nullptr");
+	for (Elm_Object_Item* item = elm_genlist_first_item_get(m_genlist); item; item = elm_genlist_item_next_get(item)) {
+		CtDetailViewGenlistItem* row = rowOf(item);
+		const char* part = row ? powerSavingIconPart(row->getItemType()) : nullptr;
+		if (!part)
+			continue;
+		row->setPowerSaving(on);
+		elm_object_item_disabled_set(item, on ? EINA_TRUE : EINA_FALSE);
+		elm_genlist_item_fields_update(item, part, ELM_GENLIST_ITEM_FIELD_CONTENT);
+	}
+}
+
+void CtDetailView::__startFavoriteSettleTimer()
+{
+	app_assist::WUiTimer::destroy(m_favoriteSettleTimer);
+	m_favoriteSettleTimer = app_assist::WUiTimer::addTimer(kFavoriteSettleSeconds, [this](void*) {
+		m_favoriteSettleTimer.reset();
+		CtRegistryMgr::getInstance()->raiseChangeSignal(CT_REGISTRY_KEY_FAVORITE_CHANGED, 0);
+		return false;
+	}, nullptr, this);
+}
+
+void CtDetailView::__closePopup()
+{
+	if (auto popup = m_popup.lock())
+		popup->destroy();
+	m_popup.reset();
+}
+
+void CtDetailView::onVideoCallSelected()
+{
+	WHIT();
+	Eina_List* numbers = m_detailData->getNumberList();
+	if (eina_list_count(numbers) == 1)
+		__launchVideoCall(m_detailData->getNumber(static_cast<contacts_record_h>(eina_list_data_get(numbers))));
+	else if (numbers)
+		__showVideoCallPopup();
+}
+
+void CtDetailView::__launchVideoCall(const char* number)
+{
+	WPRET_M(!number || !*number, "number is empty");
+	app_control_h request = nullptr;
+	int err = app_control_create(&request);
+	WPRET_M(err != APP_CONTROL_ERROR_NONE, "app_control_create() Failed(%d)", err);
+	std::string uri = std::string("tel:") + number;
+	app_control_set_operation(request, VIDEO_CALL_OPERATION);
+	app_control_set_uri(request, uri.c_str());
+	int personId = m_detailData->getPersonId();
+	if (personId > 0)
+		app_control_add_extra_data(request, "ctindex", std::to_string(personId).c_str());
+	err = app_control_send_launch_request(request, nullptr, nullptr);
+	if (err != APP_CONTROL_ERROR_NONE)
+		WWARNING("app_control_send_launch_request() Failed(%d)", err);
+	app_control_destroy(request);
+	ctCommonInsertUsageLog("PH02", "Contacts_detail");
+}
+
+void CtDetailView::__showVideoCallPopup()
+{
+	auto* popup = new app_assist::WPopup();
+	popup->setTextTranslatable("contacts");
+	popup->setTitle("IDS_PB_OPT_VIDEO_CALL");
+	popup->setOnAddProperties([](Evas_Object* obj) { elm_object_style_set(obj, "theme_bg"); });
+	std::weak_ptr<app_assist::WControl> alive = getWeakPtr();
+	popup->setContent([this, alive](Evas_Object* parent) {
+		Evas_Object* list = elm_genlist_add(parent);
+		elm_object_style_set(list, "popup");
+		elm_genlist_homogeneous_set(list, EINA_TRUE);
+		elm_genlist_mode_set(list, ELM_LIST_COMPRESS);
+		static Elm_Genlist_Item_Class itc = [] {
+			Elm_Genlist_Item_Class c = {};
+			c.version = ELM_GENLIST_ITEM_CLASS_VERSION;
+			c.item_style = "1line";
+			c.func.text_get = [](void* data, Evas_Object*, const char* part) -> char* {
+				if (strcmp(part, "elm.text") != 0)
+					return nullptr;
+				const char* number = nullptr;
+				contacts_record_get_str_p(static_cast<contacts_record_h>(data), _contacts_number.number,
+						const_cast<char**>(&number));
+				return number ? elm_entry_utf8_to_markup(number) : nullptr;
+			};
+			return c;
+		}();
+		Eina_List* l = nullptr;
+		void* record = nullptr;
+		EINA_LIST_FOREACH(m_detailData->getNumberList(), l, record)
+			elm_genlist_item_append(list, &itc, record, nullptr, ELM_GENLIST_ITEM_NONE, nullptr, nullptr);
+		evas_object_smart_callback_add(list, "selected", [](void* data, Evas_Object*, void* eventInfo) {
+			auto* view = static_cast<CtDetailView*>(data);
+			auto* record = static_cast<contacts_record_h>(elm_object_item_data_get(static_cast<Elm_Object_Item*>(eventInfo)));
+			std::string number = view->m_detailData->getNumber(record) ? view->m_detailData->getNumber(record) : "";
+			view->__closePopup();
+			view->__launchVideoCall(number.c_str());
+		}, this);
+		return list;
+	});
+	attachPopup(popup);
+	m_popup = popup->getWeakPtr();
+}
+
+void CtDetailView::onAddressSelected(contacts_record_h address)
+{
+	WHIT();
+	WPRET_M(!address, "address is nullptr");
+	if (csc_feature_get_bool(CSC_FEATURE_CONTACTS_HIDE_ADDRESS_ROW))
+		return;
+	std::string mapsAppId;
+	ctCommontGetMapsAppId(mapsAppId);
+	WPRET_M(mapsAppId.empty(), "mapsAppId is empty");
+	char text[kMaxAddressBytes] = {0};
+	m_detailData->getAddress(address, text, sizeof(text));
+	std::string markup = toMarkup(text);
+
+	app_control_h request = nullptr;
+	int err = app_control_create(&request);
+	WPRET_M(err != APP_CONTROL_ERROR_NONE, "app_control_create() Failed(%d)", err);
+	app_control_set_launch_mode(request, APP_CONTROL_LAUNCH_MODE_GROUP);
+	if (mapsAppId == MAPS_APP_ID) {
+		app_control_set_app_id(request, MAPS_APP_ID);
+		app_control_add_extra_data(request, "searchByName", markup.c_str());
+	} else {
+		std::string encoded;
+		ctCommontEncodeAddress(markup.c_str(), encoded);
+		char uri[kMaxAddressBytes] = {0};
+		snprintf(uri, sizeof(uri), "geo:0,0?q=\"%s\"", encoded.c_str());
+		app_control_set_operation(request, APP_CONTROL_OPERATION_VIEW);
+		app_control_set_uri(request, uri);
+	}
+	if (!ContactsAppControlLauncher::getInstance()->sendLaunchRequest(request))
+		WERROR("launch Failed");
+	app_control_destroy(request);
+}
+
+void CtDetailView::onImageSelected(int page)
+{
+	WHIT();
+	// The full-screen picture view comes with its own screen; until then the
+	// tap is only noted.
+	WDEBUG("picture page %d selected", page);
+}
+
+void CtDetailView::__powerSavingModeChangedCb(keynode_t* node, void* data)
+{
+	WHIT();
+	WPRET_M(!data, "Invalid param : data");
+	static_cast<CtDetailView*>(data)->__onPowerSavingChanged(node && vconf_keynode_get_int(node) != 0);
+}
+
+void CtDetailView::__blockListChangedCb(void* data)
+{
+	WHIT();
+	WPRET_M(!data, "Invalid param : data");
+	static_cast<CtDetailView*>(data)->__onBlockListChanged();
+}
+
+void CtDetailView::__favoriteCheckClickedCb(void* data, Evas_Object*, void*)
+{
+	WHIT();
+	WPRET_M(!data, "Invalid param : data");
+	auto* view = static_cast<CtDetailView*>(data);
+	bool favorite = !view->m_detailData->isFavorite();
+	view->m_detailData->setFavorite(favorite);
+	ctCommonInsertUsageLog("CT09", favorite ? "On" : "Off");
+	view->__startFavoriteSettleTimer();
+}
+
+void CtDetailView::__backButtonClickedCb(void* data, Evas_Object*, void*)
+{
+	WHIT();
+	WPRET_M(!data, "Invalid param : data");
+	static_cast<CtDetailView*>(data)->popOut();
+}
+
+void CtDetailView::__naviTransitionFinishedCb(void* data, Evas_Object* obj, void*)
+{
+	WHIT();
+	WPRET_M(!data, "data is nullptr");
+	auto* view = static_cast<CtDetailView*>(data);
+	if (auto* inputItem = static_cast<Elm_Object_Item*>(evas_object_data_get(obj, kInputNaviItemKey))) {
+		evas_object_data_del(obj, kInputNaviItemKey);
+		elm_object_item_del(inputItem);
+	}
+	view->__closePopup();
+	if (view->m_rebuiltWhileShown) {
+		CtRegistryMgr::getInstance()->raiseChangeSignal(CT_REGISTRY_KEY_CONTACT_DATA_CHANGED, 0);
+		CtRegistryMgr::getInstance()->raiseChangeSignal(CT_REGISTRY_KEY_CONTACT_LIST_CHANGED, 0);
+		view->m_rebuiltWhileShown = false;
+	}
+}
+
+void CtDetailView::__genlistLongpressedCb(void* data, Evas_Object*, void* eventInfo)
+{
+	WHIT();
+	WPRET_M(!data, "Invalid param : data");
+	auto* view = static_cast<CtDetailView*>(data);
+	view->m_popup = CtDetailViewCtxPopup::open(view, WView_getWindowEvasObj(view),
+			static_cast<Elm_Object_Item*>(eventInfo));
+}
+
+void CtDetailView::__genlistPressedCb(void*, Evas_Object*, void*)
+{
+	ctCommonInvokeDbusCpuBoost();
+}
+
+void CtDetailView::__genlistReleasedCb(void*, Evas_Object* obj, void*)
+{
+	elm_scroller_movement_block_set(obj, ELM_SCROLLER_MOVEMENT_NO_BLOCK);
+}
+
+void CtDetailView::__moreButtonCb(void* data, Evas_Object*, void*)
+{
+	WHIT();
+	WPRET_M(!data, "Invalid param : data");
+	auto* view = static_cast<CtDetailView*>(data);
+	if (!view->m_popup.expired())
+		return;
+	Eina_List* contacts = view->m_detailData->getContactsList();
+	if (view->m_galData)
+		contacts = nullptr;
+	WPRET_M(!contacts, "list is nullptr");
+	WPRET_M(eina_list_count(contacts) == 0, "contacts list is empty");
+	// The menu's actions open screens of their own; until they exist the
+	// key does nothing more.
+	WDEBUG("more menu for person %d", view->getPersoinId());
+}

@@ -1,0 +1,390 @@
+// The contact detail screen, headless: which rows a person gets and in what
+// order, how the screen follows changes of the person, the favourite star,
+// power saving and the call-block list, and what bad requests give.
+#include "../../data/detail/DetailTestStore.h"
+
+#include "ContactsCommon.h"
+#include "ContactsDetails.h"
+#include "CtDetailData.h"
+#include "CtDetailView.h"
+#include "CtDetailViewGenlistItem.h"
+#include "CtDetailViewNumberItem.h"
+#include "CtRegistryMgr.h"
+#include "LogSink.h"
+#include "ScreenHarness.h"
+#include "TempDataDir.h"
+
+#include <app_control.h>
+#include <phone_misc.h>
+#include <vconf.h>
+
+#include <gtest/gtest.h>
+
+#include <cstdio>
+#include <map>
+#include <memory>
+#include <string>
+#include <vector>
+
+using namespace ct::test;
+
+namespace {
+
+// A screen pushed above the detail screen.
+class CoverView : public app_assist::WView {
+public:
+	const char* getClassName() override { return "CoverView"; }
+
+protected:
+	Evas_Object* onCreate(Evas_Object* parent, void*) override { return elm_label_add(parent); }
+};
+
+// Counts the registry change signals by key.
+class SignalCounter {
+public:
+	SignalCounter()
+	{
+		m_id = CtRegistryMgr::getInstance()->addChangeListener([this](ctRegistryKey key, int) { ++m_counts[key]; });
+	}
+	~SignalCounter() { CtRegistryMgr::getInstance()->removeChangeListener(m_id); }
+	int count(ctRegistryKey key) { return m_counts[key]; }
+
+private:
+	int m_id = 0;
+	std::map<ctRegistryKey, int> m_counts;
+};
+
+// An application-control request that the test owns.
+class Request {
+public:
+	Request(const char* operation, std::initializer_list<std::pair<const char*, const char*>> extras)
+	{
+		app_control_create(&m_request.appControl);
+		if (operation)
+			app_control_set_operation(m_request.appControl, operation);
+		for (const auto& extra : extras)
+			app_control_add_extra_data(m_request.appControl, extra.first, extra.second);
+	}
+	~Request() { app_control_destroy(m_request.appControl); }
+	CtLaunchRequest* get() { return &m_request; }
+
+private:
+	CtLaunchRequest m_request;
+};
+
+class CtDetailViewTest : public ::testing::Test {
+protected:
+	void SetUp() override
+	{
+		ASSERT_EQ(CONTACTS_ERROR_NONE, contacts_connect());
+		vconf_set_int(VCONFKEY_SETAPPL_PSMODE, 0);
+		m_screen = std::make_unique<ScreenHarness>();
+	}
+	void TearDown() override
+	{
+		m_screen.reset();
+		contacts_disconnect();
+	}
+
+	CtDetailView* show(int personId)
+	{
+		auto* view = static_cast<CtDetailView*>(createCtDetailView(personId, nullptr));
+		EXPECT_TRUE(m_screen->push(view));
+		EXPECT_TRUE(m_screen->pumpUntil([view] { return !view->isBuildingRows(); }));
+		return view;
+	}
+
+	static std::vector<int> kinds(CtDetailView* view)
+	{
+		std::vector<int> types;
+		for (auto* row : ScreenHarness::rowsOf<CtDetailViewGenlistItem>(view->getGenlist()))
+			types.push_back(row->getItemType());
+		return types;
+	}
+
+	static std::vector<CtDetailViewGenlistItem*> rowsOfKind(CtDetailView* view, int kind)
+	{
+		return ScreenHarness::rowsWhere<CtDetailViewGenlistItem>(view->getGenlist(),
+				[kind](CtDetailViewGenlistItem* row) { return row->getItemType() == kind; });
+	}
+
+	static Evas_Object* favoriteCheck(CtDetailView* view)
+	{
+		Evas_Object* layout = elm_object_item_part_content_get(view->getNaviItem(), "title_right_btn");
+		return layout ? elm_object_part_content_get(layout, "icon.favorite") : nullptr;
+	}
+
+	static void tap(Evas_Object* check)
+	{
+		elm_layout_signal_emit(check, "mouse,clicked,1", "event");
+		edje_object_message_signal_process(elm_layout_edje_get(check));
+	}
+
+	// A person with a picture, 2 numbers, an e-mail, 2 addresses, a note,
+	// an event, a web site and a ringtone.
+	int storeRichPerson()
+	{
+		contacts_record_h contact = newContact(0, "Mina");
+		addNumber(contact, "010-1111-2222", CONTACTS_NUMBER_TYPE_CELL);
+		addNumber(contact, "02-333-4444", CONTACTS_NUMBER_TYPE_HOME);
+		addEmail(contact, "mina@example.com");
+		for (const char* street : {"1 Main St", "2 Side St"}) {
+			contacts_record_h address = addChild(contact, _contacts_contact.address, _contacts_address._uri);
+			contacts_record_set_str(address, _contacts_address.street, street);
+		}
+		contacts_record_h note = addChild(contact, _contacts_contact.note, _contacts_note._uri);
+		contacts_record_set_str(note, _contacts_note.note, "Met at the fair");
+		contacts_record_h event = addChild(contact, _contacts_contact.event, _contacts_event._uri);
+		contacts_record_set_int(event, _contacts_event.date, 19900315);
+		contacts_record_set_int(event, _contacts_event.type, CONTACTS_EVENT_TYPE_BIRTH);
+		contacts_record_h url = addChild(contact, _contacts_contact.url, _contacts_url._uri);
+		contacts_record_set_str(url, _contacts_url.url, "example.com");
+		std::string ringtone = m_dir.file("Over_the_horizon.ogg");
+		fclose(fopen(ringtone.c_str(), "w"));
+		contacts_record_set_str(contact, _contacts_contact.ringtone_path, ringtone.c_str());
+		return personOf(store(contact));
+	}
+
+	TempDataDir m_dir;
+	std::unique_ptr<ScreenHarness> m_screen;
+};
+
+TEST_F(CtDetailViewTest, PersonIdComesFromTheRequestOnlyWhenNoIdIsGiven)
+{
+	struct Case {
+		const char* operation;
+		std::initializer_list<std::pair<const char*, const char*>> extras;
+		int expected;
+	};
+	const Case cases[] = {
+		{nullptr, {{"person_id", "12"}, {"ct_person_id", "34"}}, 34},
+		{APP_CONTROL_OPERATION_DEFAULT, {{"person_id", "12"}}, 12},
+		{APP_CONTROL_OPERATION_VIEW, {{APP_CONTROL_DATA_ID, "7"}, {"person_id", "12"}}, 7},
+		{APP_CONTROL_OPERATION_VIEW, {}, 0},
+		{nullptr, {{"person_id", "twelve"}}, 0},
+		{nullptr, {{"person_id", "99999999999999"}}, 0},
+		{nullptr, {{"person_id", "-3"}}, -3},
+	};
+	for (const Case& c : cases) {
+		Request request(c.operation, c.extras);
+		EXPECT_EQ(c.expected, CtDetailView::personIdFromRequest(request.get())) << (c.operation ? c.operation : "none");
+	}
+
+	ct::log::clear();
+	Request pick(APP_CONTROL_OPERATION_PICK, {{"person_id", "12"}});
+	EXPECT_EQ(0, CtDetailView::personIdFromRequest(pick.get()));
+	EXPECT_TRUE(ct::log::contains("* Critical * wrong operation requested " APP_CONTROL_OPERATION_PICK));
+	EXPECT_EQ(0, CtDetailView::personIdFromRequest(nullptr));
+
+	// An explicit id wins over the request's extra data.
+	int personId = addSimplePerson("Given");
+	Request other(nullptr, {{"ct_person_id", "34"}});
+	auto* view = static_cast<CtDetailView*>(createCtDetailView(personId, other.get()));
+	ASSERT_TRUE(m_screen->push(view));
+	EXPECT_EQ(personId, view->getPersoinId());
+	EXPECT_EQ("Given", ScreenHarness::naviText(view));
+}
+
+TEST_F(CtDetailViewTest, RowsFollowTheKindOrderSixInTheFirstFrameThenOnePerFrame)
+{
+	int personId = storeRichPerson();
+	auto* view = static_cast<CtDetailView*>(createCtDetailView(personId, nullptr));
+	ASSERT_TRUE(m_screen->naviframe()->push(view));
+	// Row counts seen at each later frame, after the screen's own step.
+	struct Frames {
+		CtDetailView* view;
+		std::vector<size_t> counts;
+	} frames = {view, {kinds(view).size()}};
+	Ecore_Animator* recorder = ecore_animator_add([](void* data) -> Eina_Bool {
+		auto* f = static_cast<Frames*>(data);
+		f->counts.push_back(kinds(f->view).size());
+		return ECORE_CALLBACK_RENEW;
+	}, &frames);
+	ASSERT_TRUE(m_screen->pumpUntil([view] { return !view->isBuildingRows(); }));
+	m_screen->pumpFrames(2);
+	ecore_animator_del(recorder);
+	EXPECT_EQ(6u, frames.counts.front());
+	for (size_t i = 1; i < frames.counts.size(); ++i)
+		EXPECT_LE(frames.counts[i] - frames.counts[i - 1], 1u) << "frame " << i;
+
+	const std::vector<int> expected = {DETAIL_ITEM_MULTI_IMAGE, DETAIL_ITEM_NUMBER, DETAIL_ITEM_NUMBER,
+		DETAIL_ITEM_VIDEO_CALL, DETAIL_ITEM_EMAIL, DETAIL_ITEM_ADDRESS, DETAIL_ITEM_ADDRESS, DETAIL_ITEM_WEBSITE,
+		DETAIL_ITEM_EVENT, DETAIL_ITEM_NOTE, DETAIL_ITEM_RINGTONE, DETAIL_ITEM_LINK};
+	EXPECT_EQ(expected, kinds(view));
+	// Two addresses make rows of different heights.
+	EXPECT_FALSE(view->isCompactLayout());
+	EXPECT_FALSE(elm_genlist_homogeneous_get(view->getGenlist()));
+	EXPECT_NE(nullptr, favoriteCheck(view));
+}
+
+TEST_F(CtDetailViewTest, SimContactAndPersonWithoutNumbersGetFewerRows)
+{
+	int sim = addAddressbook(CONTACTS_SIM1_ADDRESS_BOOK_NAME, 0, 0, CONTACTS_SIM1_ADDRESS_BOOK_NAME);
+	contacts_record_h simContact = newContact(sim, "Taxi");
+	addNumber(simContact, "+44 20 7946 0000", CONTACTS_NUMBER_TYPE_CELL);
+	contacts_record_set_str(simContact, _contacts_contact.ringtone_path, "/opt/ringtones/Bell.ogg");
+	CtDetailView* simView = show(personOf(store(simContact)));
+	EXPECT_TRUE(simView->isSimContactView());
+	EXPECT_EQ((std::vector<int> {DETAIL_ITEM_NUMBER, DETAIL_ITEM_VIDEO_CALL, DETAIL_ITEM_LINK}), kinds(simView));
+	EXPECT_EQ(nullptr, favoriteCheck(simView));
+	EXPECT_TRUE(ct::log::contains("* Critical * __isSimContact == true"));
+
+	contacts_record_h plain = newContact(0, "Quiet");
+	contacts_record_h note = addChild(plain, _contacts_contact.note, _contacts_note._uri);
+	contacts_record_set_str(note, _contacts_note.note, "no numbers");
+	contacts_record_h address = addChild(plain, _contacts_contact.address, _contacts_address._uri);
+	contacts_record_set_str(address, _contacts_address.street, "3 Quiet Lane");
+	CtDetailView* plainView = show(personOf(store(plain)));
+	EXPECT_EQ((std::vector<int> {DETAIL_ITEM_MULTI_IMAGE, DETAIL_ITEM_ADDRESS, DETAIL_ITEM_NOTE, DETAIL_ITEM_LINK}),
+			kinds(plainView));
+	// One address and one note keep every row the same height.
+	EXPECT_TRUE(elm_genlist_homogeneous_get(plainView->getGenlist()));
+}
+
+TEST_F(CtDetailViewTest, ChangesRebuildAtOnceAndOnceMoreAfterTheCoalescingPeriod)
+{
+	int contactId = 0;
+	int personId = addSimplePerson("Burst", &contactId);
+	CtDetailView* view = show(personId);
+	SignalCounter signals;
+
+	for (int i = 0; i < 10; ++i) {
+		addNumberToStoredContact(contactId, ("010-555-00" + std::to_string(10 + i)).c_str());
+		m_screen->pumpFor(0.1);
+	}
+	EXPECT_EQ(1, view->getRebuildCount());
+	ASSERT_TRUE(m_screen->pumpUntil([view] { return view->getRebuildCount() == 2; }, 4.0));
+	ASSERT_TRUE(m_screen->pumpUntil([view] { return !view->isBuildingRows(); }));
+	EXPECT_EQ(10u, rowsOfKind(view, DETAIL_ITEM_NUMBER).size());
+	m_screen->pumpFor(2.2);
+	EXPECT_EQ(2, view->getRebuildCount());
+
+	// After a transition the other screens hear that the contact changed,
+	// and an input screen left under the detail screen is removed.
+	auto* cover = new CoverView();
+	ASSERT_TRUE(m_screen->naviframe()->push(cover));
+	Evas_Object* naviframe = m_screen->naviframe()->getEvasObj();
+	evas_object_data_set(naviframe, "input_navi_item", cover->getNaviItem());
+	evas_object_smart_callback_call(naviframe, "transition,finished", nullptr);
+	m_screen->pumpUntilIdle();
+	EXPECT_EQ(nullptr, evas_object_data_get(naviframe, "input_navi_item"));
+	EXPECT_EQ(1, m_screen->viewCount());
+	EXPECT_EQ(1, signals.count(CT_REGISTRY_KEY_CONTACT_DATA_CHANGED));
+	EXPECT_EQ(1, signals.count(CT_REGISTRY_KEY_CONTACT_LIST_CHANGED));
+}
+
+TEST_F(CtDetailViewTest, DeletingThePersonClosesTheScreenAndThoseAboveIt)
+{
+	int personId = storeRichPerson();
+	show(personId);
+	ASSERT_TRUE(m_screen->push(new CoverView()));
+	ASSERT_TRUE(m_screen->push(new CoverView()));
+	ASSERT_EQ(3, m_screen->viewCount());
+	ASSERT_EQ(CONTACTS_ERROR_NONE, contacts_db_delete_record(_contacts_person._uri, personId));
+	EXPECT_TRUE(m_screen->pumpUntil([this] { return m_screen->viewCount() == 0; }));
+
+	// Deleted while its rows are still being added.
+	int other = storeRichPerson();
+	auto* view = static_cast<CtDetailView*>(createCtDetailView(other, nullptr));
+	ASSERT_TRUE(m_screen->naviframe()->push(view));
+	ASSERT_TRUE(view->isBuildingRows());
+	ASSERT_EQ(CONTACTS_ERROR_NONE, contacts_db_delete_record(_contacts_person._uri, other));
+	EXPECT_TRUE(m_screen->pumpUntil([this] { return m_screen->viewCount() == 0; }));
+}
+
+TEST_F(CtDetailViewTest, FavouriteTapsSettleIntoOneSignalWithoutRebuilding)
+{
+	int personId = addSimplePerson("Star");
+	CtDetailView* view = show(personId);
+	Evas_Object* check = favoriteCheck(view);
+	ASSERT_NE(nullptr, check);
+	EXPECT_FALSE(elm_check_state_get(check));
+	SignalCounter signals;
+
+	tap(check);
+	m_screen->pumpFor(0.3);
+	EXPECT_TRUE(CtDetailData(personId).isFavorite());
+	tap(check);
+	m_screen->pumpFor(0.5);
+	EXPECT_EQ(0, signals.count(CT_REGISTRY_KEY_FAVORITE_CHANGED));
+	ASSERT_TRUE(m_screen->pumpUntil([&] { return signals.count(CT_REGISTRY_KEY_FAVORITE_CHANGED) > 0; }, 2.0));
+	m_screen->pumpFor(0.5);
+	EXPECT_EQ(1, signals.count(CT_REGISTRY_KEY_FAVORITE_CHANGED));
+	EXPECT_EQ(0, view->getRebuildCount());
+	EXPECT_FALSE(CtDetailData(personId).isFavorite());
+}
+
+TEST_F(CtDetailViewTest, PowerSavingDisablesVideoCallEmailAndAddressRowsWhileOn)
+{
+	vconf_set_int(VCONFKEY_SETAPPL_PSMODE, 1);
+	CtDetailView* view = show(storeRichPerson());
+	auto affected = [view] {
+		std::vector<CtDetailViewGenlistItem*> rows;
+		for (int kind : {DETAIL_ITEM_VIDEO_CALL, DETAIL_ITEM_EMAIL, DETAIL_ITEM_ADDRESS})
+			for (auto* row : rowsOfKind(view, kind))
+				rows.push_back(row);
+		return rows;
+	};
+	auto allDisabled = [&](bool disabled) {
+		for (auto* row : affected())
+			if (elm_object_item_disabled_get(row->getElmObjectItem()) != disabled)
+				return false;
+		return true;
+	};
+	ASSERT_EQ(4u, affected().size());
+	EXPECT_TRUE(view->isPowerSaving());
+	EXPECT_TRUE(allDisabled(true));
+	for (auto* row : rowsOfKind(view, DETAIL_ITEM_NUMBER))
+		EXPECT_FALSE(elm_object_item_disabled_get(row->getElmObjectItem()));
+
+	vconf_set_int(VCONFKEY_SETAPPL_PSMODE, 0);
+	EXPECT_TRUE(m_screen->pumpUntil([&] { return allDisabled(false); }));
+	EXPECT_FALSE(view->isPowerSaving());
+}
+
+TEST_F(CtDetailViewTest, BlockingANumberMarksItsRowWithoutARebuild)
+{
+	CtDetailView* view = show(storeRichPerson());
+	auto numbers = ScreenHarness::rowsOf<CtDetailViewNumberItem>(view->getGenlist());
+	ASSERT_EQ(2u, numbers.size());
+	EXPECT_FALSE(numbers[0]->isBlocked());
+
+	phone_misc_h blockList = nullptr;
+	ASSERT_EQ(PHONE_MISC_ERROR_NONE, phone_misc_connect(&blockList));
+	ASSERT_EQ(PHONE_MISC_ERROR_NONE, phone_misc_block_add(blockList, PHONE_MISC_BLOCK_TYPE_CALL, "01011112222"));
+	EXPECT_TRUE(m_screen->pumpUntil([&] { return numbers[0]->isBlocked(); }));
+	EXPECT_FALSE(numbers[1]->isBlocked());
+	EXPECT_EQ(0, view->getRebuildCount());
+
+	phone_misc_block_remove(blockList, PHONE_MISC_BLOCK_TYPE_CALL, "01011112222");
+	EXPECT_TRUE(m_screen->pumpUntil([&] { return !numbers[0]->isBlocked(); }));
+	phone_misc_disconnect(blockList);
+}
+
+TEST_F(CtDetailViewTest, GalResultsAndMissingPersonsGiveQuietScreens)
+{
+	CtGalSearchData gal = {nullptr, nullptr, "Gal Person", "0201234567", nullptr, nullptr, "gal@example.com", "Corp"};
+	auto* galView = static_cast<CtDetailView*>(createCtDetailViewForGalSearch(&gal));
+	ASSERT_TRUE(m_screen->push(galView));
+	EXPECT_EQ((std::vector<int> {DETAIL_ITEM_MULTI_IMAGE, DETAIL_ITEM_NUMBER, DETAIL_ITEM_EMAIL}), kinds(galView));
+	EXPECT_EQ("Gal Person", ScreenHarness::naviText(galView));
+	m_screen->sendMoreKey();
+	m_screen->pumpUntilIdle();
+	EXPECT_TRUE(ct::log::contains("* Critical * list is nullptr"));
+	galView->popOut();
+	m_screen->pumpUntilIdle();
+
+	ASSERT_TRUE(m_screen->push(createCtDetailViewForGalSearch(nullptr)));
+	Request pick(APP_CONTROL_OPERATION_PICK, {});
+	auto* nobody = static_cast<CtDetailView*>(createCtDetailView(0, pick.get()));
+	ASSERT_TRUE(m_screen->push(nobody));
+	ASSERT_TRUE(m_screen->pumpUntil([nobody] { return !nobody->isBuildingRows(); }));
+	EXPECT_EQ(0, nobody->getPersoinId());
+	EXPECT_EQ(ContactsCommon::translate("IDS_LOGS_MBODY_UNKNOWN"), ScreenHarness::naviText(nobody));
+	m_screen->sendMoreKey();
+	m_screen->sendBackKey();
+	m_screen->sendBackKey();
+	EXPECT_TRUE(m_screen->pumpUntil([this] { return m_screen->viewCount() == 0; }));
+}
+
+} // namespace

@@ -679,16 +679,25 @@ void CtDetailView::onConditionChagned()
 void CtDetailView::onSimChanged()
 {
 	WHIT();
-	if (m_genlist)
-		elm_genlist_realized_items_update(m_genlist);
+	__refreshRows();
 }
 
 void CtDetailView::onLanguageChanged()
 {
 	WHIT();
 	__updateTitle();
-	if (m_genlist)
-		elm_genlist_realized_items_update(m_genlist);
+	__refreshRows();
+}
+
+void CtDetailView::__refreshRows()
+{
+	if (!m_genlist)
+		return;
+	for (Elm_Object_Item* item = elm_genlist_first_item_get(m_genlist); item; item = elm_genlist_item_next_get(item)) {
+		if (CtDetailViewGenlistItem* row = rowOf(item))
+			row->invalidateContent();
+	}
+	elm_genlist_realized_items_update(m_genlist);
 }
 
 void CtDetailView::__onBlockListChanged()

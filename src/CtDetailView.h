@@ -110,6 +110,8 @@ private:
 	void __launchVideoCall(const char* number);
 	void __showVideoCallPopup();
 	void __closePopup();
+	// Redraws the shown rows with fresh contents (SIM colours, texts).
+	void __refreshRows();
 
 	static void __powerSavingModeChangedCb(keynode_t* node, void* data);
 	static void __blockListChangedCb(void* data);

@@ -19,7 +19,11 @@ public: // CtDetailViewGenlistItem
 	// The full address.
 	std::string getCopyText() override;
 	int getItemType() override { return DETAIL_ITEM_ADDRESS; }
-	void setPowerSaving(bool on) override { m_powerSaving = on; }
+	void setPowerSaving(bool on) override
+	{
+		m_powerSaving = on;
+		invalidateContent();
+	}
 	void onSelect(Elm_Object_Item* item) override;
 	void onSetElmObjectItem(Elm_Object_Item* item) override;
 

@@ -16,7 +16,11 @@ public:
 public: // CtDetailViewGenlistItem
 	std::string getCopyText() override;
 	int getItemType() override { return DETAIL_ITEM_EMAIL; }
-	void setPowerSaving(bool on) override { m_powerSaving = on; }
+	void setPowerSaving(bool on) override
+	{
+		m_powerSaving = on;
+		invalidateContent();
+	}
 	void onSelect(Elm_Object_Item* item) override;
 	void onSetElmObjectItem(Elm_Object_Item* item) override;
 

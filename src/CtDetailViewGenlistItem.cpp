@@ -8,7 +8,9 @@
 #include "ui_extension.h"
 
 
+#include <cstdint>
 #include <cstring>
+#include <functional>
 
 namespace {
 
@@ -19,6 +21,15 @@ const char* const kDefaultIconColor = "A03O004";
 const char* const kValueTextStyle = "DEFAULT='font=Sans font_size=16 wrap=none'";
 const int kCopyAreaMaxW = 656;
 const int kCopyAreaMaxH = 54;
+// Tags on a content object: the row that made it, for which part, and when.
+const char* const kContentRowKey = "ct.content.row";
+const char* const kContentPartKey = "ct.content.part";
+const char* const kContentGenerationKey = "ct.content.generation";
+
+uintptr_t partTag(const char* part)
+{
+	return std::hash<std::string>()(part ? part : "") | 1;
+}
 
 // The swallow part of the icon layout that a touch part covers.
 const char* iconPartOf(const char* touchPart)
@@ -74,6 +85,9 @@ Elm_Genlist_Item_Class* CtDetailViewGenlistItem::getItemClassNew()
 	itc->item_style = getItemStyle();
 	itc->func.text_get = __textGetCb;
 	itc->func.content_get = __contentGetCb;
+	// The list realizes a row once to measure it and again to show it: the
+	// second time takes the contents of the first.
+	itc->func.reusable_content_get = __reusableContentGetCb;
 	return itc;
 }
 
@@ -183,7 +197,23 @@ char* CtDetailViewGenlistItem::__textGetCb(void* data, Evas_Object*, const char*
 Evas_Object* CtDetailViewGenlistItem::__contentGetCb(void* data, Evas_Object* obj, const char* part)
 {
 	auto* row = static_cast<CtDetailViewGenlistItem*>(data);
-	return row ? row->getContent(obj, part) : nullptr;
+	Evas_Object* content = row ? row->getContent(obj, part) : nullptr;
+	if (content) {
+		evas_object_data_set(content, kContentRowKey, row);
+		evas_object_data_set(content, kContentPartKey, reinterpret_cast<void*>(partTag(part)));
+		evas_object_data_set(content, kContentGenerationKey, reinterpret_cast<void*>(uintptr_t(row->m_contentGeneration)));
+	}
+	return content;
+}
+
+Evas_Object* CtDetailViewGenlistItem::__reusableContentGetCb(void* data, Evas_Object*, const char* part, Evas_Object* old)
+{
+	auto* row = static_cast<CtDetailViewGenlistItem*>(data);
+	if (!row || !old || evas_object_data_get(old, kContentRowKey) != row)
+		return nullptr;
+	bool samePart = reinterpret_cast<uintptr_t>(evas_object_data_get(old, kContentPartKey)) == partTag(part);
+	bool current = reinterpret_cast<uintptr_t>(evas_object_data_get(old, kContentGenerationKey)) == row->m_contentGeneration;
+	return samePart && current ? old : nullptr;
 }
 
 void CtDetailViewGenlistItem::__iconClickedCb(void* data, Evas_Object*, const char*, const char* source)

@@ -45,6 +45,10 @@ public:
 	// new state; the caller updates the item.
 	virtual void setPowerSaving(bool on);
 
+	// Contents made so far are not reused when the item is realized or its
+	// parts updated again; call it when what the contents show has changed.
+	void invalidateContent() { ++m_contentGeneration; }
+
 	void setHighlighted(bool on) { highlighted = on; }
 	bool isHighlighted() const { return highlighted; }
 	CtDetailDataBase* getData() const { return m_data; }
@@ -86,11 +90,13 @@ protected:
 private:
 	static char* __textGetCb(void* data, Evas_Object* obj, const char* part);
 	static Evas_Object* __contentGetCb(void* data, Evas_Object* obj, const char* part);
+	static Evas_Object* __reusableContentGetCb(void* data, Evas_Object* obj, const char* part, Evas_Object* old);
 	static void __iconClickedCb(void* data, Evas_Object* obj, const char* emission, const char* source);
 	static void __iconPressedCb(void* data, Evas_Object* obj, const char* emission, const char* source);
 	static void __iconReleasedCb(void* data, Evas_Object* obj, const char* emission, const char* source);
 
 	CtDetailDataBase* m_data;
+	unsigned m_contentGeneration = 1;
 };
 
 #endif

@@ -13,7 +13,11 @@ public:
 	contacts_record_h getRecord() const { return m_record; }
 	bool isBlocked() const { return m_isBlocked; }
 	// The screen refreshes "elm.icon.left.bottom" after changing this.
-	void setBlocked(bool blocked) { m_isBlocked = blocked; }
+	void setBlocked(bool blocked)
+	{
+		m_isBlocked = blocked;
+		invalidateContent();
+	}
 
 	void call();
 	void sendMessage();

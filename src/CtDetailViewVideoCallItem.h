@@ -14,7 +14,11 @@ public:
 
 public: // CtDetailViewGenlistItem
 	int getItemType() override { return DETAIL_ITEM_VIDEO_CALL; }
-	void setPowerSaving(bool on) override { m_powerSaving = on; }
+	void setPowerSaving(bool on) override
+	{
+		m_powerSaving = on;
+		invalidateContent();
+	}
 	void onSelect(Elm_Object_Item* item) override;
 	void onSetElmObjectItem(Elm_Object_Item* item) override;
 

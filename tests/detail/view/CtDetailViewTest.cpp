@@ -352,12 +352,18 @@ TEST_F(CtDetailViewTest, BlockingANumberMarksItsRowWithoutARebuild)
 	phone_misc_h blockList = nullptr;
 	ASSERT_EQ(PHONE_MISC_ERROR_NONE, phone_misc_connect(&blockList));
 	ASSERT_EQ(PHONE_MISC_ERROR_NONE, phone_misc_block_add(blockList, PHONE_MISC_BLOCK_TYPE_CALL, "01011112222"));
+	auto blockMark = [&] {
+		m_screen->pumpUntilIdle();
+		return elm_object_item_part_content_get(numbers[0]->getElmObjectItem(), "elm.icon.left.bottom");
+	};
 	EXPECT_TRUE(m_screen->pumpUntil([&] { return numbers[0]->isBlocked(); }));
+	EXPECT_NE(nullptr, blockMark());
 	EXPECT_FALSE(numbers[1]->isBlocked());
 	EXPECT_EQ(0, view->getRebuildCount());
 
 	phone_misc_block_remove(blockList, PHONE_MISC_BLOCK_TYPE_CALL, "01011112222");
 	EXPECT_TRUE(m_screen->pumpUntil([&] { return !numbers[0]->isBlocked(); }));
+	EXPECT_EQ(nullptr, blockMark());
 	phone_misc_disconnect(blockList);
 }
 

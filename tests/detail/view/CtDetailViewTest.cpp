@@ -3,6 +3,8 @@
 // power saving and the call-block list, and what bad requests give.
 #include "../../data/detail/DetailTestStore.h"
 
+#include "AppControlRouter.h"
+#include "ContactsAppIds.h"
 #include "ContactsCommon.h"
 #include "ContactsDetails.h"
 #include "CtDetailData.h"
@@ -365,6 +367,46 @@ TEST_F(CtDetailViewTest, BlockingANumberMarksItsRowWithoutARebuild)
 	EXPECT_TRUE(m_screen->pumpUntil([&] { return !numbers[0]->isBlocked(); }));
 	EXPECT_EQ(nullptr, blockMark());
 	phone_misc_disconnect(blockList);
+}
+
+TEST_F(CtDetailViewTest, VideoCallAndAddressRowsLaunchTheirApplications)
+{
+	auto accept = [](app_control_h, const ct::appcontrol::Reply&) { return 0; };
+	std::vector<ct::appcontrol::Registration> handlers;
+	handlers.push_back(ct::appcontrol::registerOperationHandler(VIDEO_CALL_OPERATION, accept));
+	handlers.push_back(ct::appcontrol::registerAppHandler(MAPS_APP_ID, accept));
+	ct::appcontrol::clearLaunches();
+
+	contacts_record_h contact = newContact(0, "Solo");
+	addNumber(contact, "010-7777-8888", CONTACTS_NUMBER_TYPE_CELL);
+	contacts_record_h address = addChild(contact, _contacts_contact.address, _contacts_address._uri);
+	contacts_record_set_str(address, _contacts_address.street, "5 Harbour Road");
+	int personId = personOf(store(contact));
+	CtDetailView* view = show(personId);
+	ScreenHarness::selectItem(rowsOfKind(view, DETAIL_ITEM_VIDEO_CALL).at(0)->getElmObjectItem());
+	ScreenHarness::selectItem(rowsOfKind(view, DETAIL_ITEM_ADDRESS).at(0)->getElmObjectItem());
+	ASSERT_TRUE(m_screen->pumpUntil([] { return ct::appcontrol::launches().size() == 2; }));
+	auto launches = ct::appcontrol::launches();
+	EXPECT_EQ(VIDEO_CALL_OPERATION, launches[0].operation);
+	EXPECT_EQ("tel:010-7777-8888", launches[0].uri);
+	EXPECT_EQ(std::to_string(personId), launches[0].extra("ctindex"));
+	EXPECT_EQ(MAPS_APP_ID, launches[1].appId);
+	EXPECT_NE(std::string::npos, launches[1].extra("searchByName").find("5 Harbour Road"));
+
+	// With two numbers the user picks one first.
+	int two = storeRichPerson();
+	CtDetailView* twoView = show(two);
+	ct::appcontrol::clearLaunches();
+	ScreenHarness::selectItem(rowsOfKind(twoView, DETAIL_ITEM_VIDEO_CALL).at(0)->getElmObjectItem());
+	m_screen->pumpUntilIdle();
+	EXPECT_TRUE(ct::appcontrol::launches().empty());
+	Evas_Object* chooser = m_screen->findWidgets("Elm_Genlist").front();
+	ASSERT_NE(twoView->getGenlist(), chooser);
+	std::vector<Elm_Object_Item*> choices = ScreenHarness::genlistItems(chooser);
+	ASSERT_EQ(2u, choices.size());
+	elm_genlist_item_selected_set(choices[1], EINA_TRUE);
+	ASSERT_TRUE(m_screen->pumpUntil([] { return ct::appcontrol::launches().size() == 1; }));
+	EXPECT_EQ("tel:02-333-4444", ct::appcontrol::launches()[0].uri);
 }
 
 TEST_F(CtDetailViewTest, GalResultsAndMissingPersonsGiveQuietScreens)

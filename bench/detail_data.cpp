@@ -40,36 +40,6 @@ struct Probe {
 	}
 };
 
-int firstContactOutside(int personId)
-{
-	contacts_query_h query = nullptr;
-	contacts_filter_h filter = nullptr;
-	contacts_query_create(_contacts_simple_contact._uri, &query);
-	contacts_filter_create(_contacts_simple_contact._uri, &filter);
-	contacts_filter_add_int(filter, _contacts_simple_contact.person_id, CONTACTS_MATCH_NOT_EQUAL, personId);
-	contacts_query_set_filter(query, filter);
-	contacts_list_h list = nullptr;
-	contacts_db_get_records_with_query(query, 0, 1, &list);
-	contacts_record_h record = nullptr;
-	int id = 0;
-	if (contacts_list_get_current_record_p(list, &record) == CONTACTS_ERROR_NONE)
-		contacts_record_get_int(record, _contacts_simple_contact.id, &id);
-	contacts_list_destroy(list, true);
-	contacts_filter_destroy(filter);
-	contacts_query_destroy(query);
-	return id;
-}
-
-void touchContact(int contactId, int round)
-{
-	contacts_record_h contact = nullptr;
-	if (contacts_db_get_record(_contacts_contact._uri, contactId, &contact) != CONTACTS_ERROR_NONE)
-		return;
-	contacts_record_set_str(contact, _contacts_contact.uid, std::to_string(round).c_str());
-	contacts_db_update_record(contact);
-	contacts_record_destroy(contact, true);
-}
-
 void BM_ConstructDetailData_BigPerson(benchmark::State& state)
 {
 	size_t numbers = 0;
@@ -99,11 +69,11 @@ void BM_UnrelatedContactChange(benchmark::State& state)
 	CtDetailData data(g_db.bigPersonId);
 	data.attachListener(&listener);
 	contacts_db_add_changed_cb(_contacts_person._uri, Probe::cb, &after);
-	int unrelated = firstContactOutside(g_db.bigPersonId);
+	int unrelated = ct::bench::firstContactId(g_db.bigPersonId, CONTACTS_MATCH_NOT_EQUAL);
 	int round = 0;
 	for (auto _ : state) {
 		before.hit = after.hit = false;
-		touchContact(unrelated, ++round);
+		ct::bench::touchContact(unrelated, ++round);
 		double start = ecore_time_get();
 		while (!after.hit && ecore_time_get() - start < 5)
 			ecore_main_loop_iterate();

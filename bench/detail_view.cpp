@@ -169,42 +169,12 @@ void BM_DetailViewFirstFrame_BigPerson(benchmark::State& state)
 }
 BENCHMARK(BM_DetailViewFirstFrame_BigPerson)->UseManualTime()->Unit(benchmark::kMillisecond)->Iterations(40);
 
-int firstContactOf(int personId)
-{
-	contacts_list_h list = nullptr;
-	contacts_query_h query = nullptr;
-	contacts_filter_h filter = nullptr;
-	contacts_query_create(_contacts_simple_contact._uri, &query);
-	contacts_filter_create(_contacts_simple_contact._uri, &filter);
-	contacts_filter_add_int(filter, _contacts_simple_contact.person_id, CONTACTS_MATCH_EQUAL, personId);
-	contacts_query_set_filter(query, filter);
-	contacts_db_get_records_with_query(query, 0, 1, &list);
-	contacts_record_h record = nullptr;
-	int id = 0;
-	if (contacts_list_get_current_record_p(list, &record) == CONTACTS_ERROR_NONE)
-		contacts_record_get_int(record, _contacts_simple_contact.id, &id);
-	contacts_list_destroy(list, true);
-	contacts_filter_destroy(filter);
-	contacts_query_destroy(query);
-	return id;
-}
-
-void touchContact(int contactId, int round)
-{
-	contacts_record_h contact = nullptr;
-	if (contacts_db_get_record(_contacts_contact._uri, contactId, &contact) != CONTACTS_ERROR_NONE)
-		return;
-	contacts_record_set_str(contact, _contacts_contact.uid, ("burst-" + std::to_string(round)).c_str());
-	contacts_db_update_record(contact);
-	contacts_record_destroy(contact, true);
-}
-
 // Ten changes of the shown person 0.15 s apart, then quiet until the
 // coalescing period is over: the rebuild count is the figure.
 void BM_DetailViewChangeBurst(benchmark::State& state)
 {
 	Screen screen;
-	int contactId = firstContactOf(g_db.bigPersonId);
+	int contactId = ct::bench::firstContactId(g_db.bigPersonId, CONTACTS_MATCH_EQUAL);
 	int rebuilds = 0;
 	for (auto _ : state) {
 		auto* view = static_cast<CtDetailView*>(createCtDetailView(g_db.bigPersonId, nullptr));
@@ -212,7 +182,7 @@ void BM_DetailViewChangeBurst(benchmark::State& state)
 		pumpUntil([view] { return !view->isBuildingRows(); }, 5.0);
 		Clock::time_point start = Clock::now();
 		for (int i = 0; i < 10; ++i) {
-			touchContact(contactId, i);
+			ct::bench::touchContact(contactId, i);
 			pumpFor(0.15);
 		}
 		pumpFor(4.5);

@@ -147,6 +147,16 @@ char* ctCommonMarkupToUtf8(const char* markup)
 	return text;
 }
 
+std::string ctCommonUtf8ToMarkup(const char* text)
+{
+	if (!text || !*text)
+		return std::string();
+	char* markup = elm_entry_utf8_to_markup(text);
+	std::string result = markup ? markup : "";
+	free(markup);
+	return result;
+}
+
 int ctCommonCheckUtf8(char leadByte)
 {
 	unsigned char c = static_cast<unsigned char>(leadByte);

@@ -20,6 +20,8 @@ int ctCommonCleanNumberForSim(const char* number, char* out, int outSize);
 // Plain UTF-8 text of an entry's markup, as a new string the caller frees
 // with free(); invalid UTF-8 becomes U+FFFD. Null for null.
 char* ctCommonMarkupToUtf8(const char* markup);
+// `text` as entry markup ("<" becomes "&lt;", ...); empty for null or "".
+std::string ctCommonUtf8ToMarkup(const char* text);
 // Byte length of the UTF-8 character that starts with `leadByte`: 1 to 4;
 // 1 for a continuation or invalid byte, so that a walk always advances.
 int ctCommonCheckUtf8(char leadByte);

@@ -94,16 +94,6 @@ int readExtraId(app_control_h request, const char* key, bool* present = nullptr)
 	return id;
 }
 
-std::string toMarkup(const char* text)
-{
-	if (!text || !*text)
-		return std::string();
-	char* markup = elm_entry_utf8_to_markup(text);
-	std::string result = markup ? markup : "";
-	free(markup);
-	return result;
-}
-
 void appendNonEmpty(std::string& joined, const char* part)
 {
 	if (!part || !*part)
@@ -543,7 +533,7 @@ void CtDetailView::__updateTitle()
 {
 	Elm_Object_Item* naviItem = getNaviItem();
 	WPRET_M(!naviItem, "naviItem is nullptr");
-	std::string title = toMarkup(m_detailData->getDisplayName());
+	std::string title = ctCommonUtf8ToMarkup(m_detailData->getDisplayName());
 	if (title.empty())
 		title = ContactsCommon::translate("IDS_LOGS_MBODY_UNKNOWN");
 	elm_object_item_part_text_set(naviItem, "elm.text.title", title.c_str());
@@ -552,7 +542,7 @@ void CtDetailView::__updateTitle()
 	appendNonEmpty(subtitle, m_detailData->getExtraName2());
 	appendNonEmpty(subtitle, m_detailData->getExtraName1First());
 	appendNonEmpty(subtitle, m_detailData->getCompany());
-	elm_object_item_part_text_set(naviItem, "subtitle", subtitle.empty() ? nullptr : toMarkup(subtitle.c_str()).c_str());
+	elm_object_item_part_text_set(naviItem, "subtitle", subtitle.empty() ? nullptr : ctCommonUtf8ToMarkup(subtitle.c_str()).c_str());
 }
 
 void CtDetailView::__updateFavoriteBtn()
@@ -830,7 +820,7 @@ void CtDetailView::onAddressSelected(contacts_record_h address)
 	WPRET_M(mapsAppId.empty(), "mapsAppId is empty");
 	char text[kMaxAddressBytes] = {0};
 	m_detailData->getAddress(address, text, sizeof(text));
-	std::string markup = toMarkup(text);
+	std::string markup = ctCommonUtf8ToMarkup(text);
 
 	app_control_h request = nullptr;
 	int err = app_control_create(&request);

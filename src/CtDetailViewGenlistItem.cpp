@@ -114,12 +114,7 @@ std::string CtDetailViewGenlistItem::highlightMain(const std::string& markup) co
 
 std::string CtDetailViewGenlistItem::toMarkup(const char* text)
 {
-	if (!text || !*text)
-		return std::string();
-	char* markup = elm_entry_utf8_to_markup(text);
-	std::string result = markup ? markup : "";
-	free(markup);
-	return result;
+	return ctCommonUtf8ToMarkup(text);
 }
 
 std::string CtDetailViewGenlistItem::translate(const char* textId)

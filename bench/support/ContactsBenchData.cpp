@@ -190,4 +190,34 @@ BenchDatabase ensureDatabase(int persons)
 	return out;
 }
 
+int firstContactId(int personId, contacts_match_int_flag_e match)
+{
+	contacts_query_h query = nullptr;
+	contacts_filter_h filter = nullptr;
+	contacts_query_create(_contacts_simple_contact._uri, &query);
+	contacts_filter_create(_contacts_simple_contact._uri, &filter);
+	contacts_filter_add_int(filter, _contacts_simple_contact.person_id, match, personId);
+	contacts_query_set_filter(query, filter);
+	contacts_list_h list = nullptr;
+	contacts_db_get_records_with_query(query, 0, 1, &list);
+	contacts_record_h record = nullptr;
+	int id = 0;
+	if (contacts_list_get_current_record_p(list, &record) == CONTACTS_ERROR_NONE)
+		contacts_record_get_int(record, _contacts_simple_contact.id, &id);
+	contacts_list_destroy(list, true);
+	contacts_filter_destroy(filter);
+	contacts_query_destroy(query);
+	return id;
+}
+
+void touchContact(int contactId, int round)
+{
+	contacts_record_h contact = nullptr;
+	if (contacts_db_get_record(_contacts_contact._uri, contactId, &contact) != CONTACTS_ERROR_NONE)
+		return;
+	contacts_record_set_str(contact, _contacts_contact.uid, std::to_string(round).c_str());
+	contacts_db_update_record(contact);
+	contacts_record_destroy(contact, true);
+}
+
 } // namespace ct::bench

@@ -2,6 +2,8 @@
 // and copied into a fresh data folder per run.
 #pragma once
 
+#include <contacts.h>
+
 #include <string>
 
 namespace ct::bench {
@@ -19,6 +21,12 @@ struct BenchDatabase {
 // addresses, events and groups, 5% of the persons linked), then copies it
 // into a new data folder and points CONTACTS_DATA_DIR there.
 BenchDatabase ensureDatabase(int persons);
+
+// The id of the first contact whose person id compares to `personId` as
+// `match` says (equal: one of the person's contacts; not equal: another's).
+int firstContactId(int personId, contacts_match_int_flag_e match);
+// Rewrites the contact's uid, so that the store reports a change of it.
+void touchContact(int contactId, int round);
 
 // Resident memory of this process in bytes.
 long residentBytes();

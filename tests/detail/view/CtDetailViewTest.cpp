@@ -428,7 +428,10 @@ TEST_F(CtDetailViewTest, GalResultsAndMissingPersonsGiveQuietScreens)
 	ASSERT_TRUE(m_screen->push(nobody));
 	ASSERT_TRUE(m_screen->pumpUntil([nobody] { return !nobody->isBuildingRows(); }));
 	EXPECT_EQ(0, nobody->getPersoinId());
-	EXPECT_EQ(ContactsCommon::translate("IDS_LOGS_MBODY_UNKNOWN"), ScreenHarness::naviText(nobody));
+	CtView::changeLanguage("de_DE.UTF-8");
+	EXPECT_EQ("Unbekannt", ScreenHarness::naviText(nobody));
+	CtView::changeLanguage("en_US.UTF-8");
+	EXPECT_EQ("Unknown", ScreenHarness::naviText(nobody));
 	m_screen->sendMoreKey();
 	m_screen->sendBackKey();
 	m_screen->sendBackKey();

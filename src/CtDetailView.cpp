@@ -109,6 +109,28 @@ CtDetailViewGenlistItem* rowOf(Elm_Object_Item* item)
 	return dynamic_cast<CtDetailViewGenlistItem*>(base);
 }
 
+bool isListKind(int kind)
+{
+	switch (kind) {
+	case KIND_NUMBERS:
+	case KIND_EMAILS:
+	case KIND_ADDRESSES:
+	case KIND_MESSENGERS:
+	case KIND_WEBSITES:
+	case KIND_RELATIONSHIPS:
+	case KIND_EVENTS:
+	case KIND_NOTES:
+		return true;
+	default:
+		return false;
+	}
+}
+
+bool hasText(const char* text)
+{
+	return text && *text;
+}
+
 const char* powerSavingIconPart(int itemType)
 {
 	switch (itemType) {
@@ -309,10 +331,12 @@ bool CtDetailView::onPop()
 void CtDetailView::__addAllItems()
 {
 	if (m_galData) {
-		__addPictureItem();
-		m_currentKind = KIND_NUMBERS;
-		for (int budget = INT_MAX; m_currentKind <= KIND_EMAILS;)
-			__addItemOfKind(budget);
+		int budget = INT_MAX;
+		__appendItem(__makeSingleItem(KIND_PICTURE));
+		for (m_currentKind = KIND_NUMBERS; m_currentKind <= KIND_EMAILS; ++m_currentKind) {
+			while (__addNextListItem(budget))
+				continue;
+		}
 		m_currentKind = KIND_DONE;
 		return;
 	}
@@ -338,91 +362,74 @@ bool CtDetailView::__addItemsForFrame()
 	return true;
 }
 
-// Adds the next row of the current kind (or moves past it). Returns false
-// when the frame must end now.
+// Adds the next row of the current kind, or moves past the kind. Returns
+// false when the frame must end now.
 bool CtDetailView::__addItemOfKind(int& budget)
+{
+	if (isListKind(m_currentKind)) {
+		if (__addNextListItem(budget))
+			return true;
+		if (m_currentKind == KIND_NUMBERS && m_numberIndex > 0 && !m_galData) {
+			__appendItem(new CtDetailViewVideoCallItem(this, m_detailData.get(), m_isPowerSaving));
+			--budget;
+		}
+	} else if (CtDetailViewGenlistItem* row = __makeSingleItem(m_currentKind)) {
+		__appendItem(row);
+		--budget;
+	}
+	bool endsFrame = m_currentKind == KIND_LINKED_ACCOUNTS;
+	++m_currentKind;
+	return !endsFrame;
+}
+
+bool CtDetailView::__addNextListItem(int& budget)
 {
 	CtDetailData* data = m_detailData.get();
 	switch (m_currentKind) {
-	case KIND_PICTURE:
-		if (!m_isSimContact) {
-			__addPictureItem();
-			--budget;
-		}
-		break;
-	case KIND_STATUS: {
-		const char* status = data->getStatus();
-		if (CtEsuAgentMgr::getInstance()->getEasySignUpCscFeatureEnabled() && status && *status) {
-			__appendItem(new CtDetailViewStatusItem(data));
-			--budget;
-		}
-		break;
-	}
 	case KIND_NUMBERS:
-		if (__addListItem(data->getNumberList(), m_numberIndex, budget, &CtDetailView::__makeNumberItem))
-			return true;
-		if (m_numberIndex > 0 && !m_galData) {
-			__appendItem(new CtDetailViewVideoCallItem(this, data, m_isPowerSaving));
-			--budget;
-		}
-		break;
+		return __addListItem(data->getNumberList(), m_numberIndex, budget, &CtDetailView::__makeNumberItem);
 	case KIND_EMAILS:
-		if (__addListItem(data->getEmailList(), m_emailIndex, budget, &CtDetailView::__makeEmailItem))
-			return true;
-		break;
-	case KIND_SOCIAL_ACCOUNT:
-		if (eina_list_count(data->getContactsList()) == 1 && data->getFacebookMode()) {
-			__appendItem(new CtDetailViewFacebookItem(data));
-			--budget;
-		}
-		break;
+		return __addListItem(data->getEmailList(), m_emailIndex, budget, &CtDetailView::__makeEmailItem);
 	case KIND_ADDRESSES:
-		if (__addListItem(data->getAddressList(), m_addressIndex, budget, &CtDetailView::__makeAddressItem))
-			return true;
-		break;
+		return __addListItem(data->getAddressList(), m_addressIndex, budget, &CtDetailView::__makeAddressItem);
 	case KIND_MESSENGERS:
-		if (__addListItem(data->getMessengerList(), m_messengerIndex, budget, &CtDetailView::__makeMessengerItem))
-			return true;
-		break;
+		return __addListItem(data->getMessengerList(), m_messengerIndex, budget, &CtDetailView::__makeMessengerItem);
 	case KIND_WEBSITES:
-		if (__addListItem(data->getUrlList(), m_websiteIndex, budget, &CtDetailView::__makeWebsiteItem))
-			return true;
-		break;
+		return __addListItem(data->getUrlList(), m_websiteIndex, budget, &CtDetailView::__makeWebsiteItem);
 	case KIND_RELATIONSHIPS:
-		if (__addListItem(data->getRelationshipList(), m_relationshipIndex, budget, &CtDetailView::__makeRelationItem))
-			return true;
-		break;
+		return __addListItem(data->getRelationshipList(), m_relationshipIndex, budget, &CtDetailView::__makeRelationItem);
 	case KIND_EVENTS:
-		if (__addListItem(data->getEventList(), m_eventIndex, budget, &CtDetailView::__makeEventItem))
-			return true;
-		break;
+		return __addListItem(data->getEventList(), m_eventIndex, budget, &CtDetailView::__makeEventItem);
 	case KIND_NOTES:
-		if (__addListItem(data->getNoteList(), m_noteIndex, budget, &CtDetailView::__makeNoteItem))
-			return true;
-		break;
-	case KIND_RINGTONE: {
-		const char* ringtone = data->getRingtonePath();
-		if (!m_isSimContact && ringtone && *ringtone) {
-			__appendItem(new CtDetailViewRingtoneItem(data));
-			--budget;
-		}
-		break;
-	}
-	case KIND_GROUPS:
-		if (!m_isSimContact && data->getGroupNames() != ContactsCommon::translate("IDS_PB_BODY_NOT_ASSIGNED")) {
-			__appendItem(new CtDetailViewGroupsItem(data));
-			--budget;
-		}
-		break;
-	case KIND_LINKED_ACCOUNTS:
-		__appendItem(new CtDetailViewLinkItem(data));
-		++m_currentKind;
-		return false;
+		return __addListItem(data->getNoteList(), m_noteIndex, budget, &CtDetailView::__makeNoteItem);
 	default:
 		return false;
 	}
-	++m_currentKind;
-	return true;
+}
+
+// The row of a single-row kind, or null when the person does not get it.
+CtDetailViewGenlistItem* CtDetailView::__makeSingleItem(int kind)
+{
+	CtDetailData* data = m_detailData.get();
+	switch (kind) {
+	case KIND_PICTURE:
+		return m_isSimContact ? nullptr : new CtDetailViewMultiImageItem(this, data, __isLowSizePicture());
+	case KIND_STATUS:
+		return CtEsuAgentMgr::getInstance()->getEasySignUpCscFeatureEnabled() && hasText(data->getStatus())
+			? new CtDetailViewStatusItem(data) : nullptr;
+	case KIND_SOCIAL_ACCOUNT:
+		return eina_list_count(data->getContactsList()) == 1 && data->getFacebookMode()
+			? new CtDetailViewFacebookItem(data) : nullptr;
+	case KIND_RINGTONE:
+		return !m_isSimContact && hasText(data->getRingtonePath()) ? new CtDetailViewRingtoneItem(data) : nullptr;
+	case KIND_GROUPS:
+		return !m_isSimContact && data->getGroupNames() != ContactsCommon::translate("IDS_PB_BODY_NOT_ASSIGNED")
+			? new CtDetailViewGroupsItem(data) : nullptr;
+	case KIND_LINKED_ACCOUNTS:
+		return new CtDetailViewLinkItem(data);
+	default:
+		return nullptr;
+	}
 }
 
 // Adds the row at `index` of `list`; false (adding nothing) once the list is done.
@@ -440,6 +447,7 @@ bool CtDetailView::__addListItem(Eina_List* list, int& index, int& budget,
 
 Elm_Object_Item* CtDetailView::__appendItem(CtDetailViewGenlistItem* row)
 {
+	WPRET_VM(!row, nullptr, "Invalid param : row");
 	Elm_Object_Item* item = elm_genlist_item_append(m_genlist, row->getItemClass(), row, nullptr,
 			ELM_GENLIST_ITEM_NONE, row->getSelectCb(), nullptr);
 	if (!item) {
@@ -497,11 +505,6 @@ CtDetailViewGenlistItem* CtDetailView::__makeEventItem(contacts_record_h record)
 CtDetailViewGenlistItem* CtDetailView::__makeNoteItem(contacts_record_h record)
 {
 	return new CtDetailViewNoteItem(m_detailData.get(), record);
-}
-
-void CtDetailView::__addPictureItem()
-{
-	__appendItem(new CtDetailViewMultiImageItem(this, m_detailData.get(), __isLowSizePicture()));
 }
 
 bool CtDetailView::__isLowSizePicture()

@@ -84,6 +84,8 @@ private:
 	void __addAllItems();
 	bool __addItemsForFrame();
 	bool __addItemOfKind(int& budget);
+	bool __addNextListItem(int& budget);
+	CtDetailViewGenlistItem* __makeSingleItem(int kind);
 	bool __addListItem(Eina_List* list, int& index, int& budget, CtDetailViewGenlistItem* (CtDetailView::*make)(contacts_record_h));
 	Elm_Object_Item* __appendItem(CtDetailViewGenlistItem* row);
 	CtDetailViewGenlistItem* __makeNumberItem(contacts_record_h record);
@@ -94,7 +96,6 @@ private:
 	CtDetailViewGenlistItem* __makeRelationItem(contacts_record_h record);
 	CtDetailViewGenlistItem* __makeEventItem(contacts_record_h record);
 	CtDetailViewGenlistItem* __makeNoteItem(contacts_record_h record);
-	void __addPictureItem();
 	bool __isLowSizePicture();
 	bool __getNumberCallBlockStatus(contacts_record_h number);
 	void __updateTitle();

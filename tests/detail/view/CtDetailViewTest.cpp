@@ -423,6 +423,8 @@ TEST_F(CtDetailViewTest, GalResultsAndMissingPersonsGiveQuietScreens)
 	m_screen->pumpUntilIdle();
 
 	ASSERT_TRUE(m_screen->push(createCtDetailViewForGalSearch(nullptr)));
+	// A screen the host made but never pushed is ended quietly.
+	createCtDetailView(addSimplePerson("Unpushed"), nullptr)->destroy();
 	Request pick(APP_CONTROL_OPERATION_PICK, {});
 	auto* nobody = static_cast<CtDetailView*>(createCtDetailView(0, pick.get()));
 	ASSERT_TRUE(m_screen->push(nobody));

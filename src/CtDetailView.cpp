@@ -586,8 +586,6 @@ void CtDetailView::onDbChanged(const char* viewUri)
 	WDEBUG("changed : %s", viewUri ? viewUri : "");
 	if (m_isClosing || app_assist::WUiTimer::isAlive(m_favoriteSettleTimer))
 		return;
-	__addExtensionThemes();
-	CtThemeMgr::getInstance()->setObjectTheme(getEvasObj());
 	if (m_galData)
 		return;
 	if (!m_detailData->isCurrentPersonValid()) {
@@ -598,6 +596,9 @@ void CtDetailView::onDbChanged(const char* viewUri)
 		++m_pendingChangeCount;
 		return;
 	}
+	// Re-themed only when rebuilt: a counted change redraws nothing.
+	__addExtensionThemes();
+	CtThemeMgr::getInstance()->setObjectTheme(getEvasObj());
 	__startChangeTimer();
 	__closePopup();
 	__updateGenlist();

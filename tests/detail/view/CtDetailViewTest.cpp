@@ -144,7 +144,19 @@ protected:
 		std::string ringtone = m_dir.file("Over_the_horizon.ogg");
 		fclose(fopen(ringtone.c_str(), "w"));
 		contacts_record_set_str(contact, _contacts_contact.ringtone_path, ringtone.c_str());
+		// Stored without a place in the picture order, as an edit form stores it.
+		addImage(contact, writePicture("mina.png").c_str());
 		return personOf(store(contact));
+	}
+
+	std::string writePicture(const char* name)
+	{
+		std::string path = m_dir.file(name);
+		Evas_Object* image = evas_object_image_filled_add(evas_object_evas_get(m_screen->win()));
+		evas_object_image_size_set(image, 320, 320);
+		evas_object_image_save(image, path.c_str(), nullptr, nullptr);
+		evas_object_del(image);
+		return path;
 	}
 
 	TempDataDir m_dir;
@@ -213,6 +225,9 @@ TEST_F(CtDetailViewTest, RowsFollowTheKindOrderSixInTheFirstFrameThenOnePerFrame
 		DETAIL_ITEM_VIDEO_CALL, DETAIL_ITEM_EMAIL, DETAIL_ITEM_ADDRESS, DETAIL_ITEM_ADDRESS, DETAIL_ITEM_WEBSITE,
 		DETAIL_ITEM_EVENT, DETAIL_ITEM_NOTE, DETAIL_ITEM_RINGTONE, DETAIL_ITEM_LINK};
 	EXPECT_EQ(expected, kinds(view));
+	char* picture = view->getDetailData()->getImagePath(1);
+	EXPECT_NE(nullptr, picture);
+	free(picture);
 	// Two addresses make rows of different heights.
 	EXPECT_FALSE(view->isCompactLayout());
 	EXPECT_FALSE(elm_genlist_homogeneous_get(view->getGenlist()));

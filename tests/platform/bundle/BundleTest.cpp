@@ -6,6 +6,7 @@
 #include <cstring>
 #include <map>
 #include <memory>
+#include <utility>
 #include <string>
 #include <vector>
 
@@ -44,7 +45,7 @@ BundlePtr makeSample()
 
 } // namespace
 
-TEST(Bundle, StoresStringsAndArraysByKey)
+TEST(Bundle, StoresStringsAndArraysByKeyAndCopiesIndependently)
 {
 	BundlePtr b = makeSample();
 	EXPECT_EQ(3, bundle_get_count(b.get()));
@@ -52,7 +53,6 @@ TEST(Bundle, StoresStringsAndArraysByKey)
 	EXPECT_EQ((std::vector<std::string>{"+15550100", "", "0102 \xe2\x98\x8e"}), getArray(b.get(), "numbers"));
 	EXPECT_EQ(BUNDLE_TYPE_STR, bundle_get_type(b.get(), "app_id"));
 	EXPECT_EQ(BUNDLE_TYPE_STR_ARRAY, bundle_get_type(b.get(), "numbers"));
-
 	EXPECT_EQ(BUNDLE_ERROR_KEY_EXISTS, bundle_add_str(b.get(), "app_id", "other"));
 	EXPECT_EQ("org.example.contacts", getStr(b.get(), "app_id"));
 
@@ -63,24 +63,28 @@ TEST(Bundle, StoresStringsAndArraysByKey)
 	int len = 7;
 	EXPECT_EQ(nullptr, bundle_get_str_array(b.get(), "app_id", &len));
 	EXPECT_EQ(0, len);
-
-	EXPECT_EQ(BUNDLE_ERROR_NONE, bundle_del(b.get(), "extra"));
-	EXPECT_EQ(BUNDLE_ERROR_KEY_NOT_AVAILABLE, bundle_del(b.get(), "extra"));
-	EXPECT_EQ(2, bundle_get_count(b.get()));
-
 	const char* none[] = {nullptr};
 	EXPECT_EQ(BUNDLE_ERROR_NONE, bundle_add_str_array(b.get(), "empty", none, 0));
 	EXPECT_TRUE(getArray(b.get(), "empty").empty());
+
+	BundlePtr copy(bundle_dup(b.get()));
+	ASSERT_TRUE(copy);
+	EXPECT_EQ(BUNDLE_ERROR_NONE, bundle_del(b.get(), "numbers"));
+	EXPECT_EQ(BUNDLE_ERROR_KEY_NOT_AVAILABLE, bundle_del(b.get(), "numbers"));
+	EXPECT_EQ(3, bundle_get_count(b.get()));
+	b.reset();
+	EXPECT_EQ(4, bundle_get_count(copy.get()));
+	EXPECT_EQ("Profile sharing", getStr(copy.get(), "extra"));
+	EXPECT_EQ(3u, getArray(copy.get(), "numbers").size());
 }
 
 TEST(Bundle, BadArgumentsAreRejected)
 {
 	BundlePtr b(bundle_create());
 	char* value = nullptr;
+	for (auto [key, text] : {std::pair<const char*, const char*>{nullptr, "v"}, {"", "v"}, {"k", nullptr}})
+		EXPECT_EQ(BUNDLE_ERROR_INVALID_PARAMETER, bundle_add_str(b.get(), key, text));
 	EXPECT_EQ(BUNDLE_ERROR_INVALID_PARAMETER, bundle_add_str(nullptr, "k", "v"));
-	EXPECT_EQ(BUNDLE_ERROR_INVALID_PARAMETER, bundle_add_str(b.get(), nullptr, "v"));
-	EXPECT_EQ(BUNDLE_ERROR_INVALID_PARAMETER, bundle_add_str(b.get(), "", "v"));
-	EXPECT_EQ(BUNDLE_ERROR_INVALID_PARAMETER, bundle_add_str(b.get(), "k", nullptr));
 	EXPECT_EQ(BUNDLE_ERROR_INVALID_PARAMETER, bundle_get_str(b.get(), "k", nullptr));
 	EXPECT_EQ(BUNDLE_ERROR_INVALID_PARAMETER, bundle_get_str(nullptr, "k", &value));
 	EXPECT_EQ(BUNDLE_ERROR_INVALID_PARAMETER, bundle_add_str_array(b.get(), "k", nullptr, 2));
@@ -92,18 +96,6 @@ TEST(Bundle, BadArgumentsAreRejected)
 	EXPECT_EQ(nullptr, bundle_get_str_array(nullptr, "k", nullptr));
 	bundle_foreach(nullptr, nullptr, nullptr);
 	EXPECT_EQ(0, bundle_get_count(b.get()));
-}
-
-TEST(Bundle, CopyIsIndependentOfTheOriginal)
-{
-	BundlePtr original = makeSample();
-	BundlePtr copy(bundle_dup(original.get()));
-	ASSERT_TRUE(copy);
-	bundle_del(original.get(), "numbers");
-	original.reset();
-	EXPECT_EQ(3, bundle_get_count(copy.get()));
-	EXPECT_EQ("Profile sharing", getStr(copy.get(), "extra"));
-	EXPECT_EQ(3u, getArray(copy.get(), "numbers").size());
 }
 
 namespace {

@@ -98,42 +98,22 @@ TEST(Bundle, BadArgumentsAreRejected)
 	EXPECT_EQ(0, bundle_get_count(b.get()));
 }
 
-namespace {
-
-void collect(const char* key, const int type, const bundle_keyval_t* kv, void* data)
-{
-	auto* seen = static_cast<std::map<std::string, std::string>*>(data);
-	auto* entry = const_cast<bundle_keyval_t*>(kv);
-	if (type == BUNDLE_TYPE_STR) {
-		void* value = nullptr;
-		size_t size = 0;
-		ASSERT_EQ(BUNDLE_ERROR_NONE, bundle_keyval_get_basic_val(entry, &value, &size));
-		EXPECT_EQ(strlen(static_cast<char*>(value)) + 1, size);
-		(*seen)[key] = static_cast<char*>(value);
-	} else {
-		void** values = nullptr;
-		unsigned int len = 0;
-		ASSERT_EQ(BUNDLE_ERROR_NONE, bundle_keyval_get_array_val(entry, &values, &len, nullptr));
-		(*seen)[key] = "array of " + std::to_string(len);
-	}
-}
-
-void deleteAll(const char* key, const int, const bundle_keyval_t*, void* data)
-{
-	bundle_del(static_cast<bundle*>(data), key);
-}
-
-} // namespace
-
 TEST(Bundle, ForeachVisitsEveryEntryAndToleratesDeletion)
 {
 	BundlePtr b = makeSample();
 	std::map<std::string, std::string> seen;
-	bundle_foreach(b.get(), collect, &seen);
-	EXPECT_EQ((std::map<std::string, std::string>{{"app_id", "org.example.contacts"},
-		{"extra", "Profile sharing"}, {"numbers", "array of 3"}}), seen);
-
-	bundle_foreach(b.get(), deleteAll, b.get());
+	bundle_foreach(b.get(), [](const char* key, const int type, const bundle_keyval_t* kv, void* data) {
+		void* value = nullptr;
+		size_t size = 0;
+		bool basic = bundle_keyval_get_basic_val(const_cast<bundle_keyval_t*>(kv), &value, &size) == BUNDLE_ERROR_NONE;
+		(*static_cast<std::map<std::string, std::string>*>(data))[key] =
+			basic && size == strlen(static_cast<char*>(value)) + 1 ? static_cast<char*>(value) : "type " + std::to_string(type);
+	}, &seen);
+	EXPECT_EQ((std::map<std::string, std::string>{{"app_id", "org.example.contacts"}, {"extra", "Profile sharing"},
+		{"numbers", "type " + std::to_string(BUNDLE_TYPE_STR_ARRAY)}}), seen);
+	bundle_foreach(b.get(), [](const char* key, const int, const bundle_keyval_t*, void* data) {
+		bundle_del(static_cast<bundle*>(data), key);
+	}, b.get());
 	EXPECT_EQ(0, bundle_get_count(b.get()));
 }
 

@@ -1,30 +1,15 @@
 // Records, child records, lists, filters and queries in memory.
-#include <contacts.h>
-
-#include <gtest/gtest.h>
+#include "../contacts_db/ContactsTestSupport.h"
 
 #include <cstdlib>
 #include <string>
 
-namespace {
-
-struct RecordDeleter {
-	void operator()(contacts_record_h r) const { contacts_record_destroy(r, true); }
-};
-using RecordPtr = std::unique_ptr<contacts_record_s, RecordDeleter>;
-
-RecordPtr make(const char* uri)
-{
-	contacts_record_h r = nullptr;
-	EXPECT_EQ(CONTACTS_ERROR_NONE, contacts_record_create(uri, &r));
-	return RecordPtr(r);
-}
-
-} // namespace
+using ct::test::newRecord;
+using ct::test::RecordPtr;
 
 TEST(ContactsRecord, TypedPropertiesRoundTripAndBadTypesViewsTextsAndHandlesAreRefused)
 {
-	RecordPtr person = make(_contacts_person._uri);
+	RecordPtr person = newRecord(_contacts_person._uri);
 	EXPECT_EQ(CONTACTS_ERROR_NONE, contacts_record_set_str(person.get(), _contacts_person.ringtone_path, "/a.ogg"));
 	char* text = nullptr;
 	EXPECT_EQ(CONTACTS_ERROR_NONE, contacts_record_get_str_p(person.get(), _contacts_person.ringtone_path, &text));
@@ -52,7 +37,7 @@ TEST(ContactsRecord, TypedPropertiesRoundTripAndBadTypesViewsTextsAndHandlesAreR
 	EXPECT_EQ(nullptr, r);
 	EXPECT_EQ(CONTACTS_ERROR_INVALID_PARAMETER, contacts_record_create(nullptr, &r));
 	EXPECT_EQ(CONTACTS_ERROR_INVALID_PARAMETER, contacts_record_destroy(nullptr, true));
-	RecordPtr name = make(_contacts_name._uri);
+	RecordPtr name = newRecord(_contacts_name._uri);
 	EXPECT_EQ(CONTACTS_ERROR_INVALID_PARAMETER, contacts_record_set_str(name.get(), _contacts_name.first, "bad \xC3\x28 utf8"));
 	std::string huge(17 * 1024 * 1024, 'a');
 	EXPECT_EQ(CONTACTS_ERROR_INVALID_PARAMETER, contacts_record_set_str(name.get(), _contacts_name.first, huge.c_str()));
@@ -62,16 +47,16 @@ TEST(ContactsRecord, TypedPropertiesRoundTripAndBadTypesViewsTextsAndHandlesAreR
 
 TEST(ContactsRecord, ChildRecordsAreOwnedCountedRemovedAndCloned)
 {
-	RecordPtr contact = make(_contacts_contact._uri);
+	RecordPtr contact = newRecord(_contacts_contact._uri);
 	for (const char* n : { "1", "2", "3" }) {
-		contacts_record_h number = make(_contacts_number._uri).release();
+		contacts_record_h number = newRecord(_contacts_number._uri).release();
 		contacts_record_set_str(number, _contacts_number.number, n);
 		ASSERT_EQ(CONTACTS_ERROR_NONE, contacts_record_add_child_record(contact.get(), _contacts_contact.number, number));
 		// A child belongs to one parent only and is destroyed with it.
 		EXPECT_EQ(CONTACTS_ERROR_INVALID_PARAMETER, contacts_record_add_child_record(contact.get(), _contacts_contact.number, number));
 		EXPECT_EQ(CONTACTS_ERROR_INVALID_PARAMETER, contacts_record_destroy(number, true));
 	}
-	RecordPtr email = make(_contacts_email._uri);
+	RecordPtr email = newRecord(_contacts_email._uri);
 	EXPECT_EQ(CONTACTS_ERROR_INVALID_PARAMETER, contacts_record_add_child_record(contact.get(), _contacts_contact.number, email.get()));
 	EXPECT_EQ(CONTACTS_ERROR_INVALID_PARAMETER, contacts_record_add_child_record(contact.get(), _contacts_contact.display_name, email.get()));
 
@@ -108,8 +93,8 @@ TEST(ContactsList, CursorWalksAddsPrependsAndRemoves)
 	ASSERT_EQ(CONTACTS_ERROR_NONE, contacts_list_create(&list));
 	contacts_record_h current = nullptr;
 	EXPECT_EQ(CONTACTS_ERROR_NO_DATA, contacts_list_get_current_record_p(list, &current));
-	contacts_record_h a = make(_contacts_group._uri).release(), b = make(_contacts_group._uri).release(),
-					  c = make(_contacts_group._uri).release();
+	contacts_record_h a = newRecord(_contacts_group._uri).release(), b = newRecord(_contacts_group._uri).release(),
+					  c = newRecord(_contacts_group._uri).release();
 	contacts_list_add(list, b);
 	contacts_list_add(list, c);
 	contacts_list_prepend(list, a);

@@ -1,5 +1,5 @@
-// Ringtone information, case-insensitive search, vCards read back by a small
-// independent parser.
+// Ringtone information, case-insensitive search, and vCards read back line by
+// line, independently of the writer.
 #include "../contacts_db/ContactsTestSupport.h"
 
 #include <cstdlib>

@@ -2,6 +2,7 @@
 #include "NotificationLog.h"
 #include "notification.h"
 
+#include "EflEnvironment.h"
 #include "LogSink.h"
 
 #include <Elementary.h>
@@ -15,13 +16,7 @@ using namespace ct::notification;
 
 namespace {
 
-class ElmEnvironment : public testing::Environment {
-public:
-	void SetUp() override { elm_init(0, nullptr); }
-	void TearDown() override { elm_shutdown(); }
-};
-
-const testing::Environment* const g_elm = testing::AddGlobalTestEnvironment(new ElmEnvironment);
+const bool g_elm = ct::test::EflEnvironment::registerOnce();
 
 class NotificationTest : public testing::Test {
 protected:

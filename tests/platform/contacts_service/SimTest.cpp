@@ -34,8 +34,6 @@ TEST(Sim, DefaultSimTakesNamesNumbersAndEmailsWithinItsLimits)
 	int len = 0;
 	contacts_sim_get_field_text_max_len(0, CONTACTS_SIM_FIELD_NAME, &len);
 	EXPECT_EQ(14, len);
-	contacts_sim_get_field_text_max_len(0, CONTACTS_SIM_FIELD_NUMBER, &len);
-	EXPECT_EQ(20, len);
 	bool supported = false;
 	contacts_sim_get_field_status(0, CONTACTS_SIM_FIELD_EMAIL, &supported);
 	EXPECT_TRUE(supported);

@@ -2,7 +2,6 @@
 #include "NotificationLog.h"
 #include "notification.h"
 
-#include "EflEnvironment.h"
 #include "LogSink.h"
 
 #include <Elementary.h>
@@ -16,7 +15,13 @@ using namespace ct::notification;
 
 namespace {
 
-const bool g_elm = ct::test::EflEnvironment::registerOnce();
+class ElmEnvironment : public testing::Environment {
+public:
+	void SetUp() override { elm_init(0, nullptr); }
+	void TearDown() override { elm_shutdown(); }
+};
+
+const testing::Environment* const g_elm = testing::AddGlobalTestEnvironment(new ElmEnvironment);
 
 class NotificationTest : public testing::Test {
 protected:

@@ -123,34 +123,20 @@ TEST_F(CallBlock, OwnChangesCallBackOnTheMainLoop)
 	EXPECT_EQ(1, calls);
 }
 
-namespace {
-
-struct Disconnecting {
-	phone_misc_h handle = nullptr;
-	int calls = 0;
-};
-
-void disconnectCb(void* data)
-{
-	auto* state = static_cast<Disconnecting*>(data);
-	state->calls++;
-	phone_misc_disconnect(state->handle);
-}
-
-void neverCb(void* data)
-{
-	++*static_cast<int*>(data);
-}
-
-} // namespace
-
 TEST_F(CallBlock, DisconnectInsideTheCallbackIsSafe)
 {
-	Disconnecting state;
+	struct {
+		phone_misc_h handle = nullptr;
+		int calls = 0;
+	} state;
 	int later = 0;
 	ASSERT_EQ(PHONE_MISC_ERROR_NONE, phone_misc_connect(&state.handle));
-	ASSERT_EQ(PHONE_MISC_ERROR_NONE, phone_misc_add_block_db_change_cb(state.handle, disconnectCb, &state));
-	ASSERT_EQ(PHONE_MISC_ERROR_NONE, phone_misc_add_block_db_change_cb(state.handle, neverCb, &later));
+	ASSERT_EQ(PHONE_MISC_ERROR_NONE, phone_misc_add_block_db_change_cb(state.handle, [](void* data) {
+		auto* self = static_cast<decltype(state)*>(data);
+		self->calls++;
+		phone_misc_disconnect(self->handle);
+	}, &state));
+	ASSERT_EQ(PHONE_MISC_ERROR_NONE, phone_misc_add_block_db_change_cb(state.handle, countCb, &later));
 	ASSERT_EQ(PHONE_MISC_ERROR_NONE, phone_misc_block_add(state.handle, 1, "444"));
 	ASSERT_TRUE(ct::test::pumpUntil([&] { return state.calls == 1; }));
 	ct::test::pumpFor(0.2);

@@ -193,21 +193,26 @@ TEST_F(AppControlRouterTest, MissingRejectingOrThrowingHandlerFailsTheSendWithou
 	EXPECT_TRUE(launches().empty());
 }
 
-TEST_F(AppControlRouterTest, LateReplyAfterTheSenderCancelledIsNeverDelivered)
+TEST_F(AppControlRouterTest, LateReplyAfterACancelOrATerminateIsNeverDelivered)
 {
 	Reply kept;
 	app_control_h keptRequest = nullptr;
-	Registration reg = registerAppHandler(RINGTONE_PICKER_APP_ID, [&](app_control_h request, const Reply& reply) {
-		kept = reply;
-		app_control_clone(&keptRequest, request);
-		return APP_CONTROL_ERROR_NONE;
-	});
+	int terminated = 0;
+	Registration reg = registerAppHandler(
+			RINGTONE_PICKER_APP_ID,
+			[&](app_control_h request, const Reply& reply) {
+				kept = reply;
+				app_control_clone(&keptRequest, request);
+				return APP_CONTROL_ERROR_NONE;
+			},
+			[&] { ++terminated; });
 	auto sender = std::make_unique<Sender>();
-	auto other = std::make_unique<Sender>();
+	Sender other;
 	ASSERT_EQ(APP_CONTROL_ERROR_NONE, send(RINGTONE_PICKER_APP_ID, nullptr, sender.get()));
 	Reply first = kept;
 	app_control_h firstRequest = keptRequest;
-	ASSERT_EQ(APP_CONTROL_ERROR_NONE, send(RINGTONE_PICKER_APP_ID, nullptr, other.get()));
+	ASSERT_EQ(APP_CONTROL_ERROR_NONE, send(RINGTONE_PICKER_APP_ID, nullptr, &other));
+	app_control_destroy(keptRequest);
 
 	EXPECT_EQ(1u, pendingReplies(sender.get()));
 	{
@@ -216,20 +221,35 @@ TEST_F(AppControlRouterTest, LateReplyAfterTheSenderCancelledIsNeverDelivered)
 	}
 	EXPECT_EQ(0u, pendingReplies(sender.get()));
 	sender.reset();
-	app_control_h answer = makeRequest(nullptr, nullptr);
 	// The handler does not need to know; its answer is simply dropped.
 	EXPECT_EQ(APP_CONTROL_ERROR_NONE,
-			app_control_reply_to_launch_request(answer, firstRequest, APP_CONTROL_RESULT_SUCCEEDED));
+			app_control_reply_to_launch_request(firstRequest, firstRequest, APP_CONTROL_RESULT_SUCCEEDED));
+	app_control_destroy(firstRequest);
 	EXPECT_FALSE(first.isPending());
 	EXPECT_TRUE(kept.isPending());
-	EXPECT_EQ(APP_CONTROL_ERROR_NONE, kept(answer, APP_CONTROL_RESULT_CANCELED));
-	EXPECT_EQ(APP_CONTROL_ERROR_INVALID_PARAMETER, kept(answer, APP_CONTROL_RESULT_SUCCEEDED));
+	EXPECT_EQ(APP_CONTROL_ERROR_NONE, kept(nullptr, APP_CONTROL_RESULT_CANCELED));
+	EXPECT_EQ(APP_CONTROL_ERROR_INVALID_PARAMETER, kept(nullptr, APP_CONTROL_RESULT_SUCCEEDED));
 	pump();
-	ASSERT_EQ(1u, other->received.size());
-	EXPECT_EQ(APP_CONTROL_RESULT_CANCELED, other->received[0].result);
-	app_control_destroy(answer);
-	app_control_destroy(firstRequest);
+	ASSERT_EQ(1u, other.received.size());
+	EXPECT_EQ(APP_CONTROL_RESULT_CANCELED, other.received[0].result);
+
+	// Terminating ends the launch once and calls the hook; no reply follows.
+	clearLaunches();
+	app_control_h h = makeRequest(RINGTONE_PICKER_APP_ID, nullptr);
+	app_control_add_extra_data(h, "marked_mode", "default");
+	ASSERT_EQ(APP_CONTROL_ERROR_NONE, sendFrom(&other, h));
 	app_control_destroy(keptRequest);
+	EXPECT_EQ(APP_CONTROL_ERROR_NONE, app_control_send_terminate_request(h));
+	EXPECT_EQ(APP_CONTROL_ERROR_NONE, app_control_send_terminate_request(h));
+	app_control_destroy(h);
+	EXPECT_EQ(1, terminated);
+	EXPECT_FALSE(kept.isPending());
+	EXPECT_EQ(APP_CONTROL_ERROR_INVALID_PARAMETER, kept(nullptr, APP_CONTROL_RESULT_SUCCEEDED));
+	pump();
+	EXPECT_EQ(1u, other.received.size());
+	ASSERT_EQ(1u, launches().size());
+	EXPECT_TRUE(launches()[0].terminated);
+	EXPECT_EQ("default", launches()[0].extra("marked_mode"));
 }
 
 TEST_F(AppControlRouterTest, CancelBeforeTheMainLoopDropsQueuedRepliesEvenFromAReplyCallback)
@@ -260,36 +280,6 @@ TEST_F(AppControlRouterTest, CancelBeforeTheMainLoopDropsQueuedRepliesEvenFromAR
 	app_control_destroy(h);
 	pump();
 	EXPECT_TRUE(victim.received.empty());
-}
-
-TEST_F(AppControlRouterTest, TerminateEndsTheLaunchAndCallsTheHook)
-{
-	int terminated = 0;
-	Reply kept;
-	Registration reg = registerAppHandler(
-			RINGTONE_PICKER_APP_ID,
-			[&](app_control_h, const Reply& reply) {
-				kept = reply;
-				return APP_CONTROL_ERROR_NONE;
-			},
-			[&] { ++terminated; });
-	Sender sender;
-	app_control_h h = makeRequest(RINGTONE_PICKER_APP_ID, nullptr);
-	app_control_add_extra_data(h, "marked_mode", "default");
-	ASSERT_EQ(APP_CONTROL_ERROR_NONE, sendFrom(&sender, h));
-	EXPECT_EQ(APP_CONTROL_ERROR_NONE, app_control_send_terminate_request(h));
-	EXPECT_EQ(1, terminated);
-	EXPECT_FALSE(kept.isPending());
-	EXPECT_EQ(APP_CONTROL_ERROR_INVALID_PARAMETER, kept(nullptr, APP_CONTROL_RESULT_SUCCEEDED));
-	// Terminating again is harmless.
-	EXPECT_EQ(APP_CONTROL_ERROR_NONE, app_control_send_terminate_request(h));
-	EXPECT_EQ(1, terminated);
-	app_control_destroy(h);
-	pump();
-	EXPECT_TRUE(sender.received.empty());
-	ASSERT_EQ(1u, launches().size());
-	EXPECT_TRUE(launches()[0].terminated);
-	EXPECT_EQ("default", launches()[0].extra("marked_mode"));
 }
 
 TEST_F(AppControlRouterTest, HandlersThatNeverAnswerCannotGrowTheRouterWithoutBound)

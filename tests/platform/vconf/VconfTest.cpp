@@ -159,6 +159,24 @@ TEST_F(Vconf, UnusableFolderOrGarbageStoreIsAnErrorAndTheFileIsLeftAlone)
 	EXPECT_EQ(8192u, std::filesystem::file_size(path));
 }
 
+namespace {
+
+Recorder g_removed;
+
+void removedCb(keynode_t* node, void*)
+{
+	recordCb(node, &g_removed);
+}
+
+void removeOthersCb(keynode_t* node, void* data)
+{
+	recordCb(node, data);
+	vconf_ignore_key_changed(vconf_keynode_get_name(node), removedCb);
+	vconf_ignore_key_changed(vconf_keynode_get_name(node), removeOthersCb);
+}
+
+} // namespace
+
 TEST_F(Vconf, CallbacksSeeOwnChangesOnTheMainLoopAndFollowTheStoreToANewFolder)
 {
 	Recorder first, second;
@@ -192,28 +210,8 @@ TEST_F(Vconf, CallbacksSeeOwnChangesOnTheMainLoopAndFollowTheStoreToANewFolder)
 	ASSERT_EQ(VCONF_OK, vconf_set_int(VCONFKEY_SETAPPL_PSMODE, 0));
 	pumpFor(0.3);
 	EXPECT_EQ(3, second.calls());
-}
 
-namespace {
-
-Recorder g_removed;
-
-void removedCb(keynode_t* node, void*)
-{
-	recordCb(node, &g_removed);
-}
-
-void removeOthersCb(keynode_t* node, void* data)
-{
-	recordCb(node, data);
-	vconf_ignore_key_changed(vconf_keynode_get_name(node), removedCb);
-	vconf_ignore_key_changed(vconf_keynode_get_name(node), removeOthersCb);
-}
-
-} // namespace
-
-TEST_F(Vconf, CallbackRemovedDuringDeliveryIsNotCalled)
-{
+	// A callback removed by another one during delivery is not called.
 	Recorder remover;
 	ASSERT_EQ(VCONF_OK, vconf_notify_key_changed(VCONFKEY_REGIONFORMAT, removeOthersCb, &remover));
 	ASSERT_EQ(VCONF_OK, vconf_notify_key_changed(VCONFKEY_REGIONFORMAT, removedCb, nullptr));

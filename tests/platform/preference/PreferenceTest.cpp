@@ -128,7 +128,7 @@ void unsetSelfCb(const char* key, void* data)
 
 } // namespace
 
-TEST_F(Preference, ChangedCallbackFollowsSetRemoveAndUnsetAndMayUnsetItself)
+TEST_F(Preference, ChangedCallbackFollowsSetRemoveUnsetAndOtherProcessesAndMayUnsetItself)
 {
 	std::vector<std::string> first, second, self;
 	ASSERT_EQ(PREFERENCE_ERROR_NONE, preference_set_changed_cb(PREFERENCE_KEY_HIDE_STORAGE_POPUP, recordKey, &first));
@@ -151,22 +151,19 @@ TEST_F(Preference, ChangedCallbackFollowsSetRemoveAndUnsetAndMayUnsetItself)
 	ct::test::pumpFor(0.3);
 	EXPECT_EQ(2u, second.size());
 	EXPECT_EQ(1u, self.size());
-}
 
-TEST_F(Preference, ChangesFromAnotherProcessReachTheCallback)
-{
+	// Writes of another process reach the callback too.
 	if (ct::test::contactsCtlPath().empty())
 		GTEST_SKIP() << "CONTACTS_TEST_BIN_DIR is not set";
-	std::vector<std::string> calls;
-	ASSERT_EQ(PREFERENCE_ERROR_NONE,
-		preference_set_changed_cb(PREFERENCE_KEY_SHARING_SELECTED_CONTACTS_SET, recordKey, &calls));
-	ASSERT_EQ(0, ct::test::runContactsCtl("pref set my_profile_sharing_selected_contacts_set bool true"));
-	ASSERT_TRUE(ct::test::pumpUntil([&] { return !calls.empty(); }));
+	const char* key = PREFERENCE_KEY_SHARING_SELECTED_CONTACTS_SET;
+	ASSERT_EQ(PREFERENCE_ERROR_NONE, preference_set_changed_cb(key, recordKey, &first));
+	ASSERT_EQ(0, ct::test::runContactsCtl(std::string("pref set ") + key + " bool true"));
+	ASSERT_TRUE(ct::test::pumpUntil([&] { return first.size() == 1; }));
 	bool flag = false;
-	EXPECT_EQ(PREFERENCE_ERROR_NONE, preference_get_boolean(PREFERENCE_KEY_SHARING_SELECTED_CONTACTS_SET, &flag));
+	EXPECT_EQ(PREFERENCE_ERROR_NONE, preference_get_boolean(key, &flag));
 	EXPECT_TRUE(flag);
-
-	ASSERT_EQ(0, ct::test::runContactsCtl("pref remove my_profile_sharing_selected_contacts_set"));
-	ASSERT_TRUE(ct::test::pumpUntil([&] { return calls.size() == 2; }));
-	EXPECT_FALSE(exists(PREFERENCE_KEY_SHARING_SELECTED_CONTACTS_SET));
+	ASSERT_EQ(0, ct::test::runContactsCtl(std::string("pref remove ") + key));
+	ASSERT_TRUE(ct::test::pumpUntil([&] { return first.size() == 2; }));
+	EXPECT_FALSE(exists(key));
+	preference_unset_changed_cb(key);
 }

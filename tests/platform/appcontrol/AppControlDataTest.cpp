@@ -6,6 +6,7 @@
 #include <gtest/gtest.h>
 
 #include <cstdlib>
+#include <memory>
 #include <string>
 #include <vector>
 
@@ -44,39 +45,14 @@ std::vector<std::string> extraArray(app_control_h h, const char* key)
 	return out;
 }
 
-} // namespace
-
-TEST(AppControlData, FieldsAreCopiedInAndOutAndNullClearsThem)
+std::string field(app_control_h h, int (*get)(app_control_h, char**))
 {
-	HandleGuard g;
 	char* text = reinterpret_cast<char*>(1);
-	ASSERT_EQ(APP_CONTROL_ERROR_NONE, app_control_get_operation(g.h, &text));
-	EXPECT_EQ(nullptr, text);
-
-	std::string op = APP_CONTROL_OPERATION_VIEW;
-	ASSERT_EQ(APP_CONTROL_ERROR_NONE, app_control_set_operation(g.h, op.c_str()));
-	op[0] = 'X';
-	ASSERT_EQ(APP_CONTROL_ERROR_NONE, app_control_set_uri(g.h, "tel:0101234"));
-	ASSERT_EQ(APP_CONTROL_ERROR_NONE, app_control_set_mime(g.h, "image/jpg"));
-	ASSERT_EQ(APP_CONTROL_ERROR_NONE, app_control_set_app_id(g.h, "org.velmora.maps"));
-	ASSERT_EQ(APP_CONTROL_ERROR_NONE, app_control_set_launch_mode(g.h, APP_CONTROL_LAUNCH_MODE_GROUP));
-
-	app_control_get_operation(g.h, &text);
-	EXPECT_EQ(APP_CONTROL_OPERATION_VIEW, takeString(text));
-	app_control_get_uri(g.h, &text);
-	EXPECT_EQ("tel:0101234", takeString(text));
-	app_control_get_mime(g.h, &text);
-	EXPECT_EQ("image/jpg", takeString(text));
-	app_control_get_app_id(g.h, &text);
-	EXPECT_EQ("org.velmora.maps", takeString(text));
-	app_control_launch_mode_e mode = APP_CONTROL_LAUNCH_MODE_SINGLE;
-	app_control_get_launch_mode(g.h, &mode);
-	EXPECT_EQ(APP_CONTROL_LAUNCH_MODE_GROUP, mode);
-
-	ASSERT_EQ(APP_CONTROL_ERROR_NONE, app_control_set_uri(g.h, nullptr));
-	app_control_get_uri(g.h, &text);
-	EXPECT_EQ(nullptr, text);
+	EXPECT_EQ(APP_CONTROL_ERROR_NONE, get(h, &text));
+	return takeString(text);
 }
+
+} // namespace
 
 TEST(AppControlData, ExtrasKeepTheirKindAndReplaceOnAdd)
 {
@@ -84,7 +60,6 @@ TEST(AppControlData, ExtrasKeepTheirKindAndReplaceOnAdd)
 	const char* selected[] = {"/a.jpg", "", "/c.jpg"};
 	ASSERT_EQ(APP_CONTROL_ERROR_NONE, app_control_add_extra_data(g.h, "person_id", "12"));
 	ASSERT_EQ(APP_CONTROL_ERROR_NONE, app_control_add_extra_data_array(g.h, APP_CONTROL_DATA_SELECTED, selected, 3));
-
 	EXPECT_EQ("12", extra(g.h, "person_id"));
 	EXPECT_EQ((std::vector<std::string>{"/a.jpg", "", "/c.jpg"}), extraArray(g.h, APP_CONTROL_DATA_SELECTED));
 	bool isArray = false;
@@ -106,82 +81,75 @@ TEST(AppControlData, ExtrasKeepTheirKindAndReplaceOnAdd)
 	EXPECT_EQ("/only.jpg", extra(g.h, APP_CONTROL_DATA_SELECTED));
 	ASSERT_EQ(APP_CONTROL_ERROR_NONE, app_control_add_extra_data_array(g.h, "empty", nullptr, 0));
 	EXPECT_TRUE(extraArray(g.h, "empty").empty());
-
 	EXPECT_EQ(APP_CONTROL_ERROR_NONE, app_control_remove_extra_data(g.h, "person_id"));
 	EXPECT_EQ(APP_CONTROL_ERROR_KEY_NOT_FOUND, app_control_remove_extra_data(g.h, "person_id"));
 	EXPECT_EQ("<err " + std::to_string(APP_CONTROL_ERROR_KEY_NOT_FOUND) + ">", extra(g.h, "person_id"));
 }
 
-TEST(AppControlData, ForeachVisitsEveryKeyAndStopsOnFalse)
+TEST(AppControlData, ForeachVisitsEveryKeySurvivesRemovalAndStopsOnFalse)
 {
 	HandleGuard g;
 	app_control_add_extra_data(g.h, "b", "2");
 	app_control_add_extra_data(g.h, "a", "1");
 	const char* arr[] = {"x"};
 	app_control_add_extra_data_array(g.h, "c", arr, 1);
-
 	std::vector<std::string> seen;
-	auto collect = [](app_control_h, const char* key, void* data) {
+	ASSERT_EQ(APP_CONTROL_ERROR_NONE, app_control_foreach_extra_data(g.h, [](app_control_h, const char* key, void* data) {
 		static_cast<std::vector<std::string>*>(data)->push_back(key);
 		return true;
-	};
-	ASSERT_EQ(APP_CONTROL_ERROR_NONE, app_control_foreach_extra_data(g.h, collect, &seen));
+	}, &seen));
 	EXPECT_EQ((std::vector<std::string>{"a", "b", "c"}), seen);
 
-	// A callback that removes keys while iterating is safe.
+	// Removing keys while iterating is safe; returning false stops.
 	int calls = 0;
-	auto removeAll = [](app_control_h h, const char*, void* data) {
+	app_control_foreach_extra_data(g.h, [](app_control_h h, const char*, void* data) {
 		++*static_cast<int*>(data);
 		app_control_remove_extra_data(h, "b");
 		app_control_remove_extra_data(h, "c");
 		return true;
-	};
-	app_control_foreach_extra_data(g.h, removeAll, &calls);
+	}, &calls);
 	EXPECT_EQ(1, calls);
-
-	calls = 0;
 	app_control_add_extra_data(g.h, "d", "4");
-	auto stop = [](app_control_h, const char*, void* data) {
+	app_control_foreach_extra_data(g.h, [](app_control_h, const char*, void* data) {
 		++*static_cast<int*>(data);
 		return false;
-	};
-	app_control_foreach_extra_data(g.h, stop, &calls);
-	EXPECT_EQ(1, calls);
+	}, &calls);
+	EXPECT_EQ(2, calls);
 }
 
-TEST(AppControlData, CloneIsIndependentOfItsSource)
+TEST(AppControlData, FieldsAreCopiedInAndClonesAreIndependentOfTheirSource)
 {
-	HandleGuard g;
-	app_control_set_operation(g.h, APP_CONTROL_OPERATION_PICK);
-	app_control_add_extra_data(g.h, "type", "36");
+	auto source = std::make_unique<HandleGuard>();
+	EXPECT_EQ("<null>", field(source->h, app_control_get_operation));
+	std::string op = APP_CONTROL_OPERATION_PICK;
+	app_control_set_operation(source->h, op.c_str());
+	op[0] = 'X';
+	app_control_set_uri(source->h, "tel:1");
+	app_control_add_extra_data(source->h, "type", "36");
 	const char* arr[] = {"1", "2"};
-	app_control_add_extra_data_array(g.h, "ids", arr, 2);
-
-	app_control_h clone = nullptr;
-	ASSERT_EQ(APP_CONTROL_ERROR_NONE, app_control_clone(&clone, g.h));
-	app_control_add_extra_data(g.h, "type", "65");
-	app_control_set_operation(g.h, APP_CONTROL_OPERATION_VIEW);
-	app_control_remove_extra_data(g.h, "ids");
-
-	char* op = nullptr;
-	app_control_get_operation(clone, &op);
-	EXPECT_EQ(APP_CONTROL_OPERATION_PICK, takeString(op));
-	EXPECT_EQ("36", extra(clone, "type"));
-	EXPECT_EQ((std::vector<std::string>{"1", "2"}), extraArray(clone, "ids"));
-
-	app_control_destroy(g.h);
-	g.h = nullptr;
-	EXPECT_EQ("36", extra(clone, "type"));
-	app_control_destroy(clone);
+	app_control_add_extra_data_array(source->h, "ids", arr, 2);
+	HandleGuard clone;
+	app_control_destroy(clone.h);
+	ASSERT_EQ(APP_CONTROL_ERROR_NONE, app_control_clone(&clone.h, source->h));
+	app_control_add_extra_data(source->h, "type", "65");
+	app_control_set_operation(source->h, APP_CONTROL_OPERATION_VIEW);
+	app_control_remove_extra_data(source->h, "ids");
+	ASSERT_EQ(APP_CONTROL_ERROR_NONE, app_control_set_uri(source->h, nullptr));
+	EXPECT_EQ("<null>", field(source->h, app_control_get_uri));
+	source.reset();
+	EXPECT_EQ(APP_CONTROL_OPERATION_PICK, field(clone.h, app_control_get_operation));
+	EXPECT_EQ("tel:1", field(clone.h, app_control_get_uri));
+	EXPECT_EQ("36", extra(clone.h, "type"));
+	EXPECT_EQ((std::vector<std::string>{"1", "2"}), extraArray(clone.h, "ids"));
 }
 
 TEST(AppControlData, BadInputGetsAnErrorAndALogLineAndChangesNothing)
 {
 	ct::log::clear();
+	char* text = nullptr;
 	EXPECT_EQ(APP_CONTROL_ERROR_INVALID_PARAMETER, app_control_create(nullptr));
 	EXPECT_EQ(APP_CONTROL_ERROR_INVALID_PARAMETER, app_control_destroy(nullptr));
 	EXPECT_EQ(APP_CONTROL_ERROR_INVALID_PARAMETER, app_control_set_operation(nullptr, "x"));
-	char* text = nullptr;
 	EXPECT_EQ(APP_CONTROL_ERROR_INVALID_PARAMETER, app_control_get_uri(nullptr, &text));
 	EXPECT_EQ(APP_CONTROL_ERROR_INVALID_PARAMETER, app_control_add_extra_data(nullptr, "k", "v"));
 	EXPECT_EQ(APP_CONTROL_ERROR_INVALID_PARAMETER, app_control_clone(nullptr, nullptr));
@@ -192,14 +160,10 @@ TEST(AppControlData, BadInputGetsAnErrorAndALogLineAndChangesNothing)
 	const std::string invalidUtf8 = "ab\xC3\x28";
 	const std::string huge(APP_CONTROL_MAX_VALUE_LENGTH + 1, 'a');
 	const std::string longKey(APP_CONTROL_MAX_KEY_LENGTH + 1, 'k');
-	EXPECT_EQ(APP_CONTROL_ERROR_INVALID_PARAMETER, app_control_add_extra_data(g.h, "key", invalidUtf8.c_str()));
-	EXPECT_EQ(APP_CONTROL_ERROR_INVALID_PARAMETER, app_control_add_extra_data(g.h, "key", huge.c_str()));
-	EXPECT_EQ(APP_CONTROL_ERROR_INVALID_PARAMETER, app_control_add_extra_data(g.h, "key", nullptr));
-	EXPECT_EQ(APP_CONTROL_ERROR_INVALID_PARAMETER, app_control_add_extra_data(g.h, longKey.c_str(), "v"));
-	EXPECT_EQ(APP_CONTROL_ERROR_INVALID_PARAMETER, app_control_add_extra_data(g.h, "", "v"));
-	EXPECT_EQ(APP_CONTROL_ERROR_INVALID_PARAMETER, app_control_add_extra_data(g.h, invalidUtf8.c_str(), "v"));
-	EXPECT_EQ("kept", extra(g.h, "key"));
-
+	for (const char* value : {invalidUtf8.c_str(), huge.c_str(), static_cast<const char*>(nullptr)})
+		EXPECT_EQ(APP_CONTROL_ERROR_INVALID_PARAMETER, app_control_add_extra_data(g.h, "key", value));
+	for (const char* key : {longKey.c_str(), "", invalidUtf8.c_str()})
+		EXPECT_EQ(APP_CONTROL_ERROR_INVALID_PARAMETER, app_control_add_extra_data(g.h, key, "v"));
 	const char* withNull[] = {"a", nullptr};
 	const char* withBad[] = {"a", invalidUtf8.c_str()};
 	EXPECT_EQ(APP_CONTROL_ERROR_INVALID_PARAMETER, app_control_add_extra_data_array(g.h, "key", withNull, 2));
@@ -211,28 +175,18 @@ TEST(AppControlData, BadInputGetsAnErrorAndALogLineAndChangesNothing)
 	app_control_set_uri(g.h, "geo:0,0");
 	EXPECT_EQ(APP_CONTROL_ERROR_INVALID_PARAMETER, app_control_set_uri(g.h, invalidUtf8.c_str()));
 	EXPECT_EQ(APP_CONTROL_ERROR_INVALID_PARAMETER, app_control_set_uri(g.h, huge.c_str()));
-	app_control_get_uri(g.h, &text);
-	EXPECT_EQ("geo:0,0", takeString(text));
+	EXPECT_EQ("geo:0,0", field(g.h, app_control_get_uri));
 	EXPECT_EQ(APP_CONTROL_ERROR_INVALID_PARAMETER,
 			app_control_set_launch_mode(g.h, static_cast<app_control_launch_mode_e>(7)));
-
-	// A value right at the limit is fine.
 	const std::string atLimit(APP_CONTROL_MAX_VALUE_LENGTH, 'b');
 	EXPECT_EQ(APP_CONTROL_ERROR_NONE, app_control_add_extra_data(g.h, "big", atLimit.c_str()));
 	EXPECT_EQ(atLimit.size(), extra(g.h, "big").size());
-}
 
-TEST(AppControlData, CallerAndReplyQueriesNeedAReceivedRequest)
-{
-	HandleGuard g;
-	char* caller = nullptr;
+	// Caller and reply queries need a received request.
 	bool requested = true;
-	EXPECT_EQ(APP_CONTROL_ERROR_INVALID_PARAMETER, app_control_get_caller(g.h, &caller));
-	EXPECT_EQ(nullptr, caller);
+	EXPECT_EQ(APP_CONTROL_ERROR_INVALID_PARAMETER, app_control_get_caller(g.h, &text));
+	EXPECT_EQ(nullptr, text);
 	EXPECT_EQ(APP_CONTROL_ERROR_INVALID_PARAMETER, app_control_is_reply_requested(g.h, &requested));
-	app_control_h reply = nullptr;
-	app_control_create(&reply);
 	EXPECT_EQ(APP_CONTROL_ERROR_INVALID_PARAMETER,
-			app_control_reply_to_launch_request(reply, g.h, APP_CONTROL_RESULT_SUCCEEDED));
-	app_control_destroy(reply);
+			app_control_reply_to_launch_request(g.h, g.h, APP_CONTROL_RESULT_SUCCEEDED));
 }

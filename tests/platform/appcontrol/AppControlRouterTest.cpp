@@ -60,11 +60,22 @@ app_control_h makeRequest(const char* appId, const char* operation)
 	return h;
 }
 
-int sendFrom(Sender& sender, app_control_h h)
+int sendFrom(Sender* sender, app_control_h h)
 {
-	sender.insideSend = true;
-	int err = app_control_send_launch_request(h, recordReplyCb, &sender);
-	sender.insideSend = false;
+	if (!sender)
+		return app_control_send_launch_request(h, nullptr, nullptr);
+	sender->insideSend = true;
+	int err = app_control_send_launch_request(h, recordReplyCb, sender);
+	sender->insideSend = false;
+	return err;
+}
+
+// Sends one request built from the app id and operation.
+int send(const char* appId, const char* operation, Sender* sender = nullptr)
+{
+	app_control_h h = makeRequest(appId, operation);
+	int err = sendFrom(sender, h);
+	app_control_destroy(h);
 	return err;
 }
 
@@ -90,29 +101,27 @@ TEST_F(AppControlRouterTest, HandlerGetsACopyAndItsReplyArrivesOnTheMainLoop)
 {
 	std::string seenCaller;
 	bool seenReplyRequested = false;
-	Registration reg = registerOperationHandler(APP_CONTROL_OPERATION_EDIT,
-			[&](app_control_h request, const Reply& reply) {
-				char* caller = nullptr;
-				app_control_get_caller(request, &caller);
-				seenCaller = caller ? caller : "";
-				free(caller);
-				app_control_is_reply_requested(request, &seenReplyRequested);
-				app_control_h answer = nullptr;
-				app_control_create(&answer);
-				app_control_add_extra_data(answer, APP_CONTROL_DATA_ID, "42");
-				reply(answer, APP_CONTROL_RESULT_SUCCEEDED);
-				app_control_destroy(answer);
-				return APP_CONTROL_ERROR_NONE;
-			});
-
+	app_control_h keptRequest = nullptr;
+	Registration reg = registerOperationHandler(APP_CONTROL_OPERATION_EDIT, [&](app_control_h request, const Reply& reply) {
+		char* caller = nullptr;
+		app_control_get_caller(request, &caller);
+		seenCaller = caller ? caller : "";
+		free(caller);
+		app_control_is_reply_requested(request, &seenReplyRequested);
+		app_control_clone(&keptRequest, request);
+		app_control_h answer = makeRequest(nullptr, nullptr);
+		app_control_add_extra_data(answer, APP_CONTROL_DATA_ID, "42");
+		reply(answer, APP_CONTROL_RESULT_SUCCEEDED);
+		app_control_destroy(answer);
+		return APP_CONTROL_ERROR_NONE;
+	});
 	Sender sender;
 	app_control_h h = makeRequest(nullptr, APP_CONTROL_OPERATION_EDIT);
 	app_control_add_extra_data(h, APP_CONTROL_DATA_ID, "7");
-	ASSERT_EQ(APP_CONTROL_ERROR_NONE, sendFrom(sender, h));
+	ASSERT_EQ(APP_CONTROL_ERROR_NONE, sendFrom(&sender, h));
 	// The sender may drop its handle at once; the reply still comes.
 	app_control_destroy(h);
 	EXPECT_TRUE(sender.received.empty());
-
 	pump();
 	ASSERT_EQ(1u, sender.received.size());
 	EXPECT_EQ(APP_CONTROL_RESULT_SUCCEEDED, sender.received[0].result);
@@ -120,12 +129,20 @@ TEST_F(AppControlRouterTest, HandlerGetsACopyAndItsReplyArrivesOnTheMainLoop)
 	EXPECT_EQ("42", sender.received[0].replyId);
 	EXPECT_EQ(CONTACTS_APP_ID, seenCaller);
 	EXPECT_TRUE(seenReplyRequested);
+	ASSERT_EQ(1u, launches().size());
+	EXPECT_EQ("7", launches()[0].extra(APP_CONTROL_DATA_ID));
+	EXPECT_TRUE(launches()[0].replyRequested);
 
-	std::vector<LaunchRecord> records = launches();
-	ASSERT_EQ(1u, records.size());
-	EXPECT_EQ(APP_CONTROL_OPERATION_EDIT, records[0].operation);
-	EXPECT_EQ("7", records[0].extra(APP_CONTROL_DATA_ID));
-	EXPECT_TRUE(records[0].replyRequested);
+	// Without a reply callback the handler is told so; bad answers are refused.
+	app_control_destroy(keptRequest);
+	ASSERT_EQ(APP_CONTROL_ERROR_NONE, send(nullptr, APP_CONTROL_OPERATION_EDIT));
+	EXPECT_FALSE(seenReplyRequested);
+	EXPECT_FALSE(launches().at(1).replyRequested);
+	EXPECT_EQ(APP_CONTROL_ERROR_INVALID_PARAMETER,
+			app_control_reply_to_launch_request(keptRequest, keptRequest, static_cast<app_control_result_e>(9)));
+	EXPECT_EQ(APP_CONTROL_ERROR_INVALID_PARAMETER,
+			app_control_reply_to_launch_request(nullptr, keptRequest, APP_CONTROL_RESULT_SUCCEEDED));
+	app_control_destroy(keptRequest);
 }
 
 TEST_F(AppControlRouterTest, AppIdWinsOverOperationAndNewestHandlerWins)
@@ -141,41 +158,26 @@ TEST_F(AppControlRouterTest, AppIdWinsOverOperationAndNewestHandlerWins)
 	Registration gallery = registerAppHandler(GALLERY_APP_ID, hit("gallery"));
 	{
 		Registration newer = registerAppHandler(GALLERY_APP_ID, hit("gallery2"));
-		app_control_h h = makeRequest(GALLERY_APP_ID, APP_CONTROL_OPERATION_PICK);
-		EXPECT_EQ(APP_CONTROL_ERROR_NONE, app_control_send_launch_request(h, nullptr, nullptr));
-		app_control_destroy(h);
+		EXPECT_EQ(APP_CONTROL_ERROR_NONE, send(GALLERY_APP_ID, APP_CONTROL_OPERATION_PICK));
 	}
-	app_control_h h = makeRequest(GALLERY_APP_ID, APP_CONTROL_OPERATION_PICK);
-	EXPECT_EQ(APP_CONTROL_ERROR_NONE, app_control_send_launch_request(h, nullptr, nullptr));
-	app_control_destroy(h);
-	h = makeRequest(nullptr, APP_CONTROL_OPERATION_PICK);
-	EXPECT_EQ(APP_CONTROL_ERROR_NONE, app_control_send_launch_request(h, nullptr, nullptr));
-	app_control_destroy(h);
+	EXPECT_EQ(APP_CONTROL_ERROR_NONE, send(GALLERY_APP_ID, APP_CONTROL_OPERATION_PICK));
+	EXPECT_EQ(APP_CONTROL_ERROR_NONE, send(nullptr, APP_CONTROL_OPERATION_PICK));
 	EXPECT_EQ((std::vector<std::string>{"gallery2", "gallery", "pick"}), hits);
 }
 
-TEST_F(AppControlRouterTest, NoHandlerMeansAppNotFoundAndNothingIsRecorded)
+TEST_F(AppControlRouterTest, MissingRejectingOrThrowingHandlerFailsTheSendWithoutAReplyOrARecord)
 {
 	ct::log::clear();
 	app_control_h h = makeRequest(MAPS_APP_ID, APP_CONTROL_OPERATION_VIEW);
-	EXPECT_EQ(APP_CONTROL_ERROR_APP_NOT_FOUND, app_control_send_launch_request(h, nullptr, nullptr));
+	EXPECT_EQ(APP_CONTROL_ERROR_APP_NOT_FOUND, sendFrom(nullptr, h));
 	EXPECT_TRUE(ct::log::contains("no application for app id", DLOG_ERROR));
 	EXPECT_EQ(APP_CONTROL_ERROR_APP_NOT_FOUND, app_control_send_terminate_request(h));
-	{
-		Registration gone = registerAppHandler(MAPS_APP_ID, [](app_control_h, const Reply&) { return 0; });
-	}
-	EXPECT_EQ(APP_CONTROL_ERROR_APP_NOT_FOUND, app_control_send_launch_request(h, nullptr, nullptr));
+	registerAppHandler(MAPS_APP_ID, [](app_control_h, const Reply&) { return 0; }).reset();
+	EXPECT_EQ(APP_CONTROL_ERROR_APP_NOT_FOUND, sendFrom(nullptr, h));
 	app_control_destroy(h);
-
-	app_control_h empty = makeRequest(nullptr, nullptr);
-	EXPECT_EQ(APP_CONTROL_ERROR_APP_NOT_FOUND, app_control_send_launch_request(empty, nullptr, nullptr));
-	app_control_destroy(empty);
+	EXPECT_EQ(APP_CONTROL_ERROR_APP_NOT_FOUND, send(nullptr, nullptr));
 	EXPECT_EQ(APP_CONTROL_ERROR_INVALID_PARAMETER, app_control_send_launch_request(nullptr, nullptr, nullptr));
-	EXPECT_TRUE(launches().empty());
-}
 
-TEST_F(AppControlRouterTest, RejectingOrThrowingHandlerFailsTheSendWithoutAReply)
-{
 	Registration reject = registerAppHandler(IMAGE_EDITOR_APP_ID, [](app_control_h, const Reply& reply) {
 		reply(nullptr, APP_CONTROL_RESULT_SUCCEEDED);
 		return APP_CONTROL_ERROR_LAUNCH_REJECTED;
@@ -184,33 +186,33 @@ TEST_F(AppControlRouterTest, RejectingOrThrowingHandlerFailsTheSendWithoutAReply
 		throw std::runtime_error("broken");
 	});
 	Sender sender;
-	app_control_h h = makeRequest(IMAGE_EDITOR_APP_ID, nullptr);
-	EXPECT_EQ(APP_CONTROL_ERROR_LAUNCH_REJECTED, sendFrom(sender, h));
-	app_control_set_app_id(h, IMAGE_VIEWER_APP_ID);
-	EXPECT_EQ(APP_CONTROL_ERROR_LAUNCH_FAILED, sendFrom(sender, h));
-	app_control_destroy(h);
+	EXPECT_EQ(APP_CONTROL_ERROR_LAUNCH_REJECTED, send(IMAGE_EDITOR_APP_ID, nullptr, &sender));
+	EXPECT_EQ(APP_CONTROL_ERROR_LAUNCH_FAILED, send(IMAGE_VIEWER_APP_ID, nullptr, &sender));
 	pump();
 	EXPECT_TRUE(sender.received.empty());
 	EXPECT_TRUE(launches().empty());
 }
 
-TEST_F(AppControlRouterTest, LateReplyAfterTheSenderCancelledIsNeverDelivered)
+TEST_F(AppControlRouterTest, LateReplyAfterACancelOrATerminateIsNeverDelivered)
 {
 	Reply kept;
 	app_control_h keptRequest = nullptr;
-	Registration reg = registerAppHandler(RINGTONE_PICKER_APP_ID, [&](app_control_h request, const Reply& reply) {
-		kept = reply;
-		app_control_clone(&keptRequest, request);
-		return APP_CONTROL_ERROR_NONE;
-	});
+	int terminated = 0;
+	Registration reg = registerAppHandler(
+			RINGTONE_PICKER_APP_ID,
+			[&](app_control_h request, const Reply& reply) {
+				kept = reply;
+				app_control_clone(&keptRequest, request);
+				return APP_CONTROL_ERROR_NONE;
+			},
+			[&] { ++terminated; });
 	auto sender = std::make_unique<Sender>();
-	auto other = std::make_unique<Sender>();
-	app_control_h h = makeRequest(RINGTONE_PICKER_APP_ID, nullptr);
-	ASSERT_EQ(APP_CONTROL_ERROR_NONE, sendFrom(*sender, h));
+	Sender other;
+	ASSERT_EQ(APP_CONTROL_ERROR_NONE, send(RINGTONE_PICKER_APP_ID, nullptr, sender.get()));
 	Reply first = kept;
 	app_control_h firstRequest = keptRequest;
-	ASSERT_EQ(APP_CONTROL_ERROR_NONE, sendFrom(*other, h));
-	app_control_destroy(h);
+	ASSERT_EQ(APP_CONTROL_ERROR_NONE, send(RINGTONE_PICKER_APP_ID, nullptr, &other));
+	app_control_destroy(keptRequest);
 
 	EXPECT_EQ(1u, pendingReplies(sender.get()));
 	{
@@ -219,36 +221,46 @@ TEST_F(AppControlRouterTest, LateReplyAfterTheSenderCancelledIsNeverDelivered)
 	}
 	EXPECT_EQ(0u, pendingReplies(sender.get()));
 	sender.reset();
-	app_control_h answer = nullptr;
-	app_control_create(&answer);
 	// The handler does not need to know; its answer is simply dropped.
 	EXPECT_EQ(APP_CONTROL_ERROR_NONE,
-			app_control_reply_to_launch_request(answer, firstRequest, APP_CONTROL_RESULT_SUCCEEDED));
+			app_control_reply_to_launch_request(firstRequest, firstRequest, APP_CONTROL_RESULT_SUCCEEDED));
+	app_control_destroy(firstRequest);
 	EXPECT_FALSE(first.isPending());
 	EXPECT_TRUE(kept.isPending());
-	EXPECT_EQ(APP_CONTROL_ERROR_NONE, kept(answer, APP_CONTROL_RESULT_CANCELED));
-	EXPECT_EQ(APP_CONTROL_ERROR_INVALID_PARAMETER, kept(answer, APP_CONTROL_RESULT_SUCCEEDED));
+	EXPECT_EQ(APP_CONTROL_ERROR_NONE, kept(nullptr, APP_CONTROL_RESULT_CANCELED));
+	EXPECT_EQ(APP_CONTROL_ERROR_INVALID_PARAMETER, kept(nullptr, APP_CONTROL_RESULT_SUCCEEDED));
 	pump();
-	ASSERT_EQ(1u, other->received.size());
-	EXPECT_EQ(APP_CONTROL_RESULT_CANCELED, other->received[0].result);
+	ASSERT_EQ(1u, other.received.size());
+	EXPECT_EQ(APP_CONTROL_RESULT_CANCELED, other.received[0].result);
 
-	app_control_destroy(answer);
-	app_control_destroy(firstRequest);
+	// Terminating ends the launch once and calls the hook; no reply follows.
+	clearLaunches();
+	app_control_h h = makeRequest(RINGTONE_PICKER_APP_ID, nullptr);
+	app_control_add_extra_data(h, "marked_mode", "default");
+	ASSERT_EQ(APP_CONTROL_ERROR_NONE, sendFrom(&other, h));
 	app_control_destroy(keptRequest);
+	EXPECT_EQ(APP_CONTROL_ERROR_NONE, app_control_send_terminate_request(h));
+	EXPECT_EQ(APP_CONTROL_ERROR_NONE, app_control_send_terminate_request(h));
+	app_control_destroy(h);
+	EXPECT_EQ(1, terminated);
+	EXPECT_FALSE(kept.isPending());
+	EXPECT_EQ(APP_CONTROL_ERROR_INVALID_PARAMETER, kept(nullptr, APP_CONTROL_RESULT_SUCCEEDED));
+	pump();
+	EXPECT_EQ(1u, other.received.size());
+	ASSERT_EQ(1u, launches().size());
+	EXPECT_TRUE(launches()[0].terminated);
+	EXPECT_EQ("default", launches()[0].extra("marked_mode"));
 }
 
-TEST_F(AppControlRouterTest, CancelAfterReplyButBeforeTheMainLoopDropsTheQueuedReply)
+TEST_F(AppControlRouterTest, CancelBeforeTheMainLoopDropsQueuedRepliesEvenFromAReplyCallback)
 {
 	Registration reg = registerAppHandler(GALLERY_APP_ID, [](app_control_h, const Reply& reply) {
-		reply(nullptr, APP_CONTROL_RESULT_SUCCEEDED);
-		return APP_CONTROL_ERROR_NONE;
+		return reply(nullptr, APP_CONTROL_RESULT_SUCCEEDED);
 	});
 	Sender a, b;
-	app_control_h h = makeRequest(GALLERY_APP_ID, nullptr);
-	sendFrom(a, h);
-	sendFrom(b, h);
-	sendFrom(a, h);
-	app_control_destroy(h);
+	send(GALLERY_APP_ID, nullptr, &a);
+	send(GALLERY_APP_ID, nullptr, &b);
+	send(GALLERY_APP_ID, nullptr, &a);
 	EXPECT_EQ(2u, pendingReplies(&a));
 	EXPECT_EQ(2, app_control_cancel_replies(&a));
 	EXPECT_EQ(0u, pendingReplies(&a));
@@ -256,140 +268,18 @@ TEST_F(AppControlRouterTest, CancelAfterReplyButBeforeTheMainLoopDropsTheQueuedR
 	pump();
 	EXPECT_TRUE(a.received.empty());
 	EXPECT_EQ(1u, b.received.size());
-}
 
-namespace {
-
-struct CancellingSender {
-	Sender* victim;
-	int calls = 0;
-};
-
-void cancelOtherCb(app_control_h, app_control_h, app_control_result_e, void* data)
-{
-	auto* self = static_cast<CancellingSender*>(data);
-	++self->calls;
-	app_control_cancel_replies(self->victim);
-}
-
-} // namespace
-
-TEST_F(AppControlRouterTest, ReplyCallbackCancellingAnotherSenderStopsItsQueuedReply)
-{
-	Registration reg = registerAppHandler(GALLERY_APP_ID, [](app_control_h, const Reply& reply) {
-		reply(nullptr, APP_CONTROL_RESULT_SUCCEEDED);
-		return APP_CONTROL_ERROR_NONE;
-	});
+	// A reply callback that cancels another sender stops its queued reply.
 	Sender victim;
-	CancellingSender killer{&victim};
+	Sender* target = &victim;
 	app_control_h h = makeRequest(GALLERY_APP_ID, nullptr);
-	app_control_send_launch_request(h, cancelOtherCb, &killer);
-	sendFrom(victim, h);
+	app_control_send_launch_request(h, [](app_control_h, app_control_h, app_control_result_e, void* data) {
+		app_control_cancel_replies(*static_cast<Sender**>(data));
+	}, &target);
+	sendFrom(&victim, h);
 	app_control_destroy(h);
 	pump();
-	EXPECT_EQ(1, killer.calls);
 	EXPECT_TRUE(victim.received.empty());
-}
-
-TEST_F(AppControlRouterTest, TerminateEndsTheLaunchAndCallsTheHook)
-{
-	int terminated = 0;
-	Reply kept;
-	Registration reg = registerAppHandler(
-			RINGTONE_PICKER_APP_ID,
-			[&](app_control_h, const Reply& reply) {
-				kept = reply;
-				return APP_CONTROL_ERROR_NONE;
-			},
-			[&] { ++terminated; });
-	Sender sender;
-	app_control_h h = makeRequest(RINGTONE_PICKER_APP_ID, nullptr);
-	app_control_add_extra_data(h, "marked_mode", "default");
-	ASSERT_EQ(APP_CONTROL_ERROR_NONE, sendFrom(sender, h));
-	EXPECT_EQ(APP_CONTROL_ERROR_NONE, app_control_send_terminate_request(h));
-	EXPECT_EQ(1, terminated);
-	EXPECT_FALSE(kept.isPending());
-	EXPECT_EQ(APP_CONTROL_ERROR_INVALID_PARAMETER, kept(nullptr, APP_CONTROL_RESULT_SUCCEEDED));
-	// Terminating again is harmless.
-	EXPECT_EQ(APP_CONTROL_ERROR_NONE, app_control_send_terminate_request(h));
-	EXPECT_EQ(1, terminated);
-	app_control_destroy(h);
-	pump();
-	EXPECT_TRUE(sender.received.empty());
-	ASSERT_EQ(1u, launches().size());
-	EXPECT_TRUE(launches()[0].terminated);
-	EXPECT_EQ("default", launches()[0].extra("marked_mode"));
-}
-
-TEST_F(AppControlRouterTest, ReceivedRequestWithoutReplyCallbackSaysSoAndAcceptsAnAnswer)
-{
-	bool requested = true;
-	app_control_h keptRequest = nullptr;
-	Registration reg = registerOperationHandler(APP_CONTROL_OPERATION_CALL, [&](app_control_h request, const Reply&) {
-		app_control_is_reply_requested(request, &requested);
-		app_control_clone(&keptRequest, request);
-		return APP_CONTROL_ERROR_NONE;
-	});
-	app_control_h h = makeRequest(nullptr, APP_CONTROL_OPERATION_CALL);
-	app_control_set_uri(h, "tel:123");
-	ASSERT_EQ(APP_CONTROL_ERROR_NONE, app_control_send_launch_request(h, nullptr, nullptr));
-	app_control_destroy(h);
-	EXPECT_FALSE(requested);
-	app_control_h answer = nullptr;
-	app_control_create(&answer);
-	EXPECT_EQ(APP_CONTROL_ERROR_INVALID_PARAMETER,
-			app_control_reply_to_launch_request(answer, keptRequest, static_cast<app_control_result_e>(9)));
-	EXPECT_EQ(APP_CONTROL_ERROR_INVALID_PARAMETER,
-			app_control_reply_to_launch_request(nullptr, keptRequest, APP_CONTROL_RESULT_SUCCEEDED));
-	app_control_destroy(answer);
-	app_control_destroy(keptRequest);
-	EXPECT_EQ("tel:123", launches().at(0).uri);
-	EXPECT_FALSE(launches().at(0).replyRequested);
-}
-
-TEST_F(AppControlRouterTest, HandlerMayReplyLaterFromTheMainLoop)
-{
-	struct Later {
-		Reply reply;
-		static Eina_Bool fire(void* data)
-		{
-			auto* self = static_cast<Later*>(data);
-			app_control_h answer = nullptr;
-			app_control_create(&answer);
-			const char* paths[] = {"/tmp/p.jpg"};
-			app_control_add_extra_data_array(answer, APP_CONTROL_DATA_SELECTED, paths, 1);
-			self->reply(answer, APP_CONTROL_RESULT_SUCCEEDED);
-			app_control_destroy(answer);
-			return ECORE_CALLBACK_CANCEL;
-		}
-	} later;
-	Registration reg = registerAppHandler(GALLERY_APP_ID, [&](app_control_h, const Reply& reply) {
-		later.reply = reply;
-		ecore_timer_add(0.0, &Later::fire, &later);
-		return APP_CONTROL_ERROR_NONE;
-	});
-	struct Got {
-		std::string path;
-		int calls = 0;
-	} got;
-	auto cb = [](app_control_h, app_control_h reply, app_control_result_e, void* data) {
-		auto* g = static_cast<Got*>(data);
-		++g->calls;
-		char** values = nullptr;
-		int n = 0;
-		if (app_control_get_extra_data_array(reply, APP_CONTROL_DATA_SELECTED, &values, &n) == 0 && n > 0)
-			g->path = values[0];
-		for (int i = 0; i < n; ++i)
-			free(values[i]);
-		free(values);
-	};
-	app_control_h h = makeRequest(GALLERY_APP_ID, APP_CONTROL_OPERATION_PICK);
-	ASSERT_EQ(APP_CONTROL_ERROR_NONE, app_control_send_launch_request(h, cb, &got));
-	app_control_destroy(h);
-	for (int i = 0; i < 20 && got.calls == 0; ++i)
-		ecore_main_loop_iterate();
-	EXPECT_EQ(1, got.calls);
-	EXPECT_EQ("/tmp/p.jpg", got.path);
 }
 
 TEST_F(AppControlRouterTest, HandlersThatNeverAnswerCannotGrowTheRouterWithoutBound)
@@ -401,7 +291,7 @@ TEST_F(AppControlRouterTest, HandlersThatNeverAnswerCannotGrowTheRouterWithoutBo
 	});
 	app_control_h h = makeRequest(nullptr, APP_CONTROL_OPERATION_CALL);
 	for (int i = 0; i < 1100; ++i)
-		ASSERT_EQ(APP_CONTROL_ERROR_NONE, app_control_send_launch_request(h, nullptr, nullptr));
+		ASSERT_EQ(APP_CONTROL_ERROR_NONE, sendFrom(nullptr, h));
 	app_control_destroy(h);
 	EXPECT_FALSE(replies.front().isPending());
 	EXPECT_TRUE(replies.back().isPending());

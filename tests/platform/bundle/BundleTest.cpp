@@ -6,6 +6,7 @@
 #include <cstring>
 #include <map>
 #include <memory>
+#include <utility>
 #include <string>
 #include <vector>
 
@@ -44,7 +45,7 @@ BundlePtr makeSample()
 
 } // namespace
 
-TEST(Bundle, StoresStringsAndArraysByKey)
+TEST(Bundle, StoresStringsAndArraysByKeyAndCopiesIndependently)
 {
 	BundlePtr b = makeSample();
 	EXPECT_EQ(3, bundle_get_count(b.get()));
@@ -52,7 +53,6 @@ TEST(Bundle, StoresStringsAndArraysByKey)
 	EXPECT_EQ((std::vector<std::string>{"+15550100", "", "0102 \xe2\x98\x8e"}), getArray(b.get(), "numbers"));
 	EXPECT_EQ(BUNDLE_TYPE_STR, bundle_get_type(b.get(), "app_id"));
 	EXPECT_EQ(BUNDLE_TYPE_STR_ARRAY, bundle_get_type(b.get(), "numbers"));
-
 	EXPECT_EQ(BUNDLE_ERROR_KEY_EXISTS, bundle_add_str(b.get(), "app_id", "other"));
 	EXPECT_EQ("org.example.contacts", getStr(b.get(), "app_id"));
 
@@ -63,24 +63,28 @@ TEST(Bundle, StoresStringsAndArraysByKey)
 	int len = 7;
 	EXPECT_EQ(nullptr, bundle_get_str_array(b.get(), "app_id", &len));
 	EXPECT_EQ(0, len);
-
-	EXPECT_EQ(BUNDLE_ERROR_NONE, bundle_del(b.get(), "extra"));
-	EXPECT_EQ(BUNDLE_ERROR_KEY_NOT_AVAILABLE, bundle_del(b.get(), "extra"));
-	EXPECT_EQ(2, bundle_get_count(b.get()));
-
 	const char* none[] = {nullptr};
 	EXPECT_EQ(BUNDLE_ERROR_NONE, bundle_add_str_array(b.get(), "empty", none, 0));
 	EXPECT_TRUE(getArray(b.get(), "empty").empty());
+
+	BundlePtr copy(bundle_dup(b.get()));
+	ASSERT_TRUE(copy);
+	EXPECT_EQ(BUNDLE_ERROR_NONE, bundle_del(b.get(), "numbers"));
+	EXPECT_EQ(BUNDLE_ERROR_KEY_NOT_AVAILABLE, bundle_del(b.get(), "numbers"));
+	EXPECT_EQ(3, bundle_get_count(b.get()));
+	b.reset();
+	EXPECT_EQ(4, bundle_get_count(copy.get()));
+	EXPECT_EQ("Profile sharing", getStr(copy.get(), "extra"));
+	EXPECT_EQ(3u, getArray(copy.get(), "numbers").size());
 }
 
 TEST(Bundle, BadArgumentsAreRejected)
 {
 	BundlePtr b(bundle_create());
 	char* value = nullptr;
+	for (auto [key, text] : {std::pair<const char*, const char*>{nullptr, "v"}, {"", "v"}, {"k", nullptr}})
+		EXPECT_EQ(BUNDLE_ERROR_INVALID_PARAMETER, bundle_add_str(b.get(), key, text));
 	EXPECT_EQ(BUNDLE_ERROR_INVALID_PARAMETER, bundle_add_str(nullptr, "k", "v"));
-	EXPECT_EQ(BUNDLE_ERROR_INVALID_PARAMETER, bundle_add_str(b.get(), nullptr, "v"));
-	EXPECT_EQ(BUNDLE_ERROR_INVALID_PARAMETER, bundle_add_str(b.get(), "", "v"));
-	EXPECT_EQ(BUNDLE_ERROR_INVALID_PARAMETER, bundle_add_str(b.get(), "k", nullptr));
 	EXPECT_EQ(BUNDLE_ERROR_INVALID_PARAMETER, bundle_get_str(b.get(), "k", nullptr));
 	EXPECT_EQ(BUNDLE_ERROR_INVALID_PARAMETER, bundle_get_str(nullptr, "k", &value));
 	EXPECT_EQ(BUNDLE_ERROR_INVALID_PARAMETER, bundle_add_str_array(b.get(), "k", nullptr, 2));
@@ -94,54 +98,22 @@ TEST(Bundle, BadArgumentsAreRejected)
 	EXPECT_EQ(0, bundle_get_count(b.get()));
 }
 
-TEST(Bundle, CopyIsIndependentOfTheOriginal)
-{
-	BundlePtr original = makeSample();
-	BundlePtr copy(bundle_dup(original.get()));
-	ASSERT_TRUE(copy);
-	bundle_del(original.get(), "numbers");
-	original.reset();
-	EXPECT_EQ(3, bundle_get_count(copy.get()));
-	EXPECT_EQ("Profile sharing", getStr(copy.get(), "extra"));
-	EXPECT_EQ(3u, getArray(copy.get(), "numbers").size());
-}
-
-namespace {
-
-void collect(const char* key, const int type, const bundle_keyval_t* kv, void* data)
-{
-	auto* seen = static_cast<std::map<std::string, std::string>*>(data);
-	auto* entry = const_cast<bundle_keyval_t*>(kv);
-	if (type == BUNDLE_TYPE_STR) {
-		void* value = nullptr;
-		size_t size = 0;
-		ASSERT_EQ(BUNDLE_ERROR_NONE, bundle_keyval_get_basic_val(entry, &value, &size));
-		EXPECT_EQ(strlen(static_cast<char*>(value)) + 1, size);
-		(*seen)[key] = static_cast<char*>(value);
-	} else {
-		void** values = nullptr;
-		unsigned int len = 0;
-		ASSERT_EQ(BUNDLE_ERROR_NONE, bundle_keyval_get_array_val(entry, &values, &len, nullptr));
-		(*seen)[key] = "array of " + std::to_string(len);
-	}
-}
-
-void deleteAll(const char* key, const int, const bundle_keyval_t*, void* data)
-{
-	bundle_del(static_cast<bundle*>(data), key);
-}
-
-} // namespace
-
 TEST(Bundle, ForeachVisitsEveryEntryAndToleratesDeletion)
 {
 	BundlePtr b = makeSample();
 	std::map<std::string, std::string> seen;
-	bundle_foreach(b.get(), collect, &seen);
-	EXPECT_EQ((std::map<std::string, std::string>{{"app_id", "org.example.contacts"},
-		{"extra", "Profile sharing"}, {"numbers", "array of 3"}}), seen);
-
-	bundle_foreach(b.get(), deleteAll, b.get());
+	bundle_foreach(b.get(), [](const char* key, const int type, const bundle_keyval_t* kv, void* data) {
+		void* value = nullptr;
+		size_t size = 0;
+		bool basic = bundle_keyval_get_basic_val(const_cast<bundle_keyval_t*>(kv), &value, &size) == BUNDLE_ERROR_NONE;
+		(*static_cast<std::map<std::string, std::string>*>(data))[key] =
+			basic && size == strlen(static_cast<char*>(value)) + 1 ? static_cast<char*>(value) : "type " + std::to_string(type);
+	}, &seen);
+	EXPECT_EQ((std::map<std::string, std::string>{{"app_id", "org.example.contacts"}, {"extra", "Profile sharing"},
+		{"numbers", "type " + std::to_string(BUNDLE_TYPE_STR_ARRAY)}}), seen);
+	bundle_foreach(b.get(), [](const char* key, const int, const bundle_keyval_t*, void* data) {
+		bundle_del(static_cast<bundle*>(data), key);
+	}, b.get());
 	EXPECT_EQ(0, bundle_get_count(b.get()));
 }
 

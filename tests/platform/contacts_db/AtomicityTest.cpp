@@ -55,10 +55,9 @@ void expectAtomic(const ConnectedStore& store, const std::function<int()>& op)
 RecordPtr bigContact()
 {
 	RecordPtr contact = makeContact({ "Big", "Contact", { "1", "2", "3", "4", "5", "6" }, { "a@b", "c@d", "e@f" } });
-	for (int i = 0; i < 10; ++i) {
-		contacts_record_h url = addChild(contact.get(), _contacts_contact.url, _contacts_url._uri);
-		contacts_record_set_str(url, _contacts_url.url, ("http://x/" + std::to_string(i)).c_str());
-	}
+	for (int i = 0; i < 10; ++i)
+		contacts_record_set_str(addChild(contact.get(), _contacts_contact.url, _contacts_url._uri), _contacts_url.url,
+			("http://x/" + std::to_string(i)).c_str());
 	return contact;
 }
 
@@ -75,14 +74,11 @@ TEST(Atomicity, InsertUpdateDeleteAndLinkLoseNothingWhenTheDiskFills)
 	ASSERT_GT(id, 0);
 
 	RecordPtr stored = getRecord(_contacts_contact._uri, id);
-	contacts_record_h number = nullptr;
-	contacts_record_get_child_record_at_p(stored.get(), _contacts_contact.number, 0, &number);
-	contacts_record_set_str(number, _contacts_number.number, "changed");
-	contacts_record_get_child_record_at_p(stored.get(), _contacts_contact.number, 1, &number);
+	contacts_record_set_str(childAt(stored.get(), _contacts_contact.number, 0), _contacts_number.number, "changed");
+	contacts_record_h number = childAt(stored.get(), _contacts_contact.number, 1);
 	contacts_record_remove_child_record(stored.get(), _contacts_contact.number, number);
 	contacts_record_destroy(number, true);
-	contacts_record_h added = addChild(stored.get(), _contacts_contact.email, _contacts_email._uri);
-	contacts_record_set_str(added, _contacts_email.email, "new@x");
+	contacts_record_set_str(addChild(stored.get(), _contacts_contact.email, _contacts_email._uri), _contacts_email.email, "new@x");
 	expectAtomic(store, [&]() { return contacts_db_update_record(stored.get()); });
 	RecordPtr reread = getRecord(_contacts_contact._uri, id);
 	EXPECT_EQ(5, childCount(reread.get(), _contacts_contact.number));
@@ -102,21 +98,16 @@ TEST(Atomicity, ProfileGroupAndSettingWritesLoseNothingWhenTheDiskFills)
 	insertContact({ "Bo", "Kim", { "2" } });
 	expectAtomic(store, []() { return contacts_setting_set_name_display_order(CONTACTS_NAME_DISPLAY_ORDER_LASTFIRST); });
 
-	contacts_record_h group = nullptr;
-	contacts_record_create(_contacts_group._uri, &group);
-	RecordPtr groupOwner(group);
-	contacts_record_set_str(group, _contacts_group.name, "Team");
-	expectAtomic(store, [&]() { return contacts_db_insert_record(group, nullptr); });
-	int groupId = intOf(group, _contacts_group.id);
+	RecordPtr group = newRecord(_contacts_group._uri);
+	contacts_record_set_str(group.get(), _contacts_group.name, "Team");
+	expectAtomic(store, [&]() { return contacts_db_insert_record(group.get(), nullptr); });
+	int groupId = intOf(group.get(), _contacts_group.id);
 	expectAtomic(store, [&]() { return contacts_group_add_contact(groupId, 1); });
 	expectAtomic(store, [&]() { return contacts_db_delete_record(_contacts_group._uri, groupId); });
 
-	contacts_record_h profile = nullptr;
-	contacts_record_create(_contacts_my_profile._uri, &profile);
-	RecordPtr profileOwner(profile);
-	contacts_record_h name = addChild(profile, _contacts_my_profile.name, _contacts_name._uri);
-	contacts_record_set_str(name, _contacts_name.first, "Me");
-	contacts_record_set_str(profile, _contacts_my_profile_ex.status, "Here");
-	expectAtomic(store, [&]() { return contacts_db_insert_record(profile, nullptr); });
+	RecordPtr profile = newRecord(_contacts_my_profile._uri);
+	contacts_record_set_str(addChild(profile.get(), _contacts_my_profile.name, _contacts_name._uri), _contacts_name.first, "Me");
+	contacts_record_set_str(profile.get(), _contacts_my_profile_ex.status, "Here");
+	expectAtomic(store, [&]() { return contacts_db_insert_record(profile.get(), nullptr); });
 	EXPECT_EQ(1, countOf(_contacts_my_profile._uri));
 }

@@ -1,5 +1,5 @@
 // Helpers for the contacts service tests: a connected fresh data folder and
-// short ways to build and read contacts.
+// short ways to build, read and query contacts.
 #pragma once
 
 #include "SqliteDatabase.h"
@@ -40,6 +40,13 @@ private:
 	TempDataDir m_dir;
 };
 
+inline RecordPtr newRecord(const char* uri)
+{
+	contacts_record_h r = nullptr;
+	EXPECT_EQ(CONTACTS_ERROR_NONE, contacts_record_create(uri, &r));
+	return RecordPtr(r);
+}
+
 inline contacts_record_h addChild(contacts_record_h parent, unsigned prop, const char* uri)
 {
 	contacts_record_h child = nullptr;
@@ -48,56 +55,59 @@ inline contacts_record_h addChild(contacts_record_h parent, unsigned prop, const
 	return child;
 }
 
+// The i-th child under prop, owned by the parent (null when missing).
+inline contacts_record_h childAt(contacts_record_h parent, unsigned prop, int i = 0)
+{
+	contacts_record_h child = nullptr;
+	contacts_record_get_child_record_at_p(parent, prop, i, &child);
+	return child;
+}
+
 struct ContactSpec {
-	ContactSpec(std::string f, std::string l, std::vector<std::string> n = {}, std::vector<std::string> e = {},
-		int book = 0, std::string img = "")
-		: first(std::move(f)), last(std::move(l)), numbers(std::move(n)), emails(std::move(e)), addressBook(book),
-		  image(std::move(img))
-	{
-	}
 	std::string first;
 	std::string last;
-	std::vector<std::string> numbers;
-	std::vector<std::string> emails;
+	std::vector<std::string> numbers = {};
+	std::vector<std::string> emails = {};
 	int addressBook = 0;
-	std::string image;
+	std::string image = "";
 };
 
 inline RecordPtr makeContact(const ContactSpec& wanted)
 {
-	contacts_record_h contact = nullptr;
-	contacts_record_create(_contacts_contact._uri, &contact);
-	contacts_record_set_int(contact, _contacts_contact.address_book_id, wanted.addressBook);
+	RecordPtr contact = newRecord(_contacts_contact._uri);
+	contacts_record_set_int(contact.get(), _contacts_contact.address_book_id, wanted.addressBook);
 	if (!wanted.first.empty() || !wanted.last.empty()) {
-		contacts_record_h name = addChild(contact, _contacts_contact.name, _contacts_name._uri);
+		contacts_record_h name = addChild(contact.get(), _contacts_contact.name, _contacts_name._uri);
 		if (!wanted.first.empty())
 			contacts_record_set_str(name, _contacts_name.first, wanted.first.c_str());
 		if (!wanted.last.empty())
 			contacts_record_set_str(name, _contacts_name.last, wanted.last.c_str());
 	}
 	for (const auto& n : wanted.numbers) {
-		contacts_record_h number = addChild(contact, _contacts_contact.number, _contacts_number._uri);
+		contacts_record_h number = addChild(contact.get(), _contacts_contact.number, _contacts_number._uri);
 		contacts_record_set_str(number, _contacts_number.number, n.c_str());
 		contacts_record_set_int(number, _contacts_number.type, CONTACTS_NUMBER_TYPE_CELL);
 	}
-	for (const auto& e : wanted.emails) {
-		contacts_record_h email = addChild(contact, _contacts_contact.email, _contacts_email._uri);
-		contacts_record_set_str(email, _contacts_email.email, e.c_str());
-	}
-	if (!wanted.image.empty()) {
-		contacts_record_h image = addChild(contact, _contacts_contact.image, _contacts_image._uri);
-		contacts_record_set_str(image, _contacts_image.path, wanted.image.c_str());
-	}
-	return RecordPtr(contact);
+	for (const auto& e : wanted.emails)
+		contacts_record_set_str(addChild(contact.get(), _contacts_contact.email, _contacts_email._uri),
+			_contacts_email.email, e.c_str());
+	if (!wanted.image.empty())
+		contacts_record_set_str(addChild(contact.get(), _contacts_contact.image, _contacts_image._uri),
+			_contacts_image.path, wanted.image.c_str());
+	return contact;
 }
 
-// Inserts the contact; returns its id (0 on failure).
+// Inserts the record; returns its id (0 on failure).
+inline int insertRecord(contacts_record_h record)
+{
+	int id = 0;
+	EXPECT_EQ(CONTACTS_ERROR_NONE, contacts_db_insert_record(record, &id));
+	return id;
+}
+
 inline int insertContact(const ContactSpec& wanted)
 {
-	RecordPtr contact = makeContact(wanted);
-	int id = 0;
-	EXPECT_EQ(CONTACTS_ERROR_NONE, contacts_db_insert_record(contact.get(), &id));
-	return id;
+	return insertRecord(makeContact(wanted).get());
 }
 
 inline RecordPtr getRecord(const char* uri, int id)
@@ -111,6 +121,13 @@ inline int intOf(contacts_record_h r, unsigned prop)
 {
 	int v = -1;
 	EXPECT_EQ(CONTACTS_ERROR_NONE, contacts_record_get_int(r, prop, &v));
+	return v;
+}
+
+inline bool boolOf(contacts_record_h r, unsigned prop)
+{
+	bool v = false;
+	EXPECT_EQ(CONTACTS_ERROR_NONE, contacts_record_get_bool(r, prop, &v));
 	return v;
 }
 
@@ -150,13 +167,33 @@ inline std::vector<int> queryIds(contacts_query_h query, unsigned idProp, int of
 	ListPtr owner(list);
 	int count = 0;
 	contacts_list_get_count(list, &count);
-	for (int i = 0; i < count; ++i) {
+	for (int i = 0; i < count; ++i, contacts_list_next(list)) {
 		contacts_record_h r = nullptr;
 		contacts_list_get_current_record_p(list, &r);
 		ids.push_back(intOf(r, idProp));
-		contacts_list_next(list);
 	}
 	return ids;
 }
+
+// A query with its filter on one view, destroyed with the scope.
+struct QueryOwner {
+	contacts_query_h query = nullptr;
+	contacts_filter_h filter = nullptr;
+	explicit QueryOwner(const char* uri)
+	{
+		contacts_query_create(uri, &query);
+		contacts_filter_create(uri, &filter);
+	}
+	~QueryOwner()
+	{
+		contacts_filter_destroy(filter);
+		contacts_query_destroy(query);
+	}
+	std::vector<int> run(unsigned idProp, int offset = 0, int limit = 0)
+	{
+		contacts_query_set_filter(query, filter);
+		return queryIds(query, idProp, offset, limit);
+	}
+};
 
 } // namespace ct::test

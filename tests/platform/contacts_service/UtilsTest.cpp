@@ -1,5 +1,5 @@
-// Ringtone information, case-insensitive search, vCards read back by a small
-// independent parser.
+// Ringtone information, case-insensitive search, and vCards read back line by
+// line, independently of the writer.
 #include "../contacts_db/ContactsTestSupport.h"
 
 #include <cstdlib>
@@ -47,58 +47,37 @@ TEST(Utils, RingtoneInfoIsStoredPerKindAndId)
 
 namespace {
 
-struct VcardLine {
-	std::string name;
-	std::string params;
-	std::vector<std::string> values; // split at unescaped ';', unescaped
-};
-
-// Unfolds (CRLF + space), splits lines and unescapes values, per vCard 3.0.
-std::vector<VcardLine> parseVcard(const std::string& text, bool* wellFormed)
+// The logical lines of a vCard (folds undone), by property name: the
+// parameters and the raw value of each. Sets wellFormed when every line ends in CRLF.
+std::multimap<std::string, std::pair<std::string, std::string>> vcardLines(std::string text, bool* wellFormed)
 {
-	*wellFormed = true;
-	std::string unfolded;
-	for (size_t i = 0; i < text.size(); ++i) {
-		if (text.compare(i, 3, "\r\n ") == 0) {
-			i += 2;
-			continue;
-		}
-		unfolded += text[i];
-	}
-	std::vector<VcardLine> lines;
-	size_t start = 0;
-	while (start < unfolded.size()) {
-		size_t end = unfolded.find("\r\n", start);
-		if (end == std::string::npos) {
-			*wellFormed = false;
-			break;
-		}
-		std::string raw = unfolded.substr(start, end - start);
-		start = end + 2;
-		size_t colon = raw.find(':');
-		VcardLine line;
-		std::string head = raw.substr(0, colon);
+	for (size_t fold; (fold = text.find("\r\n ")) != std::string::npos;)
+		text.erase(fold, 3);
+	*wellFormed = text.size() >= 2 && text.compare(text.size() - 2, 2, "\r\n") == 0;
+	std::multimap<std::string, std::pair<std::string, std::string>> lines;
+	for (size_t start = 0, end; (end = text.find("\r\n", start)) != std::string::npos; start = end + 2) {
+		std::string line = text.substr(start, end - start);
+		size_t colon = line.find(':');
+		std::string head = line.substr(0, colon);
 		size_t semi = head.find(';');
-		line.name = head.substr(0, semi);
-		line.params = semi == std::string::npos ? "" : head.substr(semi + 1);
-		std::string value, current;
-		std::string rest = raw.substr(colon + 1);
-		for (size_t i = 0; i < rest.size(); ++i) {
-			char c = rest[i];
-			if (c == '\\' && i + 1 < rest.size()) {
-				char n = rest[++i];
-				current += n == 'n' || n == 'N' ? '\n' : n;
-			} else if (c == ';') {
-				line.values.push_back(current);
-				current.clear();
-			} else {
-				current += c;
-			}
-		}
-		line.values.push_back(current);
-		lines.push_back(line);
+		lines.emplace(head.substr(0, semi), std::pair{ semi == std::string::npos ? "" : head.substr(semi + 1),
+			line.substr(colon + 1) });
 	}
 	return lines;
+}
+
+std::string unescaped(const std::string& value)
+{
+	std::string out;
+	for (size_t i = 0; i < value.size(); ++i) {
+		if (value[i] != '\\' || i + 1 == value.size()) {
+			out += value[i];
+			continue;
+		}
+		char c = value[++i];
+		out += c == 'n' || c == 'N' ? '\n' : c;
+	}
+	return out;
 }
 
 } // namespace
@@ -110,8 +89,8 @@ TEST(Vcard, PersonVcardCarriesEveryFieldFoldedAndEscaped)
 	for (int i = 0; i < 40; ++i)
 		longNote += "한";
 	RecordPtr contact = makeContact({ "Ánna", "O'Neil", { "+1 555 0100" }, { "anna@example.com" } });
-	contacts_record_h note = addChild(contact.get(), _contacts_contact.note, _contacts_note._uri);
-	contacts_record_set_str(note, _contacts_note.note, longNote.c_str());
+	contacts_record_set_str(addChild(contact.get(), _contacts_contact.note, _contacts_note._uri), _contacts_note.note,
+		longNote.c_str());
 	contacts_record_h company = addChild(contact.get(), _contacts_contact.company, _contacts_company._uri);
 	contacts_record_set_str(company, _contacts_company.name, "ACME; Inc.");
 	contacts_record_set_str(company, _contacts_company.job_title, "Boss");
@@ -122,63 +101,46 @@ TEST(Vcard, PersonVcardCarriesEveryFieldFoldedAndEscaped)
 	contacts_record_set_str(address, _contacts_address.street, "1 Main St");
 	contacts_record_set_str(address, _contacts_address.locality, "Springfield");
 	contacts_record_set_int(address, _contacts_address.type, CONTACTS_ADDRESS_TYPE_HOME);
-	int id = 0;
-	ASSERT_EQ(CONTACTS_ERROR_NONE, contacts_db_insert_record(contact.get(), &id));
+	int id = insertRecord(contact.get());
 	int other = insertContact({ "Second", "", { "999" } });
 	ASSERT_EQ(CONTACTS_ERROR_NONE, contacts_person_link_person(personOf(id), personOf(other)));
 
-	RecordPtr person = getRecord(_contacts_person._uri, personOf(id));
 	char* stream = nullptr;
-	ASSERT_EQ(CONTACTS_ERROR_NONE, contacts_vcard_make_from_person(person.get(), &stream));
+	ASSERT_EQ(CONTACTS_ERROR_NONE,
+		contacts_vcard_make_from_person(getRecord(_contacts_person._uri, personOf(id)).get(), &stream));
 	std::string text = stream;
 	free(stream);
-
 	std::istringstream physical(text);
 	for (std::string l; std::getline(physical, l);)
 		EXPECT_LE(l.size(), 76u) << l; // 75 octets plus the CR
 	bool wellFormed = false;
-	std::vector<VcardLine> lines = parseVcard(text, &wellFormed);
+	auto lines = vcardLines(text, &wellFormed);
 	ASSERT_TRUE(wellFormed);
-	std::multimap<std::string, VcardLine> byName;
-	for (const auto& l : lines)
-		byName.emplace(l.name, l);
-	EXPECT_EQ("BEGIN", lines.front().name);
-	EXPECT_EQ("END", lines.back().name);
-	EXPECT_EQ("3.0", byName.find("VERSION")->second.values[0]);
-	EXPECT_EQ("Ánna O'Neil", byName.find("FN")->second.values[0]);
-	EXPECT_EQ((std::vector<std::string>{ "O'Neil", "Ánna", "", "", "" }), byName.find("N")->second.values);
-	EXPECT_EQ(2u, byName.count("TEL"));
-	EXPECT_EQ("TYPE=CELL", byName.find("TEL")->second.params);
-	EXPECT_EQ("anna@example.com", byName.find("EMAIL")->second.values[0]);
-	EXPECT_EQ(longNote, byName.find("NOTE")->second.values[0]);
-	EXPECT_EQ((std::vector<std::string>{ "ACME; Inc.", "" }), byName.find("ORG")->second.values);
-	EXPECT_EQ("Boss", byName.find("TITLE")->second.values[0]);
-	EXPECT_EQ("1990-01-02", byName.find("BDAY")->second.values[0]);
-	EXPECT_EQ((std::vector<std::string>{ "", "", "1 Main St", "Springfield", "", "", "" }),
-		byName.find("ADR")->second.values);
+	EXPECT_EQ(0u, text.find("BEGIN:VCARD\r\n"));
+	EXPECT_EQ("VCARD", lines.find("END")->second.second);
+	EXPECT_EQ("3.0", lines.find("VERSION")->second.second);
+	EXPECT_EQ("Ánna O'Neil", unescaped(lines.find("FN")->second.second));
+	EXPECT_EQ("O'Neil;Ánna;;;", lines.find("N")->second.second);
+	EXPECT_EQ(2u, lines.count("TEL"));
+	EXPECT_EQ("TYPE=CELL", lines.find("TEL")->second.first);
+	EXPECT_EQ("anna@example.com", lines.find("EMAIL")->second.second);
+	EXPECT_EQ(longNote, unescaped(lines.find("NOTE")->second.second));
+	EXPECT_EQ("ACME\\; Inc.;", lines.find("ORG")->second.second);
+	EXPECT_EQ("Boss", lines.find("TITLE")->second.second);
+	EXPECT_EQ("1990-01-02", lines.find("BDAY")->second.second);
+	EXPECT_EQ(";;1 Main St;Springfield;;;", lines.find("ADR")->second.second);
 
 	EXPECT_EQ(CONTACTS_ERROR_INVALID_PARAMETER, contacts_vcard_make_from_person(contact.get(), &stream));
 	EXPECT_EQ(CONTACTS_ERROR_INVALID_PARAMETER, contacts_vcard_make_from_person(nullptr, &stream));
-}
 
-TEST(Vcard, MyProfileVcardUsesTheProfileRecord)
-{
-	contacts_record_h profile = nullptr;
-	contacts_record_create(_contacts_my_profile._uri, &profile);
-	RecordPtr owner(profile);
-	contacts_record_h name = addChild(profile, _contacts_my_profile.name, _contacts_name._uri);
-	contacts_record_set_str(name, _contacts_name.first, "Me,Myself");
-	char* stream = nullptr;
-	ASSERT_EQ(CONTACTS_ERROR_NONE, contacts_vcard_make_from_my_profile(profile, &stream));
-	bool wellFormed = false;
-	std::vector<VcardLine> lines = parseVcard(stream, &wellFormed);
+	// My profile's vCard is made from the profile record.
+	RecordPtr profile = newRecord(_contacts_my_profile._uri);
+	contacts_record_set_str(addChild(profile.get(), _contacts_my_profile.name, _contacts_name._uri), _contacts_name.first,
+		"Me,Myself");
+	ASSERT_EQ(CONTACTS_ERROR_NONE, contacts_vcard_make_from_my_profile(profile.get(), &stream));
+	lines = vcardLines(stream, &wellFormed);
 	free(stream);
 	ASSERT_TRUE(wellFormed);
-	bool found = false;
-	for (const auto& l : lines)
-		if (l.name == "FN") {
-			EXPECT_EQ("Me,Myself", l.values[0]);
-			found = true;
-		}
-	EXPECT_TRUE(found);
+	ASSERT_EQ(1u, lines.count("FN"));
+	EXPECT_EQ("Me,Myself", unescaped(lines.find("FN")->second.second));
 }

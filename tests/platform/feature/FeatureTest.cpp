@@ -25,18 +25,11 @@ public:
 
 } // namespace
 
-TEST(Features, EveryFlagIsOffByDefault)
+TEST(Features, FlagsAreOffUntilTheFileOrTheEnvironmentSetsThemAndChangesAreReread)
 {
 	ct::test::TempDataDir dir;
-	EXPECT_FALSE(csc_feature_get_bool(CSC_FEATURE_CONTACTS_HIDE_ADDRESS_ROW));
-	EXPECT_FALSE(csc_feature_get_bool(CSC_FEATURE_CONTACTS_EASY_SIGNUP));
-	EXPECT_FALSE(csc_feature_get_bool(-1));
-	EXPECT_FALSE(csc_feature_get_bool(0));
-}
-
-TEST(Features, FileSetsFlagsAndIsRereadWhenItChanges)
-{
-	ct::test::TempDataDir dir;
+	for (int flag : {int(CSC_FEATURE_CONTACTS_HIDE_ADDRESS_ROW), int(CSC_FEATURE_CONTACTS_EASY_SIGNUP), -1, 0})
+		EXPECT_FALSE(csc_feature_get_bool(flag)) << flag;
 	std::string path = dir.file("features.conf");
 	writeFile(path, "# device configuration\n88=true\n12 = TRUE  # style two\n13=false\n");
 	EXPECT_TRUE(csc_feature_get_bool(88));
@@ -47,20 +40,13 @@ TEST(Features, FileSetsFlagsAndIsRereadWhenItChanges)
 	writeFile(path, "# device configuration\n88=fals\n12 = TRUE  # style two\n13=true\n");
 	EXPECT_FALSE(csc_feature_get_bool(88));
 	EXPECT_TRUE(csc_feature_get_bool(13));
-
+	{
+		EnvFeatures env("88, 12,,x7,-3");
+		EXPECT_TRUE(csc_feature_get_bool(88));
+		EXPECT_FALSE(csc_feature_get_bool(7));
+	}
 	std::remove(path.c_str());
 	EXPECT_FALSE(csc_feature_get_bool(12));
-}
-
-TEST(Features, EnvironmentListTurnsFlagsOn)
-{
-	ct::test::TempDataDir dir;
-	writeFile(dir.file("features.conf"), "88=false\n");
-	EnvFeatures env("88, 12,,x7,-3");
-	EXPECT_TRUE(csc_feature_get_bool(88));
-	EXPECT_TRUE(csc_feature_get_bool(12));
-	EXPECT_FALSE(csc_feature_get_bool(7));
-	EXPECT_FALSE(csc_feature_get_bool(13));
 }
 
 TEST(Features, MalformedLinesAreSkipped)

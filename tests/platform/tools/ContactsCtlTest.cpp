@@ -1,5 +1,4 @@
 #include "../vconf/StoreTestSupport.h"
-#include "TempDataDir.h"
 #include "app_preference.h"
 #include "bundle.h"
 #include "vconf.h"
@@ -7,8 +6,6 @@
 
 #include <gtest/gtest.h>
 
-#include <cstdio>
-#include <cstdlib>
 #include <string>
 
 namespace {
@@ -45,7 +42,7 @@ bool contains(const std::string& text, const std::string& part)
 
 } // namespace
 
-TEST_F(ContactsCtl, SelfcheckStartsEveryStoreInTheDataFolder)
+TEST_F(ContactsCtl, SelfcheckStartsEveryStoreInTheDataFolderOrFailsWhenItIsUnusable)
 {
 	std::string out = run("selfcheck");
 	EXPECT_TRUE(contains(out, "data folder: " + m_dir.path()));
@@ -53,32 +50,16 @@ TEST_F(ContactsCtl, SelfcheckStartsEveryStoreInTheDataFolder)
 		EXPECT_TRUE(contains(out, m_dir.file(file))) << file;
 	EXPECT_TRUE(contains(out, "psmode=0 sim1 power=1 region=en_US"));
 	EXPECT_TRUE(contains(out, "all services work"));
-}
-
-TEST_F(ContactsCtl, SelfcheckFailsWhenTheDataFolderIsUnusable)
-{
-	std::string blocker = m_dir.file("plain-file");
-	fclose(fopen(blocker.c_str(), "w"));
-	setenv("CONTACTS_DATA_DIR", (blocker + "/data").c_str(), 1);
-	std::string out = run("selfcheck", 1);
-	setenv("CONTACTS_DATA_DIR", m_dir.path().c_str(), 1);
-	EXPECT_TRUE(contains(out, "some services failed"));
+	ct::test::UnusableDataDir unusable(m_dir);
+	EXPECT_TRUE(contains(run("selfcheck", 1), "some services failed"));
 }
 
 TEST_F(ContactsCtl, BadArgumentsPrintUsageAndExitTwo)
 {
-	run("", 2);
-	run("frobnicate", 2);
-	run("vconf", 2);
-	run("vconf get", 2);
-	run("vconf set db/setting/psmode int", 2);
-	run("vconf set db/setting/psmode int twelve", 2);
-	run("vconf set db/setting/psmode float 1", 2);
-	run("pref set k bool maybe", 2);
-	run("block add", 2);
-	run("block add no-digits", 2);
-	run("usage", 2);
-	run("features extra", 2);
+	for (const char* args : {"", "frobnicate", "vconf", "vconf get", "vconf set db/setting/psmode int",
+			 "vconf set db/setting/psmode int twelve", "vconf set db/setting/psmode float 1", "pref set k bool maybe",
+			 "block add", "block add no-digits", "usage", "features extra"})
+		run(args, 2);
 	EXPECT_TRUE(contains(run("help"), "contacts-ctl vconf set KEY int|bool|double|string VALUE"));
 }
 
@@ -126,9 +107,7 @@ TEST_F(ContactsCtl, ListsUsageRecordsAndFeatures)
 	std::string out = run("usage list");
 	EXPECT_TRUE(contains(out, "\tcontent://usagelog/feature\torg.example.contacts\tCT12\tProfile sharing\t\n")) << out;
 
-	FILE* conf = fopen(m_dir.file("features.conf").c_str(), "w");
-	fputs("13=true\n", conf);
-	fclose(conf);
+	std::ofstream(m_dir.file("features.conf")) << "13=true\n";
 	out = run("features");
 	EXPECT_TRUE(contains(out, "88=false\t(hide address row)"));
 	EXPECT_TRUE(contains(out, "13=true\t(easy sign-up)"));

@@ -36,7 +36,7 @@ app_control_h makeResult(const char* key, const char* value)
 
 } // namespace
 
-TEST_F(UiGadgetTest, ResultsReachTheHostAsCopies)
+TEST_F(UiGadgetTest, ResultsReachTheHostAsCopiesUntilTheGadgetIsClosed)
 {
 	std::vector<std::string> seen;
 	UiGadget gadget("contacts-details", [&](app_control_h result) {
@@ -58,7 +58,17 @@ TEST_F(UiGadgetTest, ResultsReachTheHostAsCopies)
 	EXPECT_EQ("", gadget.resultValue(0, "id"));
 	EXPECT_EQ("9", gadget.resultValue(1, "id"));
 	EXPECT_EQ("", gadget.resultValue(5, "id"));
-	EXPECT_EQ("contacts-details", gadget.name());
+	EXPECT_EQ(UG_ERROR_INVALID_PARAMETER, ug_send_result(gadget.handle(), nullptr));
+
+	// A closed gadget that still exists refuses everything.
+	ug_destroy_me(gadget.handle());
+	pump();
+	EXPECT_TRUE(gadget.isDestroyed());
+	result = makeResult("k", "v");
+	EXPECT_EQ(UG_ERROR_INVALID_PARAMETER, ug_send_result(gadget.handle(), result));
+	EXPECT_EQ(UG_ERROR_INVALID_PARAMETER, ug_destroy_me(gadget.handle()));
+	EXPECT_EQ(2u, gadget.results().size());
+	app_control_destroy(result);
 }
 
 TEST_F(UiGadgetTest, DestroyRunsOnceLaterOnTheMainLoopAndMayDeleteTheGadget)
@@ -76,6 +86,11 @@ TEST_F(UiGadgetTest, DestroyRunsOnceLaterOnTheMainLoopAndMayDeleteTheGadget)
 	EXPECT_EQ(UG_ERROR_NONE, ug_destroy_me(handle));
 	EXPECT_EQ(0, destroyed);
 	EXPECT_TRUE(gadget->isDestroyRequested());
+	// Deleting a gadget with a close pending drops the close.
+	{
+		UiGadget shortLived("short", nullptr, [&] { ++destroyed; });
+		ug_destroy_me(shortLived.handle());
+	}
 	pump();
 	EXPECT_EQ(1, destroyed);
 	EXPECT_EQ(nullptr, gadget);
@@ -85,31 +100,7 @@ TEST_F(UiGadgetTest, DestroyRunsOnceLaterOnTheMainLoopAndMayDeleteTheGadget)
 	EXPECT_EQ(UG_ERROR_INVALID_PARAMETER, ug_send_result(handle, result));
 	EXPECT_EQ(UG_ERROR_INVALID_PARAMETER, ug_destroy_me(handle));
 	EXPECT_TRUE(ct::log::contains("Invalid param : ug", DLOG_ERROR));
-	app_control_destroy(result);
-}
-
-TEST_F(UiGadgetTest, ClosedOrDeletedGadgetRefusesEverythingQuietly)
-{
-	int destroyed = 0;
-	UiGadget kept("kept", nullptr, [&] { ++destroyed; });
-	ug_destroy_me(kept.handle());
-	pump();
-	EXPECT_TRUE(kept.isDestroyed());
-	app_control_h result = makeResult("k", "v");
-	EXPECT_EQ(UG_ERROR_INVALID_PARAMETER, ug_send_result(kept.handle(), result));
-	EXPECT_EQ(UG_ERROR_INVALID_PARAMETER, ug_destroy_me(kept.handle()));
-	EXPECT_TRUE(kept.results().empty());
-
-	// Deleting a gadget with a close pending drops the close.
-	{
-		UiGadget shortLived("short", nullptr, [&] { ++destroyed; });
-		ug_destroy_me(shortLived.handle());
-	}
-	pump();
-	EXPECT_EQ(1, destroyed);
-
 	EXPECT_EQ(UG_ERROR_INVALID_PARAMETER, ug_send_result(nullptr, result));
-	EXPECT_EQ(UG_ERROR_INVALID_PARAMETER, ug_send_result(kept.handle(), nullptr));
 	EXPECT_EQ(UG_ERROR_INVALID_PARAMETER, ug_destroy_me(nullptr));
 	app_control_destroy(result);
 }

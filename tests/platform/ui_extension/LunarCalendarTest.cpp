@@ -1,11 +1,15 @@
+// Locale date texts and the Chinese lunar calendar.
 #include "ui_extension.h"
 
 #include <gtest/gtest.h>
 
+#include <cstdlib>
 #include <ctime>
-#include <tuple>
+#include <string>
 
 namespace {
+
+constexpr int kLunar = UXT_CALENDAR_LUNAR_CHINESE;
 
 struct tm makeDate(int year, int month, int day)
 {
@@ -16,128 +20,104 @@ struct tm makeDate(int year, int month, int day)
 	return date;
 }
 
-struct LunarDate {
-	int year, month, day;
-	bool leap;
-};
-
-LunarDate toLunar(int year, int month, int day)
+std::string dateText(const char* region, int year, int month, int day, int format)
 {
-	struct tm solar = makeDate(year, month, day);
-	struct tm lunar = {};
-	int leap = -1;
-	EXPECT_EQ(uxt_util_convert_gregorian_time_to_lunar_time(UXT_CALENDAR_LUNAR_CHINESE, &solar, &lunar, &leap), 0);
-	return { lunar.tm_year + 1900, lunar.tm_mon + 1, lunar.tm_mday, leap == 1 };
+	struct tm date = makeDate(year, month, day);
+	char* text = uxt_util_get_date_time_text_by_locale(region, &date, format);
+	std::string result = text ? text : "(null)";
+	free(text);
+	return result;
+}
+
+std::string ymd(const struct tm& t)
+{
+	return std::to_string(t.tm_year + 1900) + "-" + std::to_string(t.tm_mon + 1) + "-" + std::to_string(t.tm_mday);
 }
 
 } // namespace
 
-TEST(LunarCalendar, ChineseNewYearsAndThe2023LeapSecondMonth)
+TEST(DateText, FormatsSixAndSevenFollowTheRegion)
 {
-	for (auto [y, m, d] : { std::tuple { 2023, 1, 22 }, { 2024, 2, 10 }, { 2025, 1, 29 }, { 1950, 2, 17 },
-			 { 2000, 2, 5 }, { 2037, 2, 15 } }) {
-		LunarDate newYear = toLunar(y, m, d);
-		EXPECT_EQ(newYear.year, y);
-		EXPECT_EQ(newYear.month, 1);
-		EXPECT_EQ(newYear.day, 1);
-		EXPECT_FALSE(newYear.leap);
-		LunarDate eve = toLunar(y, m, d - 1);
-		EXPECT_EQ(eve.year, y - 1);
-		EXPECT_EQ(eve.month, 12);
-	}
-
-	LunarDate leapStart = toLunar(2023, 3, 22);
-	EXPECT_EQ(leapStart.year, 2023);
-	EXPECT_EQ(leapStart.month, 2);
-	EXPECT_EQ(leapStart.day, 1);
-	EXPECT_TRUE(leapStart.leap);
-	LunarDate ordinarySecond = toLunar(2023, 2, 20);
-	EXPECT_EQ(ordinarySecond.month, 2);
-	EXPECT_EQ(ordinarySecond.day, 1);
-	EXPECT_FALSE(ordinarySecond.leap);
-
-	struct tm lunar = makeDate(2023, 2, 1);
-	struct tm solar = {};
-	ASSERT_EQ(uxt_util_convert_lunar_time_to_gregorian_time(UXT_CALENDAR_LUNAR_CHINESE, &lunar, 1, &solar), 0);
-	EXPECT_EQ(solar.tm_year + 1900, 2023);
-	EXPECT_EQ(solar.tm_mon + 1, 3);
-	EXPECT_EQ(solar.tm_mday, 22);
-	ASSERT_EQ(uxt_util_convert_lunar_time_to_gregorian_time(UXT_CALENDAR_LUNAR_CHINESE, &lunar, 0, &solar), 0);
-	EXPECT_EQ(solar.tm_mon + 1, 2);
-	EXPECT_EQ(solar.tm_mday, 20);
-
-	EXPECT_EQ(uxt_util_is_leap_month_possible(UXT_CALENDAR_LUNAR_CHINESE, &lunar), 1);
-	struct tm third = makeDate(2023, 3, 1);
-	EXPECT_EQ(uxt_util_is_leap_month_possible(UXT_CALENDAR_LUNAR_CHINESE, &third), 0);
-	struct tm leap2020 = makeDate(2020, 4, 1);
-	EXPECT_EQ(uxt_util_is_leap_month_possible(UXT_CALENDAR_LUNAR_CHINESE, &leap2020), 1);
+	EXPECT_EQ(dateText("en_US", 2023, 1, 22, 7), "January 22, 2023");
+	EXPECT_EQ(dateText("en_US.UTF-8", 2023, 1, 22, 6), "January 22");
+	EXPECT_EQ(dateText("en_GB", 2024, 2, 10, 7), "10 February 2024");
+	EXPECT_EQ(dateText("de_DE.UTF-8", 2024, 2, 10, 6), "10. Februar");
+	// A birthday without year keeps 29 February.
+	EXPECT_EQ(dateText("en_US", 0, 2, 29, 6), "February 29");
+	EXPECT_EQ(dateText(nullptr, 2025, 1, 29, 7), "January 29, 2025");
+	EXPECT_EQ(dateText("en_US", 2025, 1, 29, 3), "(null)");
+	EXPECT_EQ(uxt_util_get_date_time_text_by_locale("en_US", nullptr, 7), nullptr);
 }
 
-TEST(LunarCalendar, EveryDayFrom1902To2037RoundTrips)
+TEST(LunarCalendar, NewYearsEvesAndThe2023LeapSecondMonthConvertBothWays)
+{
+	struct Case {
+		int y, m, d;
+		const char* lunar;
+		int leap;
+	} cases[] = { { 2023, 1, 22, "2023-1-1", 0 }, { 2023, 1, 21, "2022-12-30", 0 }, { 2024, 2, 10, "2024-1-1", 0 },
+		{ 2025, 1, 29, "2025-1-1", 0 }, { 1950, 2, 17, "1950-1-1", 0 }, { 2000, 2, 5, "2000-1-1", 0 },
+		{ 2037, 2, 15, "2037-1-1", 0 }, { 2023, 3, 22, "2023-2-1", 1 }, { 2023, 2, 20, "2023-2-1", 0 } };
+	for (const Case& c : cases) {
+		struct tm solar = makeDate(c.y, c.m, c.d), lunar = {}, back = {};
+		int leap = -1;
+		ASSERT_EQ(uxt_util_convert_gregorian_time_to_lunar_time(kLunar, &solar, &lunar, &leap), 0);
+		EXPECT_EQ(c.lunar, ymd(lunar)) << ymd(solar);
+		EXPECT_EQ(c.leap, leap) << ymd(solar);
+		ASSERT_EQ(uxt_util_convert_lunar_time_to_gregorian_time(kLunar, &lunar, c.leap, &back), 0);
+		EXPECT_EQ(ymd(solar), ymd(back));
+	}
+	struct tm second = makeDate(2023, 2, 1), third = makeDate(2023, 3, 1), fourth2020 = makeDate(2020, 4, 1);
+	EXPECT_EQ(uxt_util_is_leap_month_possible(kLunar, &second), 1);
+	EXPECT_EQ(uxt_util_is_leap_month_possible(kLunar, &third), 0);
+	EXPECT_EQ(uxt_util_is_leap_month_possible(kLunar, &fourth2020), 1);
+}
+
+TEST(LunarCalendar, EveryDayFrom1902To2037AndDaysOutsideTheTableRoundTrip)
 {
 	struct tm day = makeDate(1902, 1, 1);
 	time_t t = timegm(&day);
 	const time_t end = timegm(&(day = makeDate(2037, 12, 31)));
-	int checked = 0;
-	int leapDays = 0;
-	for (; t <= end; t += 86400) {
-		struct tm solar;
-		gmtime_r(&t, &solar);
-		struct tm lunar = {};
+	int checked = 0, leapDays = 0;
+	auto roundTrip = [&](const struct tm& solar) {
+		struct tm lunar = {}, back = {};
 		int leap = 0;
-		ASSERT_EQ(uxt_util_convert_gregorian_time_to_lunar_time(1, &solar, &lunar, &leap), 0);
-		struct tm back = {};
-		ASSERT_EQ(uxt_util_convert_lunar_time_to_gregorian_time(1, &lunar, leap, &back), 0)
-			<< solar.tm_year + 1900 << "-" << solar.tm_mon + 1 << "-" << solar.tm_mday;
-		ASSERT_EQ(back.tm_year, solar.tm_year);
-		ASSERT_EQ(back.tm_mon, solar.tm_mon);
-		ASSERT_EQ(back.tm_mday, solar.tm_mday);
+		ASSERT_EQ(uxt_util_convert_gregorian_time_to_lunar_time(kLunar, &solar, &lunar, &leap), 0);
+		ASSERT_EQ(uxt_util_convert_lunar_time_to_gregorian_time(kLunar, &lunar, leap, &back), 0) << ymd(solar);
+		ASSERT_EQ(ymd(solar), ymd(back));
 		ASSERT_TRUE(lunar.tm_mday >= 1 && lunar.tm_mday <= 30);
 		if (leap) {
-			ASSERT_EQ(uxt_util_is_leap_month_possible(1, &lunar), 1);
+			ASSERT_EQ(uxt_util_is_leap_month_possible(kLunar, &lunar), 1);
 		}
 		leapDays += leap;
 		++checked;
+	};
+	for (; t <= end && !testing::Test::HasFatalFailure(); t += 86400) {
+		struct tm solar;
+		roundTrip(*gmtime_r(&t, &solar));
 	}
 	EXPECT_EQ(checked, 49674);
 	// About 50 leap months in 136 years, each 29 or 30 days.
 	EXPECT_GT(leapDays, 45 * 29);
 	EXPECT_LT(leapDays, 55 * 30);
-}
-
-TEST(LunarCalendar, DatesOutsideTheMonthTableStillConvert)
-{
-	for (int year : { 1850, 2150 }) {
-		struct tm solar = makeDate(year, 6, 15);
-		struct tm lunar = {};
-		int leap = 0;
-		ASSERT_EQ(uxt_util_convert_gregorian_time_to_lunar_time(1, &solar, &lunar, &leap), 0);
-		EXPECT_EQ(lunar.tm_year + 1900, year);
-		struct tm back = {};
-		ASSERT_EQ(uxt_util_convert_lunar_time_to_gregorian_time(1, &lunar, leap, &back), 0);
-		EXPECT_EQ(back.tm_year, solar.tm_year);
-		EXPECT_EQ(back.tm_mon, solar.tm_mon);
-		EXPECT_EQ(back.tm_mday, solar.tm_mday);
-	}
+	roundTrip(makeDate(1850, 6, 15));
+	roundTrip(makeDate(2150, 6, 15));
 }
 
 TEST(LunarCalendar, ImpossibleDatesAndBadInputAreRefused)
 {
 	struct tm out = {};
 	int leap = 0;
-	struct tm feb30 = makeDate(2023, 2, 30);
-	EXPECT_LT(uxt_util_convert_gregorian_time_to_lunar_time(1, &feb30, &out, &leap), 0);
-	EXPECT_LT(uxt_util_convert_gregorian_time_to_lunar_time(1, nullptr, &out, &leap), 0);
-	struct tm ok = makeDate(2023, 5, 5);
-	EXPECT_LT(uxt_util_convert_gregorian_time_to_lunar_time(0, &ok, &out, &leap), 0);
-	EXPECT_LT(uxt_util_convert_gregorian_time_to_lunar_time(1, &ok, nullptr, &leap), 0);
-	EXPECT_EQ(uxt_util_convert_gregorian_time_to_lunar_time(1, &ok, &out, nullptr), 0);
+	struct tm feb30 = makeDate(2023, 2, 30), ok = makeDate(2023, 5, 5);
+	EXPECT_LT(uxt_util_convert_gregorian_time_to_lunar_time(kLunar, &feb30, &out, &leap), 0);
+	EXPECT_LT(uxt_util_convert_gregorian_time_to_lunar_time(kLunar, nullptr, &out, &leap), 0);
+	EXPECT_LT(uxt_util_convert_gregorian_time_to_lunar_time(UXT_CALENDAR_SOLAR, &ok, &out, &leap), 0);
+	EXPECT_LT(uxt_util_convert_gregorian_time_to_lunar_time(kLunar, &ok, nullptr, &leap), 0);
+	EXPECT_EQ(uxt_util_convert_gregorian_time_to_lunar_time(kLunar, &ok, &out, nullptr), 0);
 
-	struct tm noLeapThird = makeDate(2023, 3, 1);
-	EXPECT_LT(uxt_util_convert_lunar_time_to_gregorian_time(1, &noLeapThird, 1, &out), 0);
-	struct tm day31 = makeDate(2023, 1, 31);
-	EXPECT_LT(uxt_util_convert_lunar_time_to_gregorian_time(1, &day31, 0, &out), 0);
-	struct tm badMonth = makeDate(2023, 13, 1);
-	EXPECT_LT(uxt_util_is_leap_month_possible(1, &badMonth), 0);
-	EXPECT_LT(uxt_util_is_leap_month_possible(1, nullptr), 0);
+	struct tm noLeapThird = makeDate(2023, 3, 1), day31 = makeDate(2023, 1, 31), badMonth = makeDate(2023, 13, 1);
+	EXPECT_LT(uxt_util_convert_lunar_time_to_gregorian_time(kLunar, &noLeapThird, 1, &out), 0);
+	EXPECT_LT(uxt_util_convert_lunar_time_to_gregorian_time(kLunar, &day31, 0, &out), 0);
+	EXPECT_LT(uxt_util_is_leap_month_possible(kLunar, &badMonth), 0);
+	EXPECT_LT(uxt_util_is_leap_month_possible(kLunar, nullptr), 0);
 }

@@ -1,14 +1,13 @@
 #include "velmora_log_manager.h"
 
+#include "../vconf/StoreTestSupport.h"
 #include "SqliteFaultInjector.h"
-#include "TempDataDir.h"
 #include "UsageLog.h"
 
 #include <gtest/gtest.h>
 
 #include <glib.h>
 
-#include <cstdio>
 #include <memory>
 #include <string>
 
@@ -44,7 +43,7 @@ int insertOnce(const char* uri, bundle* data, int* outId = nullptr)
 
 } // namespace
 
-TEST(UsageLog, RecordsAreAppendedAndKeptInOrder)
+TEST(UsageLog, RecordsAreAppendedInOrderAndAFullDiskLosesNoEarlierRecord)
 {
 	ct::test::TempDataDir dir;
 	int64_t before = g_get_real_time() / 1000;
@@ -54,6 +53,14 @@ TEST(UsageLog, RecordsAreAppendedAndKeptInOrder)
 	bundle_add_str(status.get(), "value", "on");
 	ASSERT_EQ(0, insertOnce(USAGE_LOG_STATUS_URI, status.get(), &secondId));
 	EXPECT_LT(firstId, secondId);
+	velmora_log_manager_h handle = nullptr;
+	ASSERT_EQ(0, velmora_log_manager_create(&handle));
+	{
+		ct::db::ScopedWriteFailure diskFull(1);
+		EXPECT_EQ(VELMORA_LOG_MANAGER_ERROR_NO_SPACE,
+			velmora_log_manager_insert(handle, USAGE_LOG_FEATURE_URI, makeRecord("CT02").get(), 0, 0, nullptr));
+	}
+	velmora_log_manager_destroy(handle);
 
 	auto records = ct::usagelog::records();
 	ASSERT_EQ(2u, records.size());
@@ -68,51 +75,26 @@ TEST(UsageLog, RecordsAreAppendedAndKeptInOrder)
 	EXPECT_EQ("on", records[1].value);
 }
 
-TEST(UsageLog, IncompleteOrBadRecordsAreRefused)
+TEST(UsageLog, IncompleteOrBadRecordsAndAnUnusableFolderAreRefused)
 {
 	ct::test::TempDataDir dir;
 	velmora_log_manager_h handle = nullptr;
 	ASSERT_EQ(0, velmora_log_manager_create(&handle));
 	auto good = makeRecord("CT09");
-	EXPECT_EQ(VELMORA_LOG_MANAGER_ERROR_INVALID_PARAMETER, velmora_log_manager_insert(nullptr, USAGE_LOG_FEATURE_URI, good.get(), 0, 0, nullptr));
-	EXPECT_EQ(VELMORA_LOG_MANAGER_ERROR_INVALID_PARAMETER, velmora_log_manager_insert(handle, nullptr, good.get(), 0, 0, nullptr));
-	EXPECT_EQ(VELMORA_LOG_MANAGER_ERROR_INVALID_PARAMETER, velmora_log_manager_insert(handle, "content://elsewhere", good.get(), 0, 0, nullptr));
-	EXPECT_EQ(VELMORA_LOG_MANAGER_ERROR_INVALID_PARAMETER, velmora_log_manager_insert(handle, USAGE_LOG_FEATURE_URI, nullptr, 0, 0, nullptr));
-	EXPECT_EQ(VELMORA_LOG_MANAGER_ERROR_INVALID_PARAMETER, velmora_log_manager_insert(handle, USAGE_LOG_FEATURE_URI, makeRecord(nullptr).get(), 0, 0, nullptr));
-	EXPECT_EQ(VELMORA_LOG_MANAGER_ERROR_INVALID_PARAMETER, velmora_log_manager_insert(handle, USAGE_LOG_FEATURE_URI, makeRecord("CT09", "\xff\xfe").get(), 0, 0, nullptr));
 	std::string huge(4097, 'x');
-	EXPECT_EQ(VELMORA_LOG_MANAGER_ERROR_INVALID_PARAMETER, velmora_log_manager_insert(handle, USAGE_LOG_FEATURE_URI, makeRecord("CT09", huge.c_str()).get(), 0, 0, nullptr));
+	EXPECT_EQ(VELMORA_LOG_MANAGER_ERROR_INVALID_PARAMETER, velmora_log_manager_insert(nullptr, USAGE_LOG_FEATURE_URI, good.get(), 0, 0, nullptr));
+	for (const char* uri : {static_cast<const char*>(nullptr), "content://elsewhere"})
+		EXPECT_EQ(VELMORA_LOG_MANAGER_ERROR_INVALID_PARAMETER, velmora_log_manager_insert(handle, uri, good.get(), 0, 0, nullptr));
+	EXPECT_EQ(VELMORA_LOG_MANAGER_ERROR_INVALID_PARAMETER, velmora_log_manager_insert(handle, USAGE_LOG_FEATURE_URI, nullptr, 0, 0, nullptr));
+	for (const BundlePtr& bad : {makeRecord(nullptr), makeRecord("CT09", "\xff\xfe"), makeRecord("CT09", huge.c_str())})
+		EXPECT_EQ(VELMORA_LOG_MANAGER_ERROR_INVALID_PARAMETER, velmora_log_manager_insert(handle, USAGE_LOG_FEATURE_URI, bad.get(), 0, 0, nullptr));
 	EXPECT_EQ(VELMORA_LOG_MANAGER_ERROR_INVALID_PARAMETER, velmora_log_manager_create(nullptr));
 	EXPECT_EQ(VELMORA_LOG_MANAGER_ERROR_INVALID_PARAMETER, velmora_log_manager_destroy(nullptr));
 	velmora_log_manager_destroy(handle);
 	EXPECT_TRUE(ct::usagelog::records().empty());
-}
 
-TEST(UsageLog, FullDiskLosesNoEarlierRecord)
-{
-	ct::test::TempDataDir dir;
-	ASSERT_EQ(0, insertOnce(USAGE_LOG_FEATURE_URI, makeRecord("CT01").get()));
-	velmora_log_manager_h handle = nullptr;
-	ASSERT_EQ(0, velmora_log_manager_create(&handle));
-	{
-		ct::db::ScopedWriteFailure diskFull(1);
-		EXPECT_EQ(VELMORA_LOG_MANAGER_ERROR_NO_SPACE,
-			velmora_log_manager_insert(handle, USAGE_LOG_FEATURE_URI, makeRecord("CT02").get(), 0, 0, nullptr));
-	}
-	velmora_log_manager_destroy(handle);
-	auto records = ct::usagelog::records();
-	ASSERT_EQ(1u, records.size());
-	EXPECT_EQ("CT01", records[0].feature);
-}
-
-TEST(UsageLog, UnusableDataFolderFailsToCreate)
-{
-	ct::test::TempDataDir dir;
-	std::string blocker = dir.file("plain-file");
-	fclose(fopen(blocker.c_str(), "w"));
-	setenv("CONTACTS_DATA_DIR", (blocker + "/sub").c_str(), 1);
-	velmora_log_manager_h handle = reinterpret_cast<velmora_log_manager_h>(0x1);
+	ct::test::UnusableDataDir unusable(dir);
+	handle = reinterpret_cast<velmora_log_manager_h>(0x1);
 	EXPECT_EQ(VELMORA_LOG_MANAGER_ERROR_PERMISSION_DENIED, velmora_log_manager_create(&handle));
 	EXPECT_EQ(nullptr, handle);
-	EXPECT_TRUE(ct::usagelog::records().empty());
 }

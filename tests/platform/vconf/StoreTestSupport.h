@@ -1,12 +1,16 @@
 // Helpers shared by the platform store tests: pumping the EFL main loop until
-// something happened, and running contacts-ctl as a second process.
+// something happened, an unusable data folder, and running contacts-ctl as a
+// second process.
 #pragma once
+
+#include "TempDataDir.h"
 
 #include <Ecore.h>
 
 #include <chrono>
 #include <cstdlib>
 #include <cstdio>
+#include <fstream>
 #include <functional>
 #include <string>
 #include <thread>
@@ -48,6 +52,21 @@ inline void pumpFor(double seconds)
 {
 	pumpUntil([] { return false; }, seconds);
 }
+
+// Points CONTACTS_DATA_DIR below a regular file for the scope, where nothing
+// can be created (chmod does not stop root).
+class UnusableDataDir {
+public:
+	explicit UnusableDataDir(const TempDataDir& dir) : m_restore(dir.path())
+	{
+		std::ofstream(dir.file("plain-file")) << "x";
+		setenv("CONTACTS_DATA_DIR", dir.file("plain-file/data").c_str(), 1);
+	}
+	~UnusableDataDir() { setenv("CONTACTS_DATA_DIR", m_restore.c_str(), 1); }
+
+private:
+	std::string m_restore;
+};
 
 // The contacts-ctl built next to the tests, or "" when unknown.
 inline std::string contactsCtlPath()

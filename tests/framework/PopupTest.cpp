@@ -34,7 +34,7 @@ using Harness = ViewTest;
 
 } // namespace
 
-TEST_F(Popup, ButtonsAppearInCallOrderAndCloseThePopup)
+TEST_F(Popup, ButtonsAppearInCallOrderAndCloseThePopupAsTheBackKeyDoesBeforeTheView)
 {
 	auto* view = pushView("v");
 	std::vector<std::string> clicks;
@@ -43,7 +43,6 @@ TEST_F(Popup, ButtonsAppearInCallOrderAndCloseThePopup)
 	screen.pumpUntilIdle();
 	auto alive = popup->getWeakPtr();
 	EXPECT_EQ(view->getPopup(), popup);
-
 	Evas_Object* obj = popup->getEvasObj();
 	EXPECT_EQ(ScreenHarness::buttonLabel(elm_object_part_content_get(obj, "button1")), "Cancel");
 	EXPECT_EQ(ScreenHarness::buttonLabel(elm_object_part_content_get(obj, "button2")), "OK");
@@ -57,22 +56,16 @@ TEST_F(Popup, ButtonsAppearInCallOrderAndCloseThePopup)
 	EXPECT_EQ(clicks, (std::vector<std::string> { "OK", "Cancel" }));
 	EXPECT_EQ(view->getPopup(), nullptr);
 	EXPECT_EQ(screen.findButton("OK"), nullptr);
-}
 
-TEST_F(Popup, BackKeyClosesThePopupBeforeTheView)
-{
-	auto* view = pushView("v");
-	std::vector<std::string> clicks;
-	WPopup* popup = makeTwoButtonPopup(clicks);
+	popup = makeTwoButtonPopup(clicks);
 	int backs = 0;
 	popup->setOnBack([&backs](bool*) { ++backs; });
 	view->attachPopup(popup);
-	auto alivePopup = popup->getWeakPtr();
+	alive = popup->getWeakPtr();
 	auto aliveView = view->getWeakPtr();
-
 	screen.sendBackKey();
 	EXPECT_EQ(backs, 1);
-	EXPECT_TRUE(alivePopup.expired());
+	EXPECT_TRUE(alive.expired());
 	EXPECT_FALSE(aliveView.expired());
 	screen.sendBackKey();
 	EXPECT_TRUE(aliveView.expired());

@@ -96,16 +96,13 @@ protected:
 		pack(box, entry, 0.0);
 		Evas_Object* row = elm_box_add(box);
 		elm_box_horizontal_set(row, EINA_TRUE);
-		Evas_Object* button = elm_button_add(row);
-		elm_object_text_set(button, "Button");
-		pack(row, button, 0.0);
-		Evas_Object* check = elm_check_add(row);
-		elm_object_text_set(check, "Check");
-		elm_check_state_set(check, EINA_TRUE);
-		pack(row, check, 0.0);
-		Evas_Object* radio = elm_radio_add(row);
-		elm_object_text_set(radio, "Radio");
-		pack(row, radio, 0.0);
+		for (auto add : {elm_button_add, elm_check_add, elm_radio_add}) {
+			Evas_Object* widget = add(row);
+			elm_object_text_set(widget, "Choice");
+			if (add == elm_check_add)
+				elm_check_state_set(widget, EINA_TRUE);
+			pack(row, widget, 0.0);
+		}
 		pack(box, row, 0.0);
 		pack(box, __createGenlist(box), EVAS_HINT_EXPAND);
 		return box;

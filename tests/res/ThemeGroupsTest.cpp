@@ -23,7 +23,7 @@ using namespace ct::test::res;
 namespace {
 
 struct AskedNames {
-	std::set<std::string> styles, layouts, images, parts;
+	std::set<std::string> styles, layouts, images, parts, files;
 };
 
 void collect(const std::string& text, const std::regex& pattern, std::set<std::string>& into)
@@ -36,23 +36,28 @@ void collect(const std::string& text, const std::regex& pattern, std::set<std::s
 	}
 }
 
-// The names the detail screens (src/) and the shared widgets (common/) ask for.
+// The names the detail screens (src/), the shared widgets (common/) and the
+// host application ask for.
 AskedNames scanSources()
 {
 	static const std::regex style(R"(getItemStyle\(\) override \{ return ([^;]+);)");
 	static const std::regex layout(R"((?:createIconLayout|ctCommonCreateLayout)\([^;{\n]*?("[^"]+")\))");
 	static const std::regex image(R"(("[A-Za-z0-9_]+\.png"))");
+	static const std::regex file(R"re("contacts/([a-z_]+\.edj)")re");
 	static const std::regex part(R"(("(?:elm|touch|copy|main|sub|image|favor)\.[a-z0-9._]+"))");
 	AskedNames names;
-	for (const char* dir : {"src", "common"}) {
+	for (const char* dir : {"src", "common", "host"}) {
 		for (const auto& entry : std::filesystem::directory_iterator(sourceRoot() + "/" + dir)) {
-			std::stringstream text;
-			text << std::ifstream(entry.path()).rdbuf();
-			collect(text.str(), style, names.styles);
-			collect(text.str(), layout, names.layouts);
-			collect(text.str(), image, names.images);
+			std::stringstream read;
+			read << std::ifstream(entry.path()).rdbuf();
+			const std::string text = read.str();
+			collect(text, style, names.styles);
+			collect(text, layout, names.layouts);
+			collect(text, image, names.images);
+			for (std::sregex_iterator it(text.begin(), text.end(), file), end; it != end; ++it)
+				names.files.insert((*it)[1]);
 			if (std::string(dir) == "src")
-				collect(text.str(), part, names.parts);
+				collect(text, part, names.parts);
 		}
 	}
 	return names;
@@ -100,7 +105,13 @@ TEST(ThemeGroups, EveryStyleGroupImageAndPartTheCodeNamesExists)
 	ASSERT_GE(asked.styles.size(), 8u) << "the scan no longer finds the item styles";
 	ASSERT_GE(asked.layouts.size(), 5u);
 	ASSERT_GE(asked.parts.size(), 10u);
+	ASSERT_GE(asked.files.size(), 3u);
 
+	for (const std::string& file : asked.files) {
+		Eina_List* groups = edje_file_collection_list(edjePath(file).c_str());
+		EXPECT_NE(groups, nullptr) << file << " is missing or empty";
+		edje_file_collection_list_free(groups);
+	}
 	EdjeCanvas canvas;
 	std::vector<Evas_Object*> loaded;
 	for (const std::string& style : asked.styles) {

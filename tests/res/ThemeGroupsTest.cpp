@@ -9,11 +9,12 @@
 #include <Edje.h>
 #include <Elementary.h>
 #include "EflEnvironment.h"
+#include <glib.h>
 #include <gtest/gtest.h>
 
 #include <filesystem>
 #include <fstream>
-#include <regex>
+#include <vector>
 #include <set>
 #include <sstream>
 #include <string>
@@ -26,13 +27,29 @@ struct AskedNames {
 	std::set<std::string> styles, layouts, images, parts, files;
 };
 
-void collect(const std::string& text, const std::regex& pattern, std::set<std::string>& into)
+// Capture 1 of every match of the pattern in the text.
+std::vector<std::string> captures(const std::string& text, const char* pattern)
 {
-	static const std::regex literal("\"([^\"]+)\"");
-	for (std::sregex_iterator it(text.begin(), text.end(), pattern), end; it != end; ++it) {
-		const std::string found = (*it)[1];
-		for (std::sregex_iterator s(found.begin(), found.end(), literal); s != end; ++s)
-			into.insert((*s)[1]);
+	std::vector<std::string> out;
+	GRegex* regex = g_regex_new(pattern, G_REGEX_RAW, GRegexMatchFlags(0), nullptr);
+	GMatchInfo* info = nullptr;
+	g_regex_match(regex, text.c_str(), GRegexMatchFlags(0), &info);
+	for (; g_match_info_matches(info); g_match_info_next(info, nullptr)) {
+		gchar* found = g_match_info_fetch(info, 1);
+		out.emplace_back(found ? found : "");
+		g_free(found);
+	}
+	g_match_info_free(info);
+	g_regex_unref(regex);
+	return out;
+}
+
+// The "quoted" literals inside each capture of the pattern.
+void collect(const std::string& text, const char* pattern, std::set<std::string>& into)
+{
+	for (const std::string& found : captures(text, pattern)) {
+		for (const std::string& literal : captures(found, "\"([^\"]+)\""))
+			into.insert(literal);
 	}
 }
 
@@ -40,11 +57,10 @@ void collect(const std::string& text, const std::regex& pattern, std::set<std::s
 // host application ask for.
 AskedNames scanSources()
 {
-	static const std::regex style(R"(getItemStyle\(\) override \{ return ([^;]+);)");
-	static const std::regex layout(R"((?:createIconLayout|ctCommonCreateLayout)\([^;{\n]*?("[^"]+")\))");
-	static const std::regex image(R"(("[A-Za-z0-9_]+\.png"))");
-	static const std::regex file(R"re("contacts/([a-z_]+\.edj)")re");
-	static const std::regex part(R"(("(?:elm|touch|copy|main|sub|image|favor)\.[a-z0-9._]+"))");
+	const char* style = R"(getItemStyle\(\) override \{ return ([^;]+);)";
+	const char* layout = R"((?:createIconLayout|ctCommonCreateLayout)\([^;{\n]*?("[^"]+")\))";
+	const char* image = R"(("[A-Za-z0-9_]+\.png"))";
+	const char* part = R"(("(?:elm|touch|copy|main|sub|image|favor)\.[a-z0-9._]+"))";
 	AskedNames names;
 	for (const char* dir : {"src", "common", "host"}) {
 		for (const auto& entry : std::filesystem::directory_iterator(sourceRoot() + "/" + dir)) {
@@ -54,8 +70,8 @@ AskedNames scanSources()
 			collect(text, style, names.styles);
 			collect(text, layout, names.layouts);
 			collect(text, image, names.images);
-			for (std::sregex_iterator it(text.begin(), text.end(), file), end; it != end; ++it)
-				names.files.insert((*it)[1]);
+			for (const std::string& file : captures(text, R"re("contacts/([a-z_]+\.edj)")re"))
+				names.files.insert(file);
 			if (std::string(dir) == "src")
 				collect(text, part, names.parts);
 		}

@@ -9,6 +9,8 @@
 
 #include <gtest/gtest.h>
 
+#include <functional>
+
 using namespace ct::test;
 using app_assist::WMenuPopup;
 using app_assist::WPopup;
@@ -139,20 +141,17 @@ TEST_F(MenuPopup, MoreKeyOpensTheMenuWithItemsInAppendOrder)
 	auto* view = new RecordingView(log, "v");
 	std::vector<std::string> chosen;
 	std::weak_ptr<app_assist::WControl> menuAlive;
-	struct MoreContext {
-		RecordingView* view;
-		std::vector<std::string>* chosen;
-		std::weak_ptr<app_assist::WControl>* menuAlive;
-	} context { view, &chosen, &menuAlive };
+	std::function<void()> openMenu = [&] {
+		auto* menu = new WMenuPopup(view->getWindow(), view->getNaviframe());
+		for (const char* label : { "Edit", "Delete", "Share" })
+			menu->appendItem(label, [&chosen, label] { chosen.push_back(label); });
+		view->attachPopup(menu);
+		menuAlive = menu->getWeakPtr();
+	};
 	view->onPushedAction = [&](Elm_Object_Item* item) {
 		view->enableMoreButton(item, [](void* data, Evas_Object*, void*) {
-			auto* ctx = static_cast<MoreContext*>(data);
-			auto* menu = new WMenuPopup(ctx->view->getWindow(), ctx->view->getNaviframe());
-			for (const char* label : { "Edit", "Delete", "Share" })
-				menu->appendItem(label, [ctx, label] { ctx->chosen->push_back(label); });
-			ctx->view->attachPopup(menu);
-			*ctx->menuAlive = menu->getWeakPtr();
-		}, &context);
+			(*static_cast<std::function<void()>*>(data))();
+		}, &openMenu);
 	};
 	screen.push(view);
 	EXPECT_FALSE(view->enableMoreButton(nullptr, nullptr, nullptr));

@@ -9,6 +9,8 @@
 
 #include <gtest/gtest.h>
 
+#include <functional>
+
 using namespace ct::test;
 using app_assist::WMenuPopup;
 using app_assist::WPopup;
@@ -27,21 +29,22 @@ WPopup* makeTwoButtonPopup(std::vector<std::string>& clicks, bool keepOnOk = fal
 	return popup;
 }
 
+using Popup = ViewTest;
+using MenuPopup = ViewTest;
+using ToastPopup = ViewTest;
+using Harness = ViewTest;
+
 } // namespace
 
-TEST(Popup, ButtonsAppearInCallOrderAndCloseThePopup)
+TEST_F(Popup, ButtonsAppearInCallOrderAndCloseThePopupAsTheBackKeyDoesBeforeTheView)
 {
-	EventLog log;
-	ScreenHarness screen;
-	auto* view = new RecordingView(log, "v");
-	screen.push(view);
+	auto* view = pushView("v");
 	std::vector<std::string> clicks;
 	WPopup* popup = makeTwoButtonPopup(clicks, true);
 	view->attachPopup(popup);
 	screen.pumpUntilIdle();
 	auto alive = popup->getWeakPtr();
 	EXPECT_EQ(view->getPopup(), popup);
-
 	Evas_Object* obj = popup->getEvasObj();
 	EXPECT_EQ(ScreenHarness::buttonLabel(elm_object_part_content_get(obj, "button1")), "Cancel");
 	EXPECT_EQ(ScreenHarness::buttonLabel(elm_object_part_content_get(obj, "button2")), "OK");
@@ -55,34 +58,23 @@ TEST(Popup, ButtonsAppearInCallOrderAndCloseThePopup)
 	EXPECT_EQ(clicks, (std::vector<std::string> { "OK", "Cancel" }));
 	EXPECT_EQ(view->getPopup(), nullptr);
 	EXPECT_EQ(screen.findButton("OK"), nullptr);
-}
 
-TEST(Popup, BackKeyClosesThePopupBeforeTheView)
-{
-	EventLog log;
-	ScreenHarness screen;
-	auto* view = new RecordingView(log, "v");
-	screen.push(view);
-	std::vector<std::string> clicks;
-	WPopup* popup = makeTwoButtonPopup(clicks);
+	popup = makeTwoButtonPopup(clicks);
 	int backs = 0;
 	popup->setOnBack([&backs](bool*) { ++backs; });
 	view->attachPopup(popup);
-	auto alivePopup = popup->getWeakPtr();
+	alive = popup->getWeakPtr();
 	auto aliveView = view->getWeakPtr();
-
 	screen.sendBackKey();
 	EXPECT_EQ(backs, 1);
-	EXPECT_TRUE(alivePopup.expired());
+	EXPECT_TRUE(alive.expired());
 	EXPECT_FALSE(aliveView.expired());
 	screen.sendBackKey();
 	EXPECT_TRUE(aliveView.expired());
 }
 
-TEST(Popup, ButtonThatDestroysItsOwnViewDoesNotCrash)
+TEST_F(Popup, ButtonThatDestroysItsOwnViewDoesNotCrash)
 {
-	EventLog log;
-	ScreenHarness screen;
 	auto* below = new RecordingView(log, "below");
 	auto* view = new RecordingView(log, "v");
 	screen.push(below);
@@ -111,12 +103,9 @@ TEST(Popup, ButtonThatDestroysItsOwnViewDoesNotCrash)
 	EXPECT_TRUE(aliveBelow.expired());
 }
 
-TEST(Popup, AttachingANewPopupClosesTheOldOneAndViewsCloseTheirPopups)
+TEST_F(Popup, AttachingANewPopupClosesTheOldOneAndViewsCloseTheirPopups)
 {
-	EventLog log;
-	ScreenHarness screen;
-	auto* view = new RecordingView(log, "v");
-	screen.push(view);
+	auto* view = pushView("v");
 	std::vector<std::string> clicks;
 	WPopup* first = makeTwoButtonPopup(clicks);
 	view->attachPopup(first);
@@ -147,27 +136,22 @@ TEST(Popup, AttachingANewPopupClosesTheOldOneAndViewsCloseTheirPopups)
 	crowded->destroy();
 }
 
-TEST(MenuPopup, MoreKeyOpensTheMenuWithItemsInAppendOrder)
+TEST_F(MenuPopup, MoreKeyOpensTheMenuWithItemsInAppendOrder)
 {
-	EventLog log;
-	ScreenHarness screen;
 	auto* view = new RecordingView(log, "v");
 	std::vector<std::string> chosen;
 	std::weak_ptr<app_assist::WControl> menuAlive;
-	struct MoreContext {
-		RecordingView* view;
-		std::vector<std::string>* chosen;
-		std::weak_ptr<app_assist::WControl>* menuAlive;
-	} context { view, &chosen, &menuAlive };
+	std::function<void()> openMenu = [&] {
+		auto* menu = new WMenuPopup(view->getWindow(), view->getNaviframe());
+		for (const char* label : { "Edit", "Delete", "Share" })
+			menu->appendItem(label, [&chosen, label] { chosen.push_back(label); });
+		view->attachPopup(menu);
+		menuAlive = menu->getWeakPtr();
+	};
 	view->onPushedAction = [&](Elm_Object_Item* item) {
 		view->enableMoreButton(item, [](void* data, Evas_Object*, void*) {
-			auto* ctx = static_cast<MoreContext*>(data);
-			auto* menu = new WMenuPopup(ctx->view->getWindow(), ctx->view->getNaviframe());
-			for (const char* label : { "Edit", "Delete", "Share" })
-				menu->appendItem(label, [ctx, label] { ctx->chosen->push_back(label); });
-			ctx->view->attachPopup(menu);
-			*ctx->menuAlive = menu->getWeakPtr();
-		}, &context);
+			(*static_cast<std::function<void()>*>(data))();
+		}, &openMenu);
 	};
 	screen.push(view);
 	EXPECT_FALSE(view->enableMoreButton(nullptr, nullptr, nullptr));
@@ -193,9 +177,8 @@ TEST(MenuPopup, MoreKeyOpensTheMenuWithItemsInAppendOrder)
 	EXPECT_EQ(screen.viewCount(), 1);
 }
 
-TEST(ToastPopup, ClosesItselfAfterItsTimeout)
+TEST_F(ToastPopup, ClosesItselfAfterItsTimeout)
 {
-	ScreenHarness screen;
 	auto* toast = new WToastPopup("Saved", 0.2);
 	ASSERT_TRUE(toast->create(screen.win(), nullptr));
 	auto alive = toast->getWeakPtr();
@@ -203,15 +186,11 @@ TEST(ToastPopup, ClosesItselfAfterItsTimeout)
 	EXPECT_TRUE(screen.pumpUntil([&] { return alive.expired(); }));
 }
 
-TEST(Harness, ReadsPostedNoticesAndLogLines)
+TEST_F(Harness, ReadsPostedNotices)
 {
-	ScreenHarness screen;
 	ScreenHarness::clearNotices();
 	EXPECT_EQ(notification_status_message_post("Saved"), 0);
 	EXPECT_EQ(ScreenHarness::notices(), (std::vector<std::string> { "Saved" }));
 	ScreenHarness::clearNotices();
 	EXPECT_TRUE(ScreenHarness::notices().empty());
-	ct::log::clear();
-	EXPECT_FALSE(screen.naviframe()->pop());
-	EXPECT_TRUE(ScreenHarness::logContains("naviframe is empty"));
 }

@@ -1,8 +1,11 @@
 // Small views and rows that record what the framework does to them.
 #pragma once
 
+#include "ScreenHarness.h"
 #include "WGenlistItem.h"
 #include "WView.h"
+
+#include <gtest/gtest.h>
 
 #include <cstring>
 #include <functional>
@@ -61,17 +64,27 @@ private:
 	std::string m_tag;
 };
 
+// Counts the live objects that hold one.
+class LiveCount {
+public:
+	explicit LiveCount(int* live) : m_live(live) { ++*m_live; }
+	~LiveCount() { --*m_live; }
+	LiveCount(const LiveCount&) = delete;
+	LiveCount& operator=(const LiveCount&) = delete;
+
+private:
+	int* m_live;
+};
+
 // A one-line row that counts live rows and selections.
 class CountingRow : public app_assist::WGenlistItem {
 public:
 	explicit CountingRow(int index, int* liveRows, int* selections = nullptr)
 		: m_index(index)
-		, m_liveRows(liveRows)
+		, m_live(liveRows)
 		, m_selections(selections)
 	{
-		++*m_liveRows;
 	}
-	~CountingRow() override { --*m_liveRows; }
 
 	Elm_Genlist_Item_Class* getItemClassStatic() override
 	{
@@ -102,7 +115,7 @@ private:
 	}
 
 	int m_index;
-	int* m_liveRows;
+	LiveCount m_live;
 	int* m_selections;
 };
 
@@ -135,6 +148,20 @@ protected:
 private:
 	int m_rows;
 	int* m_liveRows;
+};
+
+// A screen per test, with a helper to push a recording view onto it.
+class ViewTest : public ::testing::Test {
+protected:
+	RecordingView* pushView(const char* tag = "v")
+	{
+		auto* view = new RecordingView(log, tag);
+		screen.push(view);
+		return view;
+	}
+
+	EventLog log; // outlives the screen, which records the views' ends
+	ScreenHarness screen;
 };
 
 } // namespace ct::test

@@ -2,7 +2,6 @@
 #include "TestViews.h"
 
 #include "LogSink.h"
-#include "WSignalIdGenerator.h"
 #include "WUiTimer.h"
 
 #include <gtest/gtest.h>
@@ -24,14 +23,13 @@ bool countCb(void* data)
 	return ++counter->fired < counter->repeatUntil;
 }
 
+using UiTimer = ViewTest;
+
 } // namespace
 
-TEST(UiTimer, CallbacksRepeatWhileTheyReturnTrueThenTheHandleExpires)
+TEST_F(UiTimer, CallbacksRepeatWhileTheyReturnTrueThenTheHandleExpires)
 {
-	EventLog log;
-	ScreenHarness screen;
-	auto* view = new RecordingView(log, "v");
-	screen.push(view);
+	auto* view = pushView("v");
 	Counter idler, timer, animator;
 	idler.repeatUntil = 3;
 	animator.repeatUntil = 4;
@@ -51,12 +49,9 @@ TEST(UiTimer, CallbacksRepeatWhileTheyReturnTrueThenTheHandleExpires)
 	EXPECT_TRUE(animatorHandle.expired());
 }
 
-TEST(UiTimer, DestroyCancelsAndTimersDieWithTheirOwner)
+TEST_F(UiTimer, DestroyCancelsAndTimersDieWithTheirOwner)
 {
-	EventLog log;
-	ScreenHarness screen;
-	auto* view = new RecordingView(log, "v");
-	screen.push(view);
+	auto* view = pushView("v");
 	Counter cancelled, orphaned, byObject;
 	WUiTimerHandle handle = WUiTimer::addTimer(0.05, countCb, &cancelled, view);
 	WUiTimer::destroy(handle);
@@ -74,12 +69,9 @@ TEST(UiTimer, DestroyCancelsAndTimersDieWithTheirOwner)
 	EXPECT_EQ(byObject.fired, 0);
 }
 
-TEST(UiTimer, CallbackMayDestroyItsOwnerOrItself)
+TEST_F(UiTimer, CallbackMayDestroyItsOwnerOrItself)
 {
-	EventLog log;
-	ScreenHarness screen;
-	auto* view = new RecordingView(log, "v");
-	screen.push(view);
+	auto* view = pushView("v");
 	auto alive = view->getWeakPtr();
 	int fired = 0;
 	WUiTimer::addTimer(0.01, [&](void*) {
@@ -103,7 +95,7 @@ TEST(UiTimer, CallbackMayDestroyItsOwnerOrItself)
 	evas_object_del(holder);
 }
 
-TEST(UiTimer, NullCallbackOrOwnerIsRefused)
+TEST_F(UiTimer, NullCallbackOrOwnerIsRefused)
 {
 	ct::log::clear();
 	Counter counter;
@@ -111,12 +103,4 @@ TEST(UiTimer, NullCallbackOrOwnerIsRefused)
 	EXPECT_TRUE(ct::log::contains("owner is null"));
 	EXPECT_TRUE(WUiTimer::addIdler(nullptr, nullptr, static_cast<Evas_Object*>(nullptr)).expired());
 	EXPECT_TRUE(ct::log::contains("callback is null"));
-}
-
-TEST(SignalIdGenerator, IdsAreUniqueAndNeverZero)
-{
-	unsigned int first = app_assist::WSignalIdGenerator::generate();
-	unsigned int second = app_assist::WSignalIdGenerator::generate();
-	EXPECT_NE(first, 0u);
-	EXPECT_NE(first, second);
 }

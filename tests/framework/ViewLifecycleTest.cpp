@@ -9,8 +9,9 @@
 
 using namespace ct::test;
 using app_assist::WView;
+using ViewLifecycle = ViewTest;
 
-TEST(ViewLifecycle, PushThenBackRunsEveryStepInOrder)
+TEST(ViewTeardown, PushThenBackRunsEveryStepInOrderAndClosingTheScreenEndsTheRest)
 {
 	EventLog log;
 	{
@@ -29,15 +30,18 @@ TEST(ViewLifecycle, PushThenBackRunsEveryStepInOrder)
 
 		screen.sendBackKey();
 		EXPECT_EQ(screen.viewCount(), 0);
+		screen.push(new RecordingView(log, "b"));
+		screen.push(new RecordingView(log, "c"));
 	}
+	// Closing the screen destroys the views still pushed, top first.
 	EXPECT_EQ(log, (EventLog { "a:constructor", "a:onCreate", "a:onCreated", "a:onPushed", "a:onPop",
-		"a:onDestroy", "a:destructor" }));
+		"a:onDestroy", "a:destructor", "b:constructor", "b:onCreate", "b:onCreated", "b:onPushed",
+		"c:constructor", "c:onCreate", "c:onCreated", "c:onPushed", "c:onDestroy", "c:destructor",
+		"b:onDestroy", "b:destructor" }));
 }
 
-TEST(ViewLifecycle, RefusedPopKeepsTheViewUntilAllowed)
+TEST_F(ViewLifecycle, RefusedPopKeepsTheViewUntilAllowed)
 {
-	EventLog log;
-	ScreenHarness screen;
 	auto* view = new RecordingView(log, "a");
 	view->allowPop = false;
 	ASSERT_TRUE(screen.push(view));
@@ -57,10 +61,8 @@ TEST(ViewLifecycle, RefusedPopKeepsTheViewUntilAllowed)
 	EXPECT_EQ(std::count(log.begin(), log.end(), "a:onPop"), 3);
 }
 
-TEST(ViewLifecycle, NestedPushesPopTopFirstAndTitleBackButtonPops)
+TEST_F(ViewLifecycle, NestedPushesPopTopFirstAndTitleBackButtonPops)
 {
-	EventLog log;
-	ScreenHarness screen;
 	auto* a = new RecordingView(log, "a");
 	auto* b = new RecordingView(log, "b");
 	auto* c = new RecordingView(log, "c");
@@ -85,23 +87,8 @@ TEST(ViewLifecycle, NestedPushesPopTopFirstAndTitleBackButtonPops)
 	EXPECT_LT(std::find(log.begin(), log.end(), "c:destructor"), std::find(log.begin(), log.end(), "b:destructor"));
 }
 
-TEST(ViewLifecycle, ClosingTheHarnessDestroysEveryPushedView)
+TEST_F(ViewLifecycle, ViewsDestroyedInOnPopOrTwiceEndOnce)
 {
-	EventLog log;
-	{
-		ScreenHarness screen;
-		screen.push(new RecordingView(log, "a"));
-		screen.push(new RecordingView(log, "b"));
-	}
-	EXPECT_EQ(std::count(log.begin(), log.end(), "a:destructor"), 1);
-	EXPECT_EQ(std::count(log.begin(), log.end(), "b:destructor"), 1);
-	EXPECT_LT(std::find(log.begin(), log.end(), "b:onDestroy"), std::find(log.begin(), log.end(), "a:onDestroy"));
-}
-
-TEST(ViewLifecycle, ViewsDestroyedInOnPopOrTwiceEndOnce)
-{
-	EventLog log;
-	ScreenHarness screen;
 	auto* a = new RecordingView(log, "a");
 	auto* b = new RecordingView(log, "b");
 	screen.push(a);
@@ -121,10 +108,8 @@ TEST(ViewLifecycle, ViewsDestroyedInOnPopOrTwiceEndOnce)
 	EXPECT_EQ(std::count(log.begin(), log.end(), "a:onDestroy"), 1);
 }
 
-TEST(ViewLifecycle, BadInputIsRefusedAndLogged)
+TEST_F(ViewLifecycle, BadInputIsRefusedAndLogged)
 {
-	EventLog log;
-	ScreenHarness screen;
 	ct::log::clear();
 	EXPECT_FALSE(screen.naviframe()->push(nullptr));
 	EXPECT_TRUE(ct::log::contains("Invalid param : view"));
@@ -150,10 +135,8 @@ TEST(ViewLifecycle, BadInputIsRefusedAndLogged)
 	EXPECT_EQ(WView_getWindowEvasObj(nullptr), nullptr);
 }
 
-TEST(ViewLifecycle, LastViewBackHandlerDecides)
+TEST_F(ViewLifecycle, LastViewBackHandlerDecides)
 {
-	EventLog log;
-	ScreenHarness screen;
 	int asked = 0;
 	bool letGo = false;
 	screen.naviframe()->setOnLastViewBack([&](bool* popOut) {

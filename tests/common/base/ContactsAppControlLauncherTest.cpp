@@ -1,19 +1,13 @@
 #include "AppControlRouter.h"
 #include "ContactsAppControlLauncher.h"
+#include "../CommonTestSupport.h"
 
 #include <Elementary.h>
 #include <gtest/gtest.h>
 
-namespace {
+using ct::test::pumpUntil;
 
-template <typename Pred>
-bool pumpUntil(Pred done, double seconds)
-{
-	double end = ecore_time_get() + seconds;
-	while (!done() && ecore_time_get() < end)
-		ecore_main_loop_iterate();
-	return done();
-}
+namespace {
 
 struct Received {
 	int replies = 0;
@@ -35,20 +29,7 @@ app_control_h makeRequest(const char* appId)
 	return request;
 }
 
-class ContactsAppControlLauncherTest : public ::testing::Test {
-protected:
-	void SetUp() override
-	{
-		elm_init(0, nullptr);
-		m_window = elm_win_add(nullptr, "launcher", ELM_WIN_BASIC);
-	}
-	void TearDown() override
-	{
-		evas_object_del(m_window);
-		elm_shutdown();
-	}
-	Evas_Object* m_window = nullptr;
-};
+using ContactsAppControlLauncherTest = ct::test::WindowTest;
 
 } // namespace
 
@@ -102,7 +83,7 @@ TEST_F(ContactsAppControlLauncherTest, ReplyIsDroppedWhenTheOwnerObjectDies)
 	ASSERT_TRUE(ContactsAppControlLauncher::getInstance()->sendAsyncLaunchRequest(request, onReply, &received, owner));
 	evas_object_del(owner);
 	later(nullptr, APP_CONTROL_RESULT_SUCCEEDED);
-	pumpUntil([] { return false; }, 0.2);
+	ct::test::settle(0.2);
 	EXPECT_EQ(0, received.replies);
 	app_control_destroy(request);
 }

@@ -1,5 +1,5 @@
 #include "ContactsCommon.h"
-#include "TempDataDir.h"
+#include "../CommonTestSupport.h"
 
 #include <vconf.h>
 
@@ -46,8 +46,7 @@ TEST(ContactsCommon, RegionComesFromTheRegionFormatThenTheCountry)
 TEST(ContactsCommon, ResourcePathsResolveNamesUnderTheResourceFolder)
 {
 	ct::test::TempDataDir dir;
-	std::string previous = ContactsCommon::getResourceDir();
-	setenv("CONTACTS_RES_DIR", dir.path().c_str(), 1);
+	ct::test::EnvScope resources("CONTACTS_RES_DIR", dir.path().c_str());
 	mkdir((dir.path() + "/edje").c_str(), 0700);
 	std::ofstream(dir.path() + "/edje/detail_layout.edj") << "x";
 
@@ -60,5 +59,4 @@ TEST(ContactsCommon, ResourcePathsResolveNamesUnderTheResourceFolder)
 	EXPECT_FALSE(ContactsCommon::getAppEdjePath(nullptr, path));
 	EXPECT_EQ("", ContactsCommon::getAppImagePath("nothing.png"));
 	EXPECT_EQ(dir.path() + "/images/nothing.png", ContactsCommon::getAppImagePath("nothing.png", false));
-	setenv("CONTACTS_RES_DIR", previous.c_str(), 1);
 }

@@ -3,7 +3,7 @@
 #include "CtContactsAgentUtil.h"
 #include "CtEsuAgentMgr.h"
 #include "CtRegistryMgr.h"
-#include "TempDataDir.h"
+#include "../CommonTestSupport.h"
 
 #include <app_preference.h>
 
@@ -13,22 +13,13 @@
 #include <cstdlib>
 #include <vector>
 
+using namespace ct::test;
+
 namespace {
 
-template <typename Pred>
-bool pumpUntil(Pred done, double seconds)
-{
-	double end = ecore_time_get() + seconds;
-	while (!done() && ecore_time_get() < end)
-		ecore_main_loop_iterate();
-	return done();
-}
-
-class CtProfileAgentTest : public ::testing::Test {
+class CtProfileAgentTest : public ct::test::LoopTest {
 protected:
-	void SetUp() override { ecore_init(); }
-	void TearDown() override { ecore_shutdown(); }
-	ct::test::TempDataDir m_dir;
+	TempDataDir m_dir;
 };
 
 void countSync(int result, void* data)
@@ -116,7 +107,7 @@ TEST_F(CtProfileAgentTest, SyncsAreRecordedAndCallBackUnlessCancelled)
 	agent->cancelCallbacks(&cancelled);
 	EXPECT_EQ(0, done);
 	EXPECT_TRUE(pumpUntil([&] { return done > 0; }, 1.0));
-	pumpUntil([] { return false; }, 0.1);
+	ct::test::settle(0.1);
 	EXPECT_EQ(0, cancelled);
 
 	const auto& requests = agent->getSyncRequests();

@@ -1,5 +1,6 @@
 #include "CtRegistryMgr.h"
 #include "LogSink.h"
+#include "../CommonTestSupport.h"
 
 #include <Ecore.h>
 #include <gtest/gtest.h>
@@ -7,16 +8,9 @@
 #include <string>
 #include <vector>
 
-namespace {
+using ct::test::pumpUntil;
 
-template <typename Pred>
-bool pumpUntil(Pred done, double seconds)
-{
-	double end = ecore_time_get() + seconds;
-	while (!done() && ecore_time_get() < end)
-		ecore_main_loop_iterate();
-	return done();
-}
+namespace {
 
 struct Seen {
 	std::vector<std::string> keys;
@@ -30,11 +24,7 @@ void onChanged(keynode_t* node, void* data)
 	seen->intValue = vconf_keynode_get_int(node);
 }
 
-class CtRegistryMgrTest : public ::testing::Test {
-protected:
-	void SetUp() override { ecore_init(); }
-	void TearDown() override { ecore_shutdown(); }
-};
+using CtRegistryMgrTest = ct::test::LoopTest;
 
 } // namespace
 

@@ -1,5 +1,6 @@
 #include "CtSimMgr.h"
 #include "CtThread.h"
+#include "../CommonTestSupport.h"
 
 #include <Ecore.h>
 #include <gtest/gtest.h>
@@ -8,27 +9,16 @@
 #include <memory>
 #include <unistd.h>
 
-namespace {
+using ct::test::pumpUntil;
 
-template <typename Pred>
-bool pumpUntil(Pred done, double seconds)
-{
-	double end = ecore_time_get() + seconds;
-	while (!done() && ecore_time_get() < end)
-		ecore_main_loop_iterate();
-	return done();
-}
+namespace {
 
 struct CountingListener : CtSimListener {
 	void onSimChanged() override { ++changes; }
 	int changes = 0;
 };
 
-class CtSimMgrTest : public ::testing::Test {
-protected:
-	void SetUp() override { ecore_init(); }
-	void TearDown() override { ecore_shutdown(); }
-};
+using CtSimMgrTest = ct::test::LoopTest;
 
 } // namespace
 
@@ -52,7 +42,7 @@ TEST_F(CtSimMgrTest, FollowsTheSimPowerSettings)
 	sims->detach(&listener);
 	int before = listener.changes;
 	ASSERT_EQ(0, vconf_set_int(VCONFKEY_TELEPHONY_SIM_POWER_STATE1, 0));
-	pumpUntil([] { return false; }, 0.3);
+	ct::test::settle(0.3);
 	EXPECT_EQ(before, listener.changes);
 	EXPECT_EQ(0, sims->getInsertedSimCount());
 	EXPECT_EQ(-1, sims->getAvailableSimForIcon());
@@ -84,7 +74,7 @@ TEST_F(CtSimMgrTest, ThreadDeletedBeforeItsEndNeverCallsBack)
 	ASSERT_TRUE(thread->start());
 	thread.reset();
 	release = true;
-	pumpUntil([] { return false; }, 0.3);
+	ct::test::settle(0.3);
 	EXPECT_FALSE(ended);
 
 	std::unique_ptr<CtThread> selfDeleting;

@@ -1,6 +1,6 @@
 #include "CtView.h"
 #include "LogSink.h"
-#include "TempDataDir.h"
+#include "../CommonTestSupport.h"
 
 #include <vconf.h>
 
@@ -9,16 +9,9 @@
 
 #include <memory>
 
-namespace {
+using ct::test::pumpUntil;
 
-template <typename Pred>
-bool pumpUntil(Pred done, double seconds)
-{
-	double end = ecore_time_get() + seconds;
-	while (!done() && ecore_time_get() < end)
-		ecore_main_loop_iterate();
-	return done();
-}
+namespace {
 
 class CountingView : public CtView {
 public:
@@ -36,20 +29,7 @@ private:
 	std::unique_ptr<CountingView>* m_closeOnChange;
 };
 
-class CtViewTest : public ::testing::Test {
-protected:
-	void SetUp() override
-	{
-		elm_init(0, nullptr);
-		m_window = elm_win_add(nullptr, "ctview", ELM_WIN_BASIC);
-	}
-	void TearDown() override
-	{
-		evas_object_del(m_window);
-		elm_shutdown();
-	}
-	Evas_Object* m_window = nullptr;
-};
+using CtViewTest = ct::test::WindowTest;
 
 } // namespace
 
@@ -77,16 +57,11 @@ TEST_F(CtViewTest, LanguageChangeReachesEveryOpenScreen)
 TEST_F(CtViewTest, BaseLayoutFailsCleanlyWithoutItsResources)
 {
 	ct::test::TempDataDir dir;
-	const char* previous = getenv("CONTACTS_RES_DIR");
-	std::string saved = previous ? previous : "";
-	setenv("CONTACTS_RES_DIR", dir.path().c_str(), 1);
-
+	ct::test::EnvScope noResources("CONTACTS_RES_DIR", dir.path().c_str());
 	CountingView view;
 	ct::log::clear();
 	EXPECT_EQ(nullptr, view.createBaseLayout(m_window, nullptr, nullptr));
 	EXPECT_TRUE(ct::log::contains("* Critical * ctCommonCreateLayout() is fail"));
 	EXPECT_EQ(nullptr, view.createBaseLayout(nullptr, nullptr, nullptr));
 	EXPECT_EQ(nullptr, view.createBaseLayout(m_window, "contacts/detail_layout.edj", "no/such/group"));
-
-	setenv("CONTACTS_RES_DIR", saved.c_str(), 1);
 }

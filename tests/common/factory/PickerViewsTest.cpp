@@ -1,7 +1,7 @@
 // The list screens of CtDllViewFactory, pushed headless: what they list, how
 // the search entry filters, and what choosing a row does to the store, the
 // caller's request and the registry signal.
-#include "../../data/detail/DetailTestStore.h"
+#include "../CommonTestSupport.h"
 
 #include "AppControlRouter.h"
 #include "CtContactPickerView.h"
@@ -23,18 +23,8 @@ using namespace ct::test;
 
 namespace {
 
-std::string shotPath(const std::string& name)
-{
-	const char* bin = getenv("CONTACTS_TEST_BIN_DIR");
-	std::string dir = std::string(bin ? bin : "/tmp") + "/test-output/common";
-	std::filesystem::create_directories(dir);
-	return dir + "/" + name + ".png";
-}
-
-class PickerViewsTest : public ::testing::Test {
+class PickerViewsTest : public StoreTest {
 protected:
-	void SetUp() override { ASSERT_EQ(CONTACTS_ERROR_NONE, contacts_connect()); }
-	void TearDown() override { contacts_disconnect(); }
 
 	static std::vector<std::string> names(CtPersonPickerView* view)
 	{
@@ -58,6 +48,19 @@ protected:
 		ADD_FAILURE() << "no row " << name;
 	}
 
+	static CtPersonPickerView* relationshipPicker()
+	{
+		return static_cast<CtPersonPickerView*>(CtDllViewFactory::getInstance()->getCtListViewClassForRelationship());
+	}
+
+	// Types into the search entry, as markup, and lets the list follow.
+	static std::vector<std::string> search(ScreenHarness& screen, CtPersonPickerView* view, const char* text)
+	{
+		elm_entry_entry_set(view->getSearchEntry(), text);
+		screen.pumpUntilIdle();
+		return names(view);
+	}
+
 	static app_control_h linkRequest(int personId, int max)
 	{
 		app_control_h request = nullptr;
@@ -68,8 +71,6 @@ protected:
 		app_control_add_extra_data(request, "hide_create_button", "1");
 		return request;
 	}
-
-	TempDataDir m_dir;
 };
 
 } // namespace
@@ -84,25 +85,17 @@ TEST_F(PickerViewsTest, RelationshipPickerFiltersByNameAndRaisesTheChosenPerson)
 		[&](ctRegistryKey key, int value) { signals.emplace_back(key, value); });
 	{
 		ScreenHarness screen;
-		auto* view = static_cast<CtPersonPickerView*>(CtDllViewFactory::getInstance()->getCtListViewClassForRelationship());
+		auto* view = relationshipPicker();
 		ASSERT_TRUE(screen.push(view));
 		EXPECT_EQ(names(view), (std::vector<std::string>{"Anna", "Bert", "Åne"}));
 		EXPECT_EQ(ScreenHarness::naviText(view), "IDS_PB_OPT_RELATIONSHIP_ABB2");
 		EXPECT_TRUE(screen.savePng(shotPath("relationship-picker")));
 
-		// Typing goes through the entry, as markup; case does not matter.
-		elm_entry_entry_set(view->getSearchEntry(), "aN");
-		screen.pumpUntilIdle();
-		EXPECT_EQ(names(view), (std::vector<std::string>{"Anna"}));
-		elm_entry_entry_set(view->getSearchEntry(), "ÅN");
-		screen.pumpUntilIdle();
-		EXPECT_EQ(names(view), (std::vector<std::string>{"Åne"}));
-		elm_entry_entry_set(view->getSearchEntry(), "zz");
-		screen.pumpUntilIdle();
-		EXPECT_TRUE(names(view).empty());
-		elm_entry_entry_set(view->getSearchEntry(), "");
-		screen.pumpUntilIdle();
-		ASSERT_EQ(names(view).size(), 3u);
+		// Case does not matter.
+		EXPECT_EQ(search(screen, view, "aN"), (std::vector<std::string>{"Anna"}));
+		EXPECT_EQ(search(screen, view, "ÅN"), (std::vector<std::string>{"Åne"}));
+		EXPECT_TRUE(search(screen, view, "zz").empty());
+		ASSERT_EQ(search(screen, view, "").size(), 3u);
 
 		choose(screen, view, "Åne");
 		EXPECT_EQ(signals, (std::vector<std::pair<ctRegistryKey, int>>{{CT_REGISTRY_KEY_RELATIONSHIP_PERSON, aane}}));
@@ -117,7 +110,7 @@ TEST_F(PickerViewsTest, SearchSurvivesInvalidUtf8AndOverlongTexts)
 	addSimplePerson("Anna");
 	addSimplePerson("Ann <b>&amp;</b>");
 	ScreenHarness screen;
-	auto* view = static_cast<CtPersonPickerView*>(CtDllViewFactory::getInstance()->getCtListViewClassForRelationship());
+	auto* view = relationshipPicker();
 	ASSERT_TRUE(screen.push(view));
 
 	view->setSearchText("\xc3\x28\xff");
@@ -141,48 +134,35 @@ TEST_F(PickerViewsTest, SearchSurvivesInvalidUtf8AndOverlongTexts)
 	EXPECT_EQ(view->getShownEntries().size(), 2u);
 }
 
-TEST_F(PickerViewsTest, LinkPickerLeavesOutTheBasePersonAndLinksTheChoiceForGood)
+TEST_F(PickerViewsTest, LinkPickerLeavesOutTheBasePersonRefusesWithNoRoomAndLinksTheChoiceForGood)
 {
 	int baseContact = 0;
 	int base = addSimplePerson("Base", &baseContact);
 	int otherContact = 0;
-	addSimplePerson("Other", &otherContact);
+	int other = addSimplePerson("Other", &otherContact);
 	addSimplePerson("Third");
-	app_control_h request = linkRequest(base, 9);
-	ContactsData data;
-	data.appControl = request;
-	{
+	for (int max : {0, 9}) {
+		app_control_h request = linkRequest(base, max);
+		ContactsData data{0, request, nullptr, 0};
 		ScreenHarness screen;
 		auto* view = static_cast<CtContactPickerView*>(CtDllViewFactory::getInstance()->getCtListViewClass(&data));
-		// The picker keeps its own copy of the request.
-		app_control_destroy(request);
+		app_control_destroy(request); // the picker keeps its own copy
 		ASSERT_TRUE(screen.push(view));
 		EXPECT_EQ(view->getLaunchType(), CtContactPickerView::kTypeLinkContacts);
-		EXPECT_EQ(view->getMaxCount(), 9);
+		EXPECT_EQ(view->getMaxCount(), max);
 		EXPECT_EQ(names(view), (std::vector<std::string>{"Other", "Third"}));
 		choose(screen, view, "Other");
-		EXPECT_TRUE(pumpUntil([&] { return screen.viewCount() == 0; }, 3.0));
+		if (max == 0) {
+			EXPECT_TRUE(pumpUntil([] { return ScreenHarness::logContains("ct_max 0"); }, 3.0));
+			EXPECT_EQ(screen.viewCount(), 1);
+			EXPECT_EQ(personOf(otherContact), other);
+		} else {
+			EXPECT_TRUE(pumpUntil([&] { return screen.viewCount() == 0; }, 3.0));
+		}
 	}
 	reopenStore();
 	EXPECT_EQ(personOf(otherContact), base);
 	EXPECT_EQ(personOf(baseContact), base);
-}
-
-TEST_F(PickerViewsTest, LinkPickerWithNoRoomLeftRefusesEveryChoice)
-{
-	int base = addSimplePerson("Base");
-	int otherContact = 0;
-	int other = addSimplePerson("Other", &otherContact);
-	app_control_h request = linkRequest(base, 0);
-	ContactsData data{0, request, nullptr, 0};
-	ScreenHarness screen;
-	auto* view = static_cast<CtPersonPickerView*>(CtDllViewFactory::getInstance()->getCtListViewClass(&data));
-	app_control_destroy(request);
-	ASSERT_TRUE(screen.push(view));
-	choose(screen, view, "Other");
-	EXPECT_TRUE(pumpUntil([] { return ScreenHarness::logContains("ct_max 0"); }, 3.0));
-	EXPECT_EQ(screen.viewCount(), 1);
-	EXPECT_EQ(personOf(otherContact), other);
 }
 
 TEST_F(PickerViewsTest, PickerAnswersTheRequestThatStartedIt)
@@ -193,34 +173,16 @@ TEST_F(PickerViewsTest, PickerAnswersTheRequestThatStartedIt)
 		app_control_clone(&received, request);
 		return 0;
 	});
-	std::vector<std::string> selected;
-	std::string replyId;
 	app_control_h request = nullptr;
 	app_control_create(&request);
 	app_control_set_app_id(request, "org.test.picker");
-	struct Answer {
-		std::vector<std::string>* selected;
-		std::string* id;
-	} answer{&selected, &replyId};
+	app_control_h reply = nullptr;
 	ASSERT_EQ(APP_CONTROL_ERROR_NONE, app_control_send_launch_request(request,
-		[](app_control_h, app_control_h reply, app_control_result_e result, void* data) {
-			auto* out = static_cast<Answer*>(data);
+		[](app_control_h, app_control_h answer, app_control_result_e result, void* data) {
 			EXPECT_EQ(result, APP_CONTROL_RESULT_SUCCEEDED);
-			char** values = nullptr;
-			int count = 0;
-			if (app_control_get_extra_data_array(reply, APP_CONTROL_DATA_SELECTED, &values, &count) == 0) {
-				for (int i = 0; i < count; ++i) {
-					out->selected->push_back(values[i]);
-					free(values[i]);
-				}
-				free(values);
-			}
-			char* id = nullptr;
-			if (app_control_get_extra_data(reply, APP_CONTROL_DATA_ID, &id) == 0)
-				*out->id = id;
-			free(id);
+			app_control_clone(static_cast<app_control_h*>(data), answer);
 		},
-		&answer));
+		&reply));
 	ASSERT_NE(received, nullptr);
 	{
 		ScreenHarness screen;
@@ -230,8 +192,18 @@ TEST_F(PickerViewsTest, PickerAnswersTheRequestThatStartedIt)
 		choose(screen, view, "Anna");
 		screen.pumpFor(0.1);
 	}
-	EXPECT_EQ(selected, (std::vector<std::string>{std::to_string(anna)}));
-	EXPECT_EQ(replyId, std::to_string(anna));
+	ASSERT_NE(reply, nullptr);
+	char** selected = nullptr;
+	int count = 0;
+	ASSERT_EQ(0, app_control_get_extra_data_array(reply, APP_CONTROL_DATA_SELECTED, &selected, &count));
+	ASSERT_EQ(count, 1);
+	EXPECT_EQ(selected[0], std::to_string(anna));
+	free(selected[0]);
+	free(selected);
+	char* id = nullptr;
+	ASSERT_EQ(0, app_control_get_extra_data(reply, APP_CONTROL_DATA_ID, &id));
+	EXPECT_EQ(take(id).get(), std::to_string(anna));
+	app_control_destroy(reply);
 	app_control_destroy(received);
 	app_control_destroy(request);
 }
@@ -270,7 +242,7 @@ TEST_F(PickerViewsTest, ListFollowsPersonsAddedAndDeletedElsewhereKeepingTheFilt
 {
 	int anna = addSimplePerson("Anna");
 	ScreenHarness screen;
-	auto* view = static_cast<CtPersonPickerView*>(CtDllViewFactory::getInstance()->getCtListViewClassForRelationship());
+	auto* view = relationshipPicker();
 	ASSERT_TRUE(screen.push(view));
 	view->setSearchText("an");
 	addSimplePerson("Hannah");

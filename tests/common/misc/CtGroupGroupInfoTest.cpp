@@ -1,42 +1,18 @@
 // Groups of several address books gathered under the name a person sees.
-#include "../../data/detail/DetailTestStore.h"
+#include "../CommonTestSupport.h"
 
 #include "ContactsCommon.h"
 #include "CtCommonAddressbookUtil.h"
 #include "CtGroupGroupInfo.h"
 #include "ScreenHarness.h"
-#include "TempDataDir.h"
 
 #include <string>
 #include <vector>
 
 using namespace ct::test;
 
-namespace {
+using CtGroupGroupInfoTest = StoreTest;
 
-int addGroup(int addressbookId, const char* name, const char* systemId = nullptr)
-{
-	contacts_record_h group = nullptr;
-	contacts_record_create(_contacts_group._uri, &group);
-	contacts_record_set_int(group, _contacts_group.address_book_id, addressbookId);
-	if (name)
-		contacts_record_set_str(group, _contacts_group.name, name);
-	if (systemId)
-		contacts_record_set_str(group, _contacts_group.system_id, systemId);
-	int id = 0;
-	EXPECT_EQ(CONTACTS_ERROR_NONE, contacts_db_insert_record(group, &id));
-	contacts_record_destroy(group, true);
-	return id;
-}
-
-class CtGroupGroupInfoTest : public ::testing::Test {
-protected:
-	void SetUp() override { ASSERT_EQ(CONTACTS_ERROR_NONE, contacts_connect()); }
-	void TearDown() override { contacts_disconnect(); }
-	TempDataDir m_dir;
-};
-
-} // namespace
 
 TEST_F(CtGroupGroupInfoTest, GroupsOfSeveralAddressbooksGatherUnderTheirShownName)
 {

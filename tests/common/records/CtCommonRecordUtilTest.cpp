@@ -1,10 +1,10 @@
 // The common record and address-book helpers over a real contacts store.
-#include "../../data/detail/DetailTestStore.h"
+#include "../CommonTestSupport.h"
 
 #include "ContactsCommon.h"
 #include "CtCommonAddressbookUtil.h"
 #include "CtCommonRecordUtil.h"
-#include "TempDataDir.h"
+#include "LogSink.h"
 
 #include <vconf.h>
 
@@ -17,28 +17,7 @@ using namespace ct::test;
 
 namespace {
 
-using CText = std::unique_ptr<char, decltype(&free)>;
-
-CText take(char* text)
-{
-	return CText(text, free);
-}
-
-class CtCommonRecordUtilTest : public ::testing::Test {
-protected:
-	void SetUp() override
-	{
-		ecore_init();
-		ASSERT_EQ(CONTACTS_ERROR_NONE, contacts_connect());
-	}
-	void TearDown() override
-	{
-		contacts_disconnect();
-		ecore_shutdown();
-	}
-
-	TempDataDir m_dir;
-};
+using CtCommonRecordUtilTest = StoreTest;
 
 std::string tr(const char* id)
 {
@@ -73,11 +52,6 @@ TEST_F(CtCommonRecordUtilTest, ContactsAndChildListsCoverEveryLinkedContactInOrd
 	eina_list_free(numbers);
 	EXPECT_EQ(nullptr, CtCommonGetChildDataList(contacts, _contacts_contact.email));
 	ctCommonDestroyRecordList(contacts);
-
-	EXPECT_EQ(nullptr, ctCommonGetContactsList(0));
-	EXPECT_EQ(nullptr, ctCommonGetContactsList(-3));
-	EXPECT_EQ(nullptr, ctCommonGetContactsList(424242));
-	ctCommonDestroyRecordList(nullptr);
 }
 
 TEST_F(CtCommonRecordUtilTest, SimContactIsASinglePersonContactInASimBook)
@@ -100,10 +74,7 @@ TEST_F(CtCommonRecordUtilTest, AddressBookLookupsAnswerNamesProvidersAndWritable
 	int readOnly = addAddressbook("corp", CONTACTS_ADDRESS_BOOK_MODE_READONLY, 7, "Corp");
 	EXPECT_EQ(readOnly, ctCommonGetAddressBookId("corp"));
 	EXPECT_EQ(0, ctCommonGetAddressBookId(PHONE_ADDRESSBOOK_NAME));
-	EXPECT_EQ(-1, ctCommonGetAddressBookId("nobody"));
-	EXPECT_EQ(-1, ctCommonGetAddressBookId(nullptr));
 	EXPECT_STREQ("corp", take(ctCommonGetAddressBookName(readOnly)).get());
-	EXPECT_EQ(nullptr, take(ctCommonGetAddressBookName(9999)).get());
 
 	char* provider = nullptr;
 	char* user = nullptr;
@@ -112,8 +83,6 @@ TEST_F(CtCommonRecordUtilTest, AddressBookLookupsAnswerNamesProvidersAndWritable
 	EXPECT_STREQ("user@example.com", user);
 	free(provider);
 	free(user);
-	EXPECT_NE(CONTACTS_ERROR_NONE, ctCommonGetProviderNameByAddressbookId(9999, &provider, &user));
-	EXPECT_EQ(nullptr, provider);
 
 	char* firstText = nullptr;
 	char* secondText = nullptr;
@@ -143,18 +112,6 @@ TEST_F(CtCommonRecordUtilTest, AddressBookLookupsAnswerNamesProvidersAndWritable
 TEST_F(CtCommonRecordUtilTest, GroupNamesUseSystemNamesOnceEach)
 {
 	int exchange = addAddressbook("eas", 0, 9, "Exchange");
-	auto addGroup = [](int book, const char* name, const char* systemId) {
-		contacts_record_h group = nullptr;
-		contacts_record_create(_contacts_group._uri, &group);
-		contacts_record_set_int(group, _contacts_group.address_book_id, book);
-		contacts_record_set_str(group, _contacts_group.name, name);
-		if (systemId)
-			contacts_record_set_str(group, _contacts_group.system_id, systemId);
-		int id = 0;
-		EXPECT_EQ(CONTACTS_ERROR_NONE, contacts_db_insert_record(group, &id));
-		contacts_record_destroy(group, true);
-		return id;
-	};
 	int hikers = addGroup(0, "Hikers", nullptr);
 	int family = addGroup(0, "ignored", "family");
 	int easDefault = addGroup(exchange, "Contacts", "contacts");
@@ -201,21 +158,18 @@ TEST_F(CtCommonRecordUtilTest, CompanyExtraNamesNewlinesAndShareText)
 	EXPECT_EQ(nullptr, CtCommonGetShareText(0));
 }
 
-TEST_F(CtCommonRecordUtilTest, TypeLabelsCoverEveryTypeAndCustomLabels)
+TEST_F(CtCommonRecordUtilTest, TypeLabelsCombineBitsAndFallBackForUnknownAndCustomTypes)
 {
-	EXPECT_EQ(tr("IDS_PB_OPT_MOBILE"), CtCommonGetNumberTypeStr(CONTACTS_NUMBER_TYPE_CELL, nullptr));
-	EXPECT_EQ(tr("IDS_PB_OPT_MOBILE"), CtCommonGetNumberTypeStr(CONTACTS_NUMBER_TYPE_CELL | CONTACTS_NUMBER_TYPE_VOICE, nullptr));
-	EXPECT_EQ(tr("IDS_PB_OPT_HOME_ABB2"), CtCommonGetNumberTypeStr(CONTACTS_NUMBER_TYPE_HOME | CONTACTS_NUMBER_TYPE_VOICE, nullptr));
-	EXPECT_EQ(tr("IDS_PB_OPT_WORK"), CtCommonGetNumberTypeStr(CONTACTS_NUMBER_TYPE_WORK, nullptr));
-	EXPECT_EQ(tr("IDS_PB_OPT_FAX_HHOME_ABB"), CtCommonGetNumberTypeStr(CONTACTS_NUMBER_TYPE_FAX | CONTACTS_NUMBER_TYPE_HOME, nullptr));
-	EXPECT_EQ(tr("IDS_PB_OPT_FAX_HWORK_ABB"), CtCommonGetNumberTypeStr(CONTACTS_NUMBER_TYPE_FAX | CONTACTS_NUMBER_TYPE_WORK, nullptr));
-	EXPECT_EQ(tr("IDS_PB_OPT_PAGER"), CtCommonGetNumberTypeStr(CONTACTS_NUMBER_TYPE_PAGER, nullptr));
-	EXPECT_EQ(tr("IDS_PB_OPT_ASSISTANT_M_CONTACTS"), CtCommonGetNumberTypeStr(CONTACTS_NUMBER_TYPE_ASSISTANT, nullptr));
-	EXPECT_EQ(tr("IDS_PB_OPT_OTHER"), CtCommonGetNumberTypeStr(CONTACTS_NUMBER_TYPE_OTHER, nullptr));
-	EXPECT_EQ(tr("IDS_PB_OPT_OTHER"), CtCommonGetNumberTypeStr(CONTACTS_NUMBER_TYPE_MODEM, nullptr));
+	// Voice is implied, fax combines with home or work, unknown types are "Other".
+	const std::pair<int, const char*> numbers[] = {{CONTACTS_NUMBER_TYPE_CELL | CONTACTS_NUMBER_TYPE_VOICE,
+		"IDS_PB_OPT_MOBILE"}, {CONTACTS_NUMBER_TYPE_HOME | CONTACTS_NUMBER_TYPE_VOICE, "IDS_PB_OPT_HOME_ABB2"},
+		{CONTACTS_NUMBER_TYPE_FAX | CONTACTS_NUMBER_TYPE_HOME, "IDS_PB_OPT_FAX_HHOME_ABB"},
+		{CONTACTS_NUMBER_TYPE_FAX | CONTACTS_NUMBER_TYPE_WORK, "IDS_PB_OPT_FAX_HWORK_ABB"},
+		{CONTACTS_NUMBER_TYPE_ASSISTANT, "IDS_PB_OPT_ASSISTANT_M_CONTACTS"},
+		{CONTACTS_NUMBER_TYPE_MODEM, "IDS_PB_OPT_OTHER"}, {CONTACTS_NUMBER_TYPE_CUSTOM, "IDS_PB_OPT_CUSTOM"}};
+	for (const auto& [type, id] : numbers)
+		EXPECT_EQ(tr(id), CtCommonGetNumberTypeStr(type, "")) << type;
 	EXPECT_STREQ("Boat", CtCommonGetNumberTypeStr(CONTACTS_NUMBER_TYPE_CUSTOM, "Boat"));
-	EXPECT_EQ(tr("IDS_PB_OPT_CUSTOM"), CtCommonGetNumberTypeStr(CONTACTS_NUMBER_TYPE_CUSTOM, ""));
-
 	contacts_record_h number = nullptr;
 	contacts_record_create(_contacts_number._uri, &number);
 	contacts_record_set_str(number, _contacts_number.label, "Yacht");
@@ -223,45 +177,21 @@ TEST_F(CtCommonRecordUtilTest, TypeLabelsCoverEveryTypeAndCustomLabels)
 	contacts_record_destroy(number, true);
 	EXPECT_EQ(tr("IDS_PB_OPT_CUSTOM"), CtCommonGetNumberTypeStr(static_cast<contacts_record_h>(nullptr), 1));
 
-	EXPECT_EQ(tr("IDS_PB_OPT_HOME_ABB2"), CtCommonGetEmailTypeStr(CONTACTS_EMAIL_TYPE_HOME, nullptr));
-	EXPECT_EQ(tr("IDS_PB_OPT_WORK"), CtCommonGetEmailTypeStr(CONTACTS_EMAIL_TYPE_WORK, nullptr));
 	EXPECT_EQ(tr("IDS_PB_OPT_MOBILE"), CtCommonGetEmailTypeStr(CONTACTS_EMAIL_TYPE_MOBILE, nullptr));
-	EXPECT_EQ(tr("IDS_PB_OPT_OTHER"), CtCommonGetEmailTypeStr(CONTACTS_EMAIL_TYPE_OTHER, nullptr));
-	EXPECT_STREQ("Alt", CtCommonGetEmailTypeStr(CONTACTS_EMAIL_TYPE_CUSTOM, "Alt"));
-
-	EXPECT_EQ(tr("IDS_PB_OPT_HOME_ABB2"), CtCommonGetAddressTypeStr(CONTACTS_ADDRESS_TYPE_HOME, nullptr));
-	EXPECT_EQ(tr("IDS_PB_OPT_WORK"), CtCommonGetAddressTypeStr(CONTACTS_ADDRESS_TYPE_WORK, nullptr));
 	EXPECT_EQ(tr("IDS_PB_OPT_OTHER"), CtCommonGetAddressTypeStr(CONTACTS_ADDRESS_TYPE_PARCEL, nullptr));
-	EXPECT_STREQ("Cabin", CtCommonGetAddressTypeStr(CONTACTS_ADDRESS_TYPE_CUSTOM, "Cabin"));
-
-	const char* messengers[] = {"IDS_PB_OPT_OTHER", nullptr, "IDS_PB_OPT_HANGOUTS", "IDS_PB_OPT_WINDOWS_LIVE_MESSENGER",
-		"IDS_PB_OPT_YAHOO_E", "IDS_PB_OPT_FACEBOOK", "IDS_PB_OPT_ICQ", "IDS_PB_OPT_AIM", "IDS_PB_OPT_QQ",
-		"IDS_PB_OPT_JABBER", "IDS_PB_BODY_SKYPE", "IDS_PB_OPT_IRC"};
-	for (int type = 0; type <= CONTACTS_MESSENGER_TYPE_IRC; ++type)
-		if (messengers[type]) {
-			EXPECT_EQ(tr(messengers[type]), CtCommonGetMessengerTypeStr(type, nullptr)) << type;
-		}
-	EXPECT_STREQ("Signal", CtCommonGetMessengerTypeStr(CONTACTS_MESSENGER_TYPE_CUSTOM, "Signal"));
-	EXPECT_EQ(tr("IDS_PB_OPT_OTHER"), CtCommonGetMessengerTypeStr(99, nullptr));
-	EXPECT_EQ(tr("IDS_PB_OPT_OTHER"), CtCommonGetMessengerTypeStr(-4, nullptr));
-
-	EXPECT_EQ(tr("IDS_PB_OPT_HOME_ABB2"), CtCommonGetUrlTypeStr(CONTACTS_URL_TYPE_HOME, nullptr));
 	EXPECT_EQ(tr("IDS_PB_OPT_WORK"), CtCommonGetUrlTypeStr(CONTACTS_URL_TYPE_WORK, nullptr));
-	EXPECT_EQ(tr("IDS_PB_OPT_OTHER"), CtCommonGetUrlTypeStr(CONTACTS_URL_TYPE_OTHER, nullptr));
-	EXPECT_STREQ("Blog", CtCommonGetUrlTypeStr(CONTACTS_URL_TYPE_CUSTOM, "Blog"));
-
-	const char* relations[] = {"IDS_PB_OPT_OTHER", "IDS_PB_OPT_ASSISTANT_M_CONTACTS", "IDS_PB_OPT_BROTHER",
-		"IDS_PB_OPT_CHILD", "IDS_PB_OPT_DOMESTIC_PARTNER_ABB2", "IDS_PB_OPT_FATHER", "IDS_PB_OPT_FRIEND",
-		"IDS_PB_OPT_MANAGER", "IDS_PB_OPT_MOTHER", "IDS_PB_OPT_PARENT", "IDS_PB_OPT_PARTNER",
-		"IDS_PB_OPT_REFERRED_BY_ABB", "IDS_PB_OPT_RELATIVE", "IDS_PB_OPT_SISTER", "IDS_PB_OPT_SPOUSE"};
-	for (int type = 0; type < CONTACTS_RELATIONSHIP_TYPE_CUSTOM; ++type)
-		EXPECT_EQ(tr(relations[type]), CtCommonGetRelationshipTypeStr(type, nullptr)) << type;
-	EXPECT_STREQ("Mentor", CtCommonGetRelationshipTypeStr(CONTACTS_RELATIONSHIP_TYPE_CUSTOM, "Mentor"));
-	EXPECT_EQ(tr("IDS_PB_OPT_OTHER"), CtCommonGetRelationshipTypeStr(40, nullptr));
-
-	EXPECT_EQ(tr("IDS_PB_OPT_BIRTHDAY"), CtCommonGetEventTypeStr(CONTACTS_EVENT_TYPE_BIRTH, nullptr));
 	EXPECT_EQ(tr("IDS_PB_OPT_ANNIVERSARY_ABB"), CtCommonGetEventTypeStr(CONTACTS_EVENT_TYPE_ANNIVERSARY, nullptr));
-	EXPECT_EQ(tr("IDS_PB_OPT_OTHER"), CtCommonGetEventTypeStr(CONTACTS_EVENT_TYPE_OTHER, nullptr));
+	EXPECT_EQ(tr("IDS_PB_BODY_SKYPE"), CtCommonGetMessengerTypeStr(CONTACTS_MESSENGER_TYPE_SKYPE, nullptr));
+	EXPECT_EQ(tr("IDS_PB_OPT_SPOUSE"), CtCommonGetRelationshipTypeStr(CONTACTS_RELATIONSHIP_TYPE_SPOUSE, nullptr));
+	for (int outOfRange : {99, -4, 40}) {
+		EXPECT_EQ(tr("IDS_PB_OPT_OTHER"), CtCommonGetMessengerTypeStr(outOfRange, nullptr));
+		EXPECT_EQ(tr("IDS_PB_OPT_OTHER"), CtCommonGetRelationshipTypeStr(outOfRange, nullptr));
+	}
+	EXPECT_STREQ("Alt", CtCommonGetEmailTypeStr(CONTACTS_EMAIL_TYPE_CUSTOM, "Alt"));
+	EXPECT_STREQ("Cabin", CtCommonGetAddressTypeStr(CONTACTS_ADDRESS_TYPE_CUSTOM, "Cabin"));
+	EXPECT_STREQ("Signal", CtCommonGetMessengerTypeStr(CONTACTS_MESSENGER_TYPE_CUSTOM, "Signal"));
+	EXPECT_STREQ("Blog", CtCommonGetUrlTypeStr(CONTACTS_URL_TYPE_CUSTOM, "Blog"));
+	EXPECT_STREQ("Mentor", CtCommonGetRelationshipTypeStr(CONTACTS_RELATIONSHIP_TYPE_CUSTOM, "Mentor"));
 	EXPECT_STREQ("Graduation", CtCommonGetEventTypeStr(CONTACTS_EVENT_TYPE_CUSTOM, "Graduation"));
 }
 
@@ -285,4 +215,36 @@ TEST_F(CtCommonRecordUtilTest, DateFormattersFollowTheRegionFormat)
 	EXPECT_NE(std::string::npos, date.find("1999")) << date;
 	i18n_udate_destroy(german);
 	vconf_set_str(VCONFKEY_REGIONFORMAT, "en_US.UTF-8");
+}
+
+TEST_F(CtCommonRecordUtilTest, UnknownIdsNullRecordsAndBadTextsGiveEmptyAnswers)
+{
+	for (int id : {-7, 4242}) {
+		EXPECT_FALSE(ctCommonIsSimAddressbook(id));
+		char* provider = nullptr;
+		char* user = nullptr;
+		EXPECT_LT(ctCommonGetProviderNameByAddressbookId(id, &provider, &user), 0);
+		EXPECT_EQ(user, nullptr);
+		EXPECT_EQ(take(ctCommonGetAddressBookName(id)), nullptr);
+		EXPECT_EQ(ctCommonGetAccountIconPathByAddressbookId(id), "");
+		EXPECT_EQ(ctCommonGetEasDefaultGroupId(id), 0);
+	}
+	for (const std::string& name : {std::string("nobody"), std::string("bad\xff\xfe"), std::string(200000, 'b')})
+		EXPECT_EQ(ctCommonGetAddressBookId(name.c_str()), -1);
+	EXPECT_EQ(ctCommonGetAddressBookId(nullptr), -1);
+	for (int personId : {0, -3, 99999}) {
+		EXPECT_EQ(ctCommonGetContactsList(personId), nullptr);
+		EXPECT_EQ(ctCommonGetWritableContactList(personId, 0), nullptr);
+	}
+	ctCommonDestroyRecordList(nullptr);
+	EXPECT_TRUE(ct::log::contains("Invalid param : personId"));
+	EXPECT_EQ(CtCommonGetChildDataList(nullptr, _contacts_contact.number), nullptr);
+	char* first = nullptr;
+	char* second = nullptr;
+	CtCommonGetExtraName1(nullptr, &first, &second);
+	EXPECT_EQ(first, nullptr);
+	EXPECT_EQ(second, nullptr);
+	CText oneLine = take(ctCommonRemoveNewline("a\nb\r\xff"));
+	ASSERT_NE(oneLine, nullptr);
+	EXPECT_EQ(std::string(oneLine.get()).find('\n'), std::string::npos);
 }

@@ -45,33 +45,25 @@ std::string readFile(const std::string& path)
 
 } // namespace
 
-TEST(CtCommonTextUtil, CleaningKeepsOnlyDialableCharacters)
+TEST(CtCommonTextUtil, CleaningKeepsOnlyDialableCharactersAndNeverOverflows)
 {
-	EXPECT_EQ(clean("+1 (201) 555-0123"), "+12015550123");
-	EXPECT_EQ(clean("*31#010,1;2"), "*31#010,1;2");
-	EXPECT_EQ(clean("call me"), "");
-	// Arabic-Indic digits are dialled as their ASCII digits.
-	EXPECT_EQ(clean("\xD9\xA1\xD9\xA2\xD9\xA3"), "123");
-	EXPECT_EQ(clean(nullptr), "");
-	// Only the valid UTF-8 prefix is read.
-	EXPECT_EQ(clean("12\xFF" "34"), "12");
-}
+	const std::pair<const char*, const char*> cases[] = {{"+1 (201) 555-0123", "+12015550123"},
+		{"*31#010,1;2", "*31#010,1;2"}, {"call me", ""}, {nullptr, ""},
+		{"\xD9\xA1\xD9\xA2\xD9\xA3", "123"}, // Arabic-Indic digits dial as ASCII
+		{"12\xFF" "34", "12"}, {"\xff\xfe", ""}}; // only the valid UTF-8 prefix is read
+	for (const auto& [number, cleaned] : cases)
+		EXPECT_EQ(clean(number), cleaned) << (number ? number : "null");
+	const std::pair<const char*, const char*> simCases[] = {{"+49 30-1234", "+49301234"},
+		{"0049+30+1", "0049301"}, {"123p4w5P6W7", "123,4;5,6;7"}, {"(555) abc", "555"}};
+	for (const auto& [number, cleaned] : simCases)
+		EXPECT_EQ(cleanForSim(number), cleaned) << number;
 
-TEST(CtCommonTextUtil, CleaningForSimKeepsOneLeadingPlusAndMapsPauses)
-{
-	EXPECT_EQ(cleanForSim("+49 30-1234"), "+49301234");
-	EXPECT_EQ(cleanForSim("0049+30+1"), "0049301");
-	EXPECT_EQ(cleanForSim("123p4w5P6W7"), "123,4;5,6;7");
-	EXPECT_EQ(cleanForSim("(555) abc"), "555");
-}
-
-TEST(CtCommonTextUtil, CleaningNeverOverflowsTheBuffer)
-{
 	std::string huge(5000, '7');
 	char out[16];
 	memset(out, 'x', sizeof(out));
 	EXPECT_EQ(ctCommonCleanNumber(huge.c_str(), out, sizeof(out)), 15);
 	EXPECT_EQ(std::string(out), std::string(15, '7'));
+	EXPECT_EQ(ctCommonCleanNumberForSim(huge.c_str(), out, sizeof(out)), 15);
 	EXPECT_EQ(ctCommonCleanNumber("123", out, 1), 0);
 	EXPECT_STREQ(out, "");
 	EXPECT_EQ(ctCommonCleanNumber("123", nullptr, 10), 0);
@@ -96,14 +88,11 @@ TEST(CtCommonTextUtil, MarkupBecomesValidPlainText)
 
 TEST(CtCommonTextUtil, Utf8LengthFromLeadByte)
 {
-	EXPECT_EQ(ctCommonCheckUtf8('a'), 1);
-	EXPECT_EQ(ctCommonCheckUtf8('\xC3'), 2);
-	EXPECT_EQ(ctCommonCheckUtf8('\xE2'), 3);
-	EXPECT_EQ(ctCommonCheckUtf8('\xF0'), 4);
 	// Continuation and never-valid bytes still advance a walk by one.
-	EXPECT_EQ(ctCommonCheckUtf8('\x80'), 1);
-	EXPECT_EQ(ctCommonCheckUtf8('\xC0'), 1);
-	EXPECT_EQ(ctCommonCheckUtf8('\xFF'), 1);
+	const std::pair<char, int> cases[] = {{'a', 1}, {'\xC3', 2}, {'\xE2', 3}, {'\xF0', 4}, {'\x80', 1},
+		{'\xC0', 1}, {'\xFF', 1}};
+	for (const auto& [lead, length] : cases)
+		EXPECT_EQ(ctCommonCheckUtf8(lead), length) << int(lead);
 }
 
 TEST(CtCommonTextUtil, DisplayFileNameDropsFolderAndExtension)
@@ -115,6 +104,10 @@ TEST(CtCommonTextUtil, DisplayFileNameDropsFolderAndExtension)
 	EXPECT_EQ(displayName(nullptr), "");
 	// Cut at a whole character: "é" does not fit in the last byte.
 	EXPECT_EQ(displayName("/x/ab\xC3\xA9.ogg", 4), "ab");
+	std::string huge = std::string(1 << 20, 'x') + "\xe2\x82"; // a character cut in half at the end
+	std::string shown = displayName(huge.c_str(), 64);
+	EXPECT_LT(shown.size(), 64u);
+	EXPECT_TRUE(g_utf8_validate(shown.c_str(), -1, nullptr));
 }
 
 TEST(CtCommonTextUtil, CopiedImageIsANewFileInTheDataFolder)
@@ -136,7 +129,7 @@ TEST(CtCommonTextUtil, CopiedImageIsANewFileInTheDataFolder)
 	EXPECT_EQ(readFile(second), "JPEGDATA");
 }
 
-TEST(CtCommonTextUtil, BadCopiesAndUnlinksFailCleanly)
+TEST(CtCommonTextUtil, BadCopiesAndUnlinksFailCleanlyAsDoesAnUnmakeableDataFolder)
 {
 	ct::test::TempDataDir dir;
 	std::string out = "stale";
@@ -151,27 +144,31 @@ TEST(CtCommonTextUtil, BadCopiesAndUnlinksFailCleanly)
 	EXPECT_EQ(ctCommonUnlinkFile(dir.path().c_str()), -EISDIR);
 	struct stat st;
 	EXPECT_EQ(stat(dir.path().c_str(), &st), 0);
-}
 
-TEST(CtCommonTextUtil, CopyFailsWhenTheDataFolderCannotBeMade)
-{
-	ct::test::TempDataDir dir;
-	std::string source = dir.file("picked.png");
+	// In a fresh data folder, the image folder's place is taken by a regular file.
+	ct::test::TempDataDir fresh;
+	std::string source = fresh.file("picked.png");
 	std::ofstream(source) << "PNG";
-	// The image folder's place is taken by a regular file.
 	std::ofstream(ct::platform::dataPath("images")) << "x";
-	std::string out;
+	out = "stale";
 	EXPECT_LT(ctCommonCopyImage(source.c_str(), out), 0);
 	EXPECT_TRUE(out.empty());
 }
 
-TEST(CtCommonTextUtil, AddressIsEncodedForAGeoQuery)
+TEST(CtCommonTextUtil, AddressIsPercentEncodedForAGeoQuery)
 {
+	const std::pair<const char*, const char*> cases[] = {
+		{"1 Main St\nSpringfield & Co \"A\"", "1%20Main%20St%20Springfield%20%26%20Co%20%22A%22"},
+		{"12 Main St, <tag>?#", "12%20Main%20St%2C%20%3Ctag%3E%3F%23"}, {"Caf\xC3\xA9", "Caf%C3%A9"},
+		{"a-b_c.d~e", "a-b_c.d~e"}};
 	std::string encoded;
-	ASSERT_TRUE(ctCommontEncodeAddress("1 Main St\nSpringfield & Co \"A\"", encoded));
-	EXPECT_EQ(encoded, "1%20Main%20St%20Springfield%20%26%20Co%20%22A%22");
-	ASSERT_TRUE(ctCommontEncodeAddress("Caf\xC3\xA9", encoded));
-	EXPECT_EQ(encoded, "Caf%C3%A9");
+	for (const auto& [address, expected] : cases) {
+		ASSERT_TRUE(ctCommontEncodeAddress(address, encoded));
+		EXPECT_EQ(encoded, expected);
+	}
+	EXPECT_TRUE(ctCommontEncodeAddress("Stra\xdf" "e\xff", encoded)); // invalid UTF-8 stays encoded
+	EXPECT_EQ(encoded.find_first_not_of("ABCDEFGHIJKLMNOPQRSTUVWXYZabcdefghijklmnopqrstuvwxyz0123456789-._~%+ "),
+		std::string::npos);
 	EXPECT_FALSE(ctCommontEncodeAddress(nullptr, encoded));
 	EXPECT_TRUE(encoded.empty());
 }

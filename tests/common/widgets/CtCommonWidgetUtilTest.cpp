@@ -5,7 +5,7 @@
 #include "CtCommonWidgetUtil.h"
 #include "LogSink.h"
 #include "ScreenHarness.h"
-#include "TempDataDir.h"
+#include "../CommonTestSupport.h"
 
 #include <gtest/gtest.h>
 #include <vconf.h>
@@ -156,10 +156,6 @@ TEST_F(WidgetUtilTest, CheckStateIsSetWithoutAChangeEvent)
 	EXPECT_FALSE(elm_check_state_get(check));
 	EXPECT_EQ(0, changes);
 	ctCommonChecktStateSet(nullptr, EINA_TRUE, 0);
-
-	int before = ctCommonGetCpuBoostCount();
-	ctCommonInvokeDbusCpuBoost();
-	EXPECT_EQ(before + 1, ctCommonGetCpuBoostCount());
 }
 
 TEST_F(WidgetUtilTest, ApplicationsAreAvailableWhileTheirHandlersAreRegistered)
@@ -186,21 +182,6 @@ TEST_F(WidgetUtilTest, ApplicationsAreAvailableWhileTheirHandlersAreRegistered)
 	EXPECT_FALSE(ctCommontGetMapsAppId(maps));
 }
 
-TEST_F(WidgetUtilTest, AddressIsPercentEncodedForAGeoQuery)
-{
-	std::string out = "stale";
-	EXPECT_TRUE(ctCommontEncodeAddress("12 Main St, Springfield", out));
-	EXPECT_EQ("12%20Main%20St%2C%20Springfield", out);
-	EXPECT_TRUE(ctCommontEncodeAddress("\"Quoted\" & <tag>?#", out));
-	EXPECT_EQ("%22Quoted%22%20%26%20%3Ctag%3E%3F%23", out);
-	EXPECT_TRUE(ctCommontEncodeAddress("Straße 5", out));
-	EXPECT_EQ("Stra%C3%9Fe%205", out);
-	EXPECT_TRUE(ctCommontEncodeAddress("a-b_c.d~e", out));
-	EXPECT_EQ("a-b_c.d~e", out);
-	EXPECT_FALSE(ctCommontEncodeAddress(nullptr, out));
-	EXPECT_EQ("", out);
-}
-
 TEST_F(WidgetUtilTest, NetworkIsConnectedUnlessTheStatusSaysOff)
 {
 	EXPECT_TRUE(ctCommonCheckNetworkEnable());
@@ -212,21 +193,10 @@ TEST_F(WidgetUtilTest, NetworkIsConnectedUnlessTheStatusSaysOff)
 
 TEST_F(WidgetUtilTest, HighlightIsOffForScriptsThatJoinLetters)
 {
-	const char* saved = getenv("LANGUAGE");
-	std::string previous = saved ? saved : "";
-	setenv("LANGUAGE", "ar_AE", 1);
-	EXPECT_FALSE(ctCommonCheckHighlightSupported());
-	setenv("LANGUAGE", "en_US", 1);
+	{
+		EnvScope arabic("LANGUAGE", "ar_AE");
+		EXPECT_FALSE(ctCommonCheckHighlightSupported());
+	}
+	EnvScope english("LANGUAGE", "en_US");
 	EXPECT_TRUE(ctCommonCheckHighlightSupported());
-	if (saved)
-		setenv("LANGUAGE", previous.c_str(), 1);
-	else
-		unsetenv("LANGUAGE");
-}
-
-TEST_F(WidgetUtilTest, ScaleIsTheToolkitScaleOverTheBaseScale)
-{
-	EXPECT_DOUBLE_EQ(elm_config_scale_get() / (elm_app_base_scale_get() > 0 ? elm_app_base_scale_get() : 1.0),
-			ctCommonGetScale());
-	EXPECT_GT(ctCommonGetScale(), 0.0);
 }

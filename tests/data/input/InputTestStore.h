@@ -1,10 +1,11 @@
-// Helpers of the editable-contact tests: a fresh store per test, stored
-// contacts with children, launch requests and a main-loop pump.
+// Helpers of the editable-contact tests: a fresh store per test, groups,
+// reading stored contacts back and launch requests (contacts, address books
+// and the main-loop pump come from the detail tests' store helpers).
 #pragma once
 
+#include "../detail/DetailTestStore.h"
 #include "TempDataDir.h"
 
-#include <Ecore.h>
 #include <app_control.h>
 #include <app_preference.h>
 #include <contacts.h>
@@ -15,20 +16,6 @@
 #include <string>
 
 namespace ct::test {
-
-template <typename Pred>
-bool pumpUntil(Pred done, double seconds)
-{
-	double end = ecore_time_get() + seconds;
-	while (!done() && ecore_time_get() < end)
-		ecore_main_loop_iterate();
-	return done();
-}
-
-inline void settle(double seconds = 0.3)
-{
-	pumpUntil([] { return false; }, seconds);
-}
 
 // A fresh data folder, the main loop and a connection for one test.
 class InputStoreTest : public ::testing::Test {
@@ -58,75 +45,11 @@ protected:
 	TempDataDir m_dir;
 };
 
-inline contacts_record_h addChild(contacts_record_h contact, unsigned int property, const char* uri)
-{
-	contacts_record_h child = nullptr;
-	contacts_record_create(uri, &child);
-	contacts_record_add_child_record(contact, property, child);
-	return child;
-}
-
-inline contacts_record_h newContact(int addressbookId, const char* first, const char* last = nullptr)
-{
-	contacts_record_h contact = nullptr;
-	contacts_record_create(_contacts_contact._uri, &contact);
-	contacts_record_set_int(contact, _contacts_contact.address_book_id, addressbookId);
-	contacts_record_set_int(contact, _contacts_contact.link_mode, CONTACTS_CONTACT_LINK_MODE_IGNORE_ONCE);
-	contacts_record_h name = addChild(contact, _contacts_contact.name, _contacts_name._uri);
-	contacts_record_set_str(name, _contacts_name.first, first);
-	contacts_record_set_str(name, _contacts_name.last, last);
-	return contact;
-}
-
-inline void addNumber(contacts_record_h contact, const char* number, int type = CONTACTS_NUMBER_TYPE_CELL)
-{
-	contacts_record_h child = addChild(contact, _contacts_contact.number, _contacts_number._uri);
-	contacts_record_set_str(child, _contacts_number.number, number);
-	contacts_record_set_int(child, _contacts_number.type, type);
-}
-
-inline void addEmail(contacts_record_h contact, const char* email)
-{
-	contacts_record_h child = addChild(contact, _contacts_contact.email, _contacts_email._uri);
-	contacts_record_set_str(child, _contacts_email.email, email);
-}
-
-inline int store(contacts_record_h contact)
-{
-	int id = 0;
-	EXPECT_EQ(CONTACTS_ERROR_NONE, contacts_db_insert_record(contact, &id));
-	contacts_record_destroy(contact, true);
-	return id;
-}
-
 inline contacts_record_h readContact(int contactId)
 {
 	contacts_record_h contact = nullptr;
 	contacts_db_get_record(_contacts_contact._uri, contactId, &contact);
 	return contact;
-}
-
-inline int personOf(int contactId)
-{
-	contacts_record_h contact = readContact(contactId);
-	int personId = 0;
-	contacts_record_get_int(contact, _contacts_contact.person_id, &personId);
-	contacts_record_destroy(contact, true);
-	return personId;
-}
-
-inline int addAddressbook(const char* name, const char* provider)
-{
-	contacts_record_h book = nullptr;
-	contacts_record_create(_contacts_address_book._uri, &book);
-	contacts_record_set_str(book, _contacts_address_book.name, name);
-	contacts_record_set_int(book, _contacts_address_book.account_id, 7);
-	contacts_record_set_str(book, _contacts_address_book.provider_name, provider);
-	contacts_record_set_str(book, _contacts_address_book.user_name, "someone@example.com");
-	int id = -1;
-	EXPECT_EQ(CONTACTS_ERROR_NONE, contacts_db_insert_record(book, &id));
-	contacts_record_destroy(book, true);
-	return id;
 }
 
 inline int addGroup(int addressbookId, const char* name, const char* systemId)

@@ -150,6 +150,11 @@ TEST(ThemeGroups, EveryStyleGroupImageAndPartTheCodeNamesExists)
 		if (layout)
 			loaded.push_back(layout);
 	}
+	// Title-bar parts belong to the naviframe item of the light theme.
+	Evas_Object* titleBar = canvas.load("light.edj", "elm/naviframe/item/basic/default");
+	EXPECT_NE(titleBar, nullptr);
+	if (titleBar)
+		loaded.push_back(titleBar);
 	for (const std::string& part : asked.parts) {
 		bool found = false;
 		for (Evas_Object* obj : loaded) // "sub.name" names the numbered parts sub.name1...

@@ -14,7 +14,7 @@ namespace {
 
 ct::kv::SharedStore& sharedStore()
 {
-	static ct::kv::SharedStore store("preferences.db");
+	static ct::kv::SharedStore store("preferences.db", "preference");
 	return store;
 }
 
@@ -34,43 +34,14 @@ int toPreferenceError(int rc)
 	}
 }
 
-KeyValueStore* openStore(const char* key, int* error)
-{
-	*error = KeyValueStore::validateKey(key);
-	if (*error != ct::kv::kOk) {
-		WERROR("invalid preference key");
-		return nullptr;
-	}
-	KeyValueStore* store = sharedStore().get(error);
-	if (!store)
-		WERROR("preference store unavailable (%d)", *error);
-	return store;
-}
-
 int readTyped(const char* key, Type type, Value* out)
 {
-	int rc = ct::kv::kOk;
-	KeyValueStore* store = openStore(key, &rc);
-	if (!store)
-		return rc;
-	rc = store->get(key, out);
-	if (rc == ct::kv::kOk && out->type != type) {
-		WERROR("preference %s holds another type", key);
-		return ct::kv::kWrongType;
-	}
-	return rc;
+	return sharedStore().readTyped(key, type, out);
 }
 
 int writeValue(const char* key, const Value& value)
 {
-	int rc = ct::kv::kOk;
-	KeyValueStore* store = openStore(key, &rc);
-	if (!store)
-		return toPreferenceError(rc);
-	rc = store->set(key, value);
-	if (rc != ct::kv::kOk)
-		WFAILED("preference_set", rc);
-	return toPreferenceError(rc);
+	return toPreferenceError(sharedStore().write(key, value));
 }
 
 } // namespace
@@ -144,7 +115,7 @@ int preference_get_boolean(const char* key, bool* value)
 int preference_remove(const char* key)
 {
 	int rc = ct::kv::kOk;
-	KeyValueStore* store = openStore(key, &rc);
+	KeyValueStore* store = sharedStore().forKey(key, &rc);
 	if (!store)
 		return toPreferenceError(rc);
 	return toPreferenceError(store->remove(key));
@@ -155,7 +126,7 @@ int preference_is_existing(const char* key, bool* existing)
 	WPRET_VM(!existing, PREFERENCE_ERROR_INVALID_PARAMETER, "existing is null");
 	*existing = false;
 	int rc = ct::kv::kOk;
-	KeyValueStore* store = openStore(key, &rc);
+	KeyValueStore* store = sharedStore().forKey(key, &rc);
 	if (!store)
 		return toPreferenceError(rc);
 	Value stored;
@@ -179,7 +150,7 @@ int preference_set_changed_cb(const char* key, preference_changed_cb callback, v
 {
 	WPRET_VM(!callback, PREFERENCE_ERROR_INVALID_PARAMETER, "callback is null");
 	int rc = ct::kv::kOk;
-	KeyValueStore* store = openStore(key, &rc);
+	KeyValueStore* store = sharedStore().forKey(key, &rc);
 	if (!store)
 		return toPreferenceError(rc);
 	store->addObserver(key, &kCallbackTag,
@@ -190,7 +161,7 @@ int preference_set_changed_cb(const char* key, preference_changed_cb callback, v
 int preference_unset_changed_cb(const char* key)
 {
 	int rc = ct::kv::kOk;
-	KeyValueStore* store = openStore(key, &rc);
+	KeyValueStore* store = sharedStore().forKey(key, &rc);
 	if (!store)
 		return toPreferenceError(rc);
 	if (!store->removeObserver(key, &kCallbackTag))

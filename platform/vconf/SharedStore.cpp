@@ -1,11 +1,13 @@
 #include "SharedStore.h"
 
+#include "ContactsDebug.h"
 #include "DataDir.h"
 
 namespace ct::kv {
 
-SharedStore::SharedStore(std::string fileName)
+SharedStore::SharedStore(std::string fileName, std::string name)
 	: m_fileName(std::move(fileName))
+	, m_name(std::move(name))
 {
 }
 
@@ -33,6 +35,59 @@ void SharedStore::close()
 {
 	std::lock_guard<std::mutex> lock(m_mutex);
 	m_store.reset();
+}
+
+KeyValueStore* SharedStore::forKey(const char* key, int* error)
+{
+	*error = KeyValueStore::validateKey(key);
+	if (*error != kOk) {
+		WERROR("invalid %s key", m_name.c_str());
+		return nullptr;
+	}
+	KeyValueStore* store = get(error);
+	if (!store)
+		WERROR("%s store unavailable (%d)", m_name.c_str(), *error);
+	return store;
+}
+
+int SharedStore::read(const char* key, Value* out, const Value* (*fallback)(const char* key))
+{
+	int rc = kOk;
+	KeyValueStore* store = forKey(key, &rc);
+	if (!store)
+		return rc;
+	rc = store->get(key, out);
+	if (rc != kNotFound)
+		return rc;
+	if (const Value* value = fallback ? fallback(key) : nullptr) {
+		*out = *value;
+		return kOk;
+	}
+	WDEBUG("%s key %s not found", m_name.c_str(), key);
+	return rc;
+}
+
+int SharedStore::readTyped(const char* key, Type type, Value* out, const Value* (*fallback)(const char* key))
+{
+	int rc = read(key, out, fallback);
+	if (rc == kOk && out->type != type) {
+		WERROR("%s key %s holds type %d, asked for %d", m_name.c_str(), key, static_cast<int>(out->type),
+			static_cast<int>(type));
+		return kWrongType;
+	}
+	return rc;
+}
+
+int SharedStore::write(const char* key, const Value& value)
+{
+	int rc = kOk;
+	KeyValueStore* store = forKey(key, &rc);
+	if (!store)
+		return rc;
+	rc = store->set(key, value);
+	if (rc != kOk)
+		WWARNING("%s_set() Failed(%d)", m_name.c_str(), rc);
+	return rc;
 }
 
 } // namespace ct::kv

@@ -13,7 +13,8 @@ namespace ct::kv {
 
 class SharedStore {
 public:
-	explicit SharedStore(std::string fileName);
+	// `name` ("vconf", "preference") words the log lines.
+	SharedStore(std::string fileName, std::string name);
 	~SharedStore();
 	SharedStore(const SharedStore&) = delete;
 	SharedStore& operator=(const SharedStore&) = delete;
@@ -24,8 +25,19 @@ public:
 	// Closes the file and drops every observer; the next get() reopens it.
 	void close();
 
+	// The open store for a valid `key`; null, logged, with *error set otherwise.
+	KeyValueStore* forKey(const char* key, int* error);
+	// The value of `key`, else what `fallback` (may be null) gives for a key
+	// never set: kOk, kNotFound, kInvalid or a store error.
+	int read(const char* key, Value* out, const Value* (*fallback)(const char* key) = nullptr);
+	// Like read(), and kWrongType, logged, when the value has another type.
+	int readTyped(const char* key, Type type, Value* out, const Value* (*fallback)(const char* key) = nullptr);
+	// Stores the value: kOk or a store error, logged.
+	int write(const char* key, const Value& value);
+
 private:
 	std::string m_fileName;
+	std::string m_name;
 	std::mutex m_mutex;
 	std::unique_ptr<KeyValueStore> m_store;
 };

@@ -19,7 +19,7 @@ namespace {
 
 ct::kv::SharedStore& sharedStore()
 {
-	static ct::kv::SharedStore store("vconf.db");
+	static ct::kv::SharedStore store("vconf.db", "vconf");
 	return store;
 }
 
@@ -78,57 +78,20 @@ int vconfType(Type type)
 	}
 }
 
-KeyValueStore* openStore(const char* key, int* error)
+const Value* defaultValue(const char* key)
 {
-	*error = KeyValueStore::validateKey(key);
-	if (*error != ct::kv::kOk) {
-		WERROR("invalid vconf key");
-		return nullptr;
-	}
-	KeyValueStore* store = sharedStore().get(error);
-	if (!store)
-		WERROR("vconf store unavailable (%d)", *error);
-	return store;
-}
-
-// The stored value, else the key's default. 0 or a store error.
-int readValue(const char* key, Value* out)
-{
-	int rc = ct::kv::kOk;
-	KeyValueStore* store = openStore(key, &rc);
-	if (!store)
-		return rc;
-	rc = store->get(key, out);
-	if (rc == ct::kv::kNotFound) {
-		if (const Default* entry = findDefault(key)) {
-			*out = entry->value;
-			return ct::kv::kOk;
-		}
-		WDEBUG("vconf key %s not found", key);
-	}
-	return rc;
+	const Default* entry = findDefault(key);
+	return entry ? &entry->value : nullptr;
 }
 
 int readTyped(const char* key, Type type, Value* out)
 {
-	int rc = readValue(key, out);
-	if (rc == ct::kv::kOk && out->type != type) {
-		WERROR("vconf key %s holds type %d, asked for %d", key, vconfType(out->type), vconfType(type));
-		return ct::kv::kWrongType;
-	}
-	return rc;
+	return sharedStore().readTyped(key, type, out, defaultValue);
 }
 
 int writeValue(const char* key, const Value& value)
 {
-	int rc = ct::kv::kOk;
-	KeyValueStore* store = openStore(key, &rc);
-	if (!store)
-		return toVconfError(rc);
-	rc = store->set(key, value);
-	if (rc != ct::kv::kOk)
-		WFAILED("vconf_set", rc);
-	return toVconfError(rc);
+	return toVconfError(sharedStore().write(key, value));
 }
 
 void deliver(const std::string& key, const Value& stored, vconf_callback_fn cb, void* userData)
@@ -186,7 +149,7 @@ char* vconf_get_str(const char* key)
 int vconf_get_type(const char* key)
 {
 	Value value;
-	return readValue(key, &value) == ct::kv::kOk ? vconfType(value.type) : VCONF_TYPE_NONE;
+	return sharedStore().read(key, &value, defaultValue) == ct::kv::kOk ? vconfType(value.type) : VCONF_TYPE_NONE;
 }
 
 int vconf_set_int(const char* key, int val)
@@ -216,7 +179,7 @@ int vconf_set_str(const char* key, const char* val)
 int vconf_unset(const char* key)
 {
 	int rc = ct::kv::kOk;
-	KeyValueStore* store = openStore(key, &rc);
+	KeyValueStore* store = sharedStore().forKey(key, &rc);
 	if (!store)
 		return toVconfError(rc);
 	return toVconfError(store->remove(key));
@@ -226,7 +189,7 @@ int vconf_notify_key_changed(const char* key, vconf_callback_fn cb, void* user_d
 {
 	WPRET_VM(!cb, VCONF_ERROR_INVALID_PARAMETER, "cb is null");
 	int rc = ct::kv::kOk;
-	KeyValueStore* store = openStore(key, &rc);
+	KeyValueStore* store = sharedStore().forKey(key, &rc);
 	if (!store)
 		return toVconfError(rc);
 	store->addObserver(key, reinterpret_cast<const void*>(cb),
@@ -238,7 +201,7 @@ int vconf_ignore_key_changed(const char* key, vconf_callback_fn cb)
 {
 	WPRET_VM(!cb, VCONF_ERROR_INVALID_PARAMETER, "cb is null");
 	int rc = ct::kv::kOk;
-	KeyValueStore* store = openStore(key, &rc);
+	KeyValueStore* store = sharedStore().forKey(key, &rc);
 	if (!store)
 		return toVconfError(rc);
 	if (!store->removeObserver(key, reinterpret_cast<const void*>(cb))) {

@@ -1,6 +1,7 @@
 // contacts-ctl pref get|set|remove|list
 #include "CtlCommand.h"
 #include "CtlText.h"
+#include "CtlTypedValue.h"
 
 #include "app_preference.h"
 
@@ -37,23 +38,14 @@ int printValue(const std::string& key)
 
 int setValue(const std::string& key, const std::string& type, const std::string& text)
 {
-	int rc = PREFERENCE_ERROR_NONE;
-	int number = 0;
-	bool flag = false;
-	double real = 0;
-	if (type == "int" && parseInt(text, &number))
-		rc = preference_set_int(key.c_str(), number);
-	else if (type == "bool" && parseBool(text, &flag))
-		rc = preference_set_boolean(key.c_str(), flag);
-	else if (type == "double" && parseDouble(text, &real))
-		rc = preference_set_double(key.c_str(), real);
-	else if (type == "string")
-		rc = preference_set_string(key.c_str(), text.c_str());
-	else
-		return usageError(kName, "'" + text + "' is not a valid " + type + " value");
-	if (rc != PREFERENCE_ERROR_NONE)
-		return fail("pref set " + key + " failed (" + std::to_string(rc) + ")");
-	return kExitOk;
+	const char* k = key.c_str();
+	TypedSetters setters = {
+		[k](int v) { return preference_set_int(k, v); },
+		[k](bool v) { return preference_set_boolean(k, v); },
+		[k](double v) { return preference_set_double(k, v); },
+		[k](const char* v) { return preference_set_string(k, v); },
+	};
+	return setTypedValue(kName, "pref set " + key, type, text, setters, PREFERENCE_ERROR_NONE);
 }
 
 int run(const Args& args)

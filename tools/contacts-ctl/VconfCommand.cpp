@@ -1,6 +1,7 @@
 // contacts-ctl vconf get|set|unset
 #include "CtlCommand.h"
 #include "CtlText.h"
+#include "CtlTypedValue.h"
 
 #include "vconf.h"
 
@@ -43,23 +44,14 @@ int printValue(const std::string& key)
 
 int setValue(const std::string& key, const std::string& type, const std::string& text)
 {
-	int rc = VCONF_OK;
-	int number = 0;
-	bool flag = false;
-	double real = 0;
-	if (type == "int" && parseInt(text, &number))
-		rc = vconf_set_int(key.c_str(), number);
-	else if (type == "bool" && parseBool(text, &flag))
-		rc = vconf_set_bool(key.c_str(), flag);
-	else if (type == "double" && parseDouble(text, &real))
-		rc = vconf_set_dbl(key.c_str(), real);
-	else if (type == "string")
-		rc = vconf_set_str(key.c_str(), text.c_str());
-	else
-		return usageError(kName, "'" + text + "' is not a valid " + type + " value");
-	if (rc != VCONF_OK)
-		return fail("vconf set " + key + " failed (" + std::to_string(rc) + ")");
-	return kExitOk;
+	const char* k = key.c_str();
+	TypedSetters setters = {
+		[k](int v) { return vconf_set_int(k, v); },
+		[k](bool v) { return vconf_set_bool(k, v ? 1 : 0); },
+		[k](double v) { return vconf_set_dbl(k, v); },
+		[k](const char* v) { return vconf_set_str(k, v); },
+	};
+	return setTypedValue(kName, "vconf set " + key, type, text, setters, VCONF_OK);
 }
 
 int run(const Args& args)

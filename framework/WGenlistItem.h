@@ -1,52 +1,16 @@
-// A genlist row object: the item's data. It is deleted with its list item
-// (by the item class's del function when it has one, else by the framework).
-// Append with the row as item data and getSelectCb() as selection callback,
-// then hand the new item to setElmObjectItem().
+// A genlist row object; see WGenItem.
 #pragma once
 
-#include "WControl.h"
-
-#include <Elementary.h>
-
-#include <memory>
+#include "WGenItem.h"
 
 namespace app_assist {
 
-class WGenlistItem {
+class WGenlistItem : public WGenItem {
 public:
-	WGenlistItem();
-	virtual ~WGenlistItem();
-
-	// The row class's shared item class; null makes getItemClass() ask for a new one.
-	virtual Elm_Genlist_Item_Class* getItemClassStatic();
-	// A new item class, freed by the framework with the row.
-	virtual Elm_Genlist_Item_Class* getItemClassNew();
-	virtual void onSelect(Elm_Object_Item* item);
-	virtual void onSetElmObjectItem(Elm_Object_Item* item);
-
-	// The class to append with: the static one, else a new one owned by the row.
-	Elm_Genlist_Item_Class* getItemClass();
-	Elm_Object_Item* getElmObjectItem() const { return m_item; }
-	void setElmObjectItem(Elm_Object_Item* item);
-	Evas_Smart_Cb getSelectCb() const { return __selectCb; }
-	// The control (usually a view) this row works for; null once it died.
-	void attachToView(WControl* view);
-	WControl* getAttachedView() const { return m_view.lock().get(); }
-
-	// Item-class del function that deletes the row; for row classes that
-	// set one themselves.
-	static void deleteRowCb(void* data, Evas_Object* obj);
-
-private:
-	static void __selectCb(void* data, Evas_Object* obj, void* eventInfo);
-	static void __itemDelCb(void* data, Evas_Object* obj, void* eventInfo);
-
-	Elm_Object_Item* m_item = nullptr;
-	Elm_Genlist_Item_Class* m_ownedClass = nullptr;
-	std::weak_ptr<WControl> m_view;
-
-	WGenlistItem(const WGenlistItem&) = delete;
-	WGenlistItem& operator=(const WGenlistItem&) = delete;
+	WGenlistItem()
+		: WGenItem(Widget::Genlist)
+	{
+	}
 };
 
 } // namespace app_assist

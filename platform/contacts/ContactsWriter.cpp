@@ -470,30 +470,28 @@ int ContactsWriter::__deleteStandaloneChild(const ViewInfo& view, int id)
 	return touchContact(contactId, CONTACTS_CHANGE_UPDATED);
 }
 
+std::vector<int> ContactsWriter::__selectIds(const char* sql, int param)
+{
+	std::vector<int> ids;
+	CachedStatement st(m_conn.statement(sql));
+	st->bind(1, param);
+	while (st->step() == SQLITE_ROW)
+		ids.push_back(st->columnInt(0));
+	return ids;
+}
+
 int ContactsWriter::__deleteAddressBook(int id)
 {
 	WPRET_VM(id == 0, CONTACTS_ERROR_INVALID_PARAMETER, "the phone address book cannot be deleted");
 	if (!m_reader.exists(*ContactsSchema::view("contacts.view.address_book"), id))
 		return CONTACTS_ERROR_NO_DATA;
-	std::vector<int> contacts;
-	{
-		CachedStatement st(m_conn.statement("SELECT id FROM contacts WHERE address_book_id = ?"));
-		st->bind(1, id);
-		while (st->step() == SQLITE_ROW)
-			contacts.push_back(st->columnInt(0));
-	}
+	std::vector<int> contacts = __selectIds("SELECT id FROM contacts WHERE address_book_id = ?", id);
 	for (int contactId : contacts) {
 		int err = __deleteContact(contactId);
 		if (err != CONTACTS_ERROR_NONE)
 			return err;
 	}
-	std::vector<int> groups;
-	{
-		CachedStatement st(m_conn.statement("SELECT id FROM groups WHERE address_book_id = ?"));
-		st->bind(1, id);
-		while (st->step() == SQLITE_ROW)
-			groups.push_back(st->columnInt(0));
-	}
+	std::vector<int> groups = __selectIds("SELECT id FROM groups WHERE address_book_id = ?", id);
 	for (int groupId : groups) {
 		int err = __deleteGroup(groupId);
 		if (err != CONTACTS_ERROR_NONE)
@@ -507,13 +505,7 @@ int ContactsWriter::__deleteGroup(int id)
 {
 	if (!m_reader.exists(*ContactsSchema::view("contacts.view.group"), id))
 		return CONTACTS_ERROR_NO_DATA;
-	std::vector<int> members;
-	{
-		CachedStatement st(m_conn.statement("SELECT DISTINCT contact_id FROM group_relations WHERE group_id = ? AND owner = 0"));
-		st->bind(1, id);
-		while (st->step() == SQLITE_ROW)
-			members.push_back(st->columnInt(0));
-	}
+	std::vector<int> members = __selectIds("SELECT DISTINCT contact_id FROM group_relations WHERE group_id = ? AND owner = 0", id);
 	int err = __run("DELETE FROM group_relations WHERE group_id = ?", { id });
 	if (err == CONTACTS_ERROR_NONE)
 		err = __run("DELETE FROM groups WHERE id = ?", { id });

@@ -51,6 +51,8 @@ private:
 	int __insertStandaloneChild(contacts_record_s& record, int* id);
 	int __updateStandaloneChild(contacts_record_s& record);
 	int __deleteStandaloneChild(const ViewInfo& view, int id);
+	// Ids in the first column of `sql` with one int parameter.
+	std::vector<int> __selectIds(const char* sql, int param);
 	int __deleteAddressBook(int id);
 	int __deleteGroup(int id);
 	// The first number and e-mail of a contact become the defaults when its

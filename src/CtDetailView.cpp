@@ -126,6 +126,12 @@ bool isListKind(int kind)
 	}
 }
 
+// Rows of one height: at most one address and one note, the rows that wrap.
+bool hasCompactRows(CtDetailData* data)
+{
+	return eina_list_count(data->getAddressList()) <= 1 && eina_list_count(data->getNoteList()) <= 1;
+}
+
 bool hasText(const char* text)
 {
 	return text && *text;
@@ -237,8 +243,7 @@ void CtDetailView::__createData(int personId)
 		WERROR("no person to show : %d", personId);
 	m_detailData.reset(new CtDetailData(personId));
 	m_isSimContact = m_detailData->isSimContact();
-	m_isCompactLayout = eina_list_count(m_detailData->getAddressList()) <= 1
-		&& eina_list_count(m_detailData->getNoteList()) <= 1;
+	m_isCompactLayout = hasCompactRows(m_detailData.get());
 }
 
 Evas_Object* CtDetailView::onCreate(Evas_Object* parent, void*)
@@ -655,8 +660,7 @@ void CtDetailView::__updateGenlist()
 
 void CtDetailView::__applyCompactLayout()
 {
-	m_isCompactLayout = eina_list_count(m_detailData->getAddressList()) <= 1
-		&& eina_list_count(m_detailData->getNoteList()) <= 1;
+	m_isCompactLayout = hasCompactRows(m_detailData.get());
 	elm_genlist_homogeneous_set(m_genlist, m_isCompactLayout ? EINA_TRUE : EINA_FALSE);
 }
 

@@ -41,11 +41,9 @@ TEST_F(CtCommonRecordUtilTest, ContactsAndChildListsCoverEveryLinkedContactInOrd
 	ASSERT_EQ(2u, eina_list_count(contacts));
 	Eina_List* numbers = CtCommonGetChildDataList(contacts, _contacts_contact.number);
 	std::string joined;
-	Eina_List* l = nullptr;
-	void* record = nullptr;
-	EINA_LIST_FOREACH(numbers, l, record) {
+	for (Eina_List* l = numbers; l; l = eina_list_next(l)) {
 		char* number = nullptr;
-		contacts_record_get_str_p(static_cast<contacts_record_h>(record), _contacts_number.number, &number);
+		contacts_record_get_str_p(static_cast<contacts_record_h>(eina_list_data_get(l)), _contacts_number.number, &number);
 		joined += number;
 	}
 	EXPECT_EQ("123", joined);
@@ -79,17 +77,11 @@ TEST_F(CtCommonRecordUtilTest, AddressBookLookupsAnswerNamesProvidersAndWritable
 	char* provider = nullptr;
 	char* user = nullptr;
 	EXPECT_EQ(CONTACTS_ERROR_NONE, ctCommonGetProviderNameByAddressbookId(readOnly, &provider, &user));
-	EXPECT_STREQ("Corp", provider);
-	EXPECT_STREQ("user@example.com", user);
-	free(provider);
+	EXPECT_STREQ("Corp", take(provider).get());
+	EXPECT_STREQ("user@example.com", take(user).get());
+	EXPECT_EQ(CONTACTS_ERROR_NONE, ctCommonGetAccountInforByAddressbookId(0, &provider, &user));
+	EXPECT_STREQ("IDS_PB_OPT_DEVICE", take(provider).get());
 	free(user);
-
-	char* firstText = nullptr;
-	char* secondText = nullptr;
-	EXPECT_EQ(CONTACTS_ERROR_NONE, ctCommonGetAccountInforByAddressbookId(0, &firstText, &secondText));
-	EXPECT_STREQ("IDS_PB_OPT_DEVICE", firstText);
-	free(firstText);
-	free(secondText);
 	EXPECT_NE(std::string::npos, ctCommonGetAccountIconPathByAddressbookId(0).find("contacts_list_ic_device.png"));
 	EXPECT_EQ("", ctCommonGetAccountIconPathByAddressbookId(readOnly));
 

@@ -26,32 +26,6 @@ std::string tr(const char* id)
 
 } // namespace
 
-TEST_F(CtCommonRecordUtilTest, ContactsAndChildListsCoverEveryLinkedContactInOrder)
-{
-	contacts_record_h first = newContact(0, "One");
-	addNumber(first, "1", CONTACTS_NUMBER_TYPE_CELL);
-	addNumber(first, "2", CONTACTS_NUMBER_TYPE_HOME);
-	int firstId = store(first);
-	contacts_record_h second = newContact(0, "Two");
-	addNumber(second, "3", CONTACTS_NUMBER_TYPE_WORK);
-	int secondId = store(second);
-	int personId = linkContacts({firstId, secondId});
-
-	Eina_List* contacts = ctCommonGetContactsList(personId);
-	ASSERT_EQ(2u, eina_list_count(contacts));
-	Eina_List* numbers = CtCommonGetChildDataList(contacts, _contacts_contact.number);
-	std::string joined;
-	for (Eina_List* l = numbers; l; l = eina_list_next(l)) {
-		char* number = nullptr;
-		contacts_record_get_str_p(static_cast<contacts_record_h>(eina_list_data_get(l)), _contacts_number.number, &number);
-		joined += number;
-	}
-	EXPECT_EQ("123", joined);
-	eina_list_free(numbers);
-	EXPECT_EQ(nullptr, CtCommonGetChildDataList(contacts, _contacts_contact.email));
-	ctCommonDestroyRecordList(contacts);
-}
-
 TEST_F(CtCommonRecordUtilTest, SimContactIsASinglePersonContactInASimBook)
 {
 	int sim = addAddressbook(CONTACTS_SIM1_ADDRESS_BOOK_NAME, 0, 0, CONTACTS_SIM1_ADDRESS_BOOK_NAME);

@@ -218,19 +218,6 @@ TEST_F(CtInputDataStoreTest, OwnKeysOfTheContactsApplicationAndThePrimaryEdit)
 	EXPECT_EQ(snapshot(id), "Augusta|Byron|0101|||");
 }
 
-TEST_F(CtInputDataStoreTest, EmergencyTypeKeepsThePhoneStorage)
-{
-	int google = addAddressbook("g@example.com", 0, 7, "Google");
-	CtInputData data(nullptr, request(nullptr, {{"type", "126"}}).get());
-	EXPECT_EQ(data.getAddressbookId(), 0);
-	data.setAddressbookInfo(google);
-	EXPECT_EQ(data.getAddressbookId(), 0);
-	data.setFullName("Help");
-	int id = 0;
-	ASSERT_EQ(data.insertContact(&id), 0);
-	EXPECT_EQ(CtInputData(readContact(id)).getAddressbookId(), 0);
-}
-
 TEST_F(CtInputDataStoreTest, GoogleStorageJoinsItsDefaultGroupOnceAndGroupNamesShowTheEmergencyGroup)
 {
 	int google = addAddressbook("g@example.com", 0, 7, "Google");
@@ -264,7 +251,7 @@ TEST_F(CtInputDataStoreTest, GoogleStorageJoinsItsDefaultGroupOnceAndGroupNamesS
 	EXPECT_EQ(groups, (std::vector<int>{99, twin, emergency, friends}));
 }
 
-TEST_F(CtInputDataStoreTest, BaseStorageComesFromThePreferenceWithSimPowerChecks)
+TEST_F(CtInputDataStoreTest, BaseStorageComesFromThePreferenceWithSimPowerChecksExceptForEmergencyContacts)
 {
 	int account = addAddressbook("work@example.com", 0, 7, "Exchange");
 	int sim1 = ctCommonGetAddressBookId("SIM1");
@@ -278,6 +265,17 @@ TEST_F(CtInputDataStoreTest, BaseStorageComesFromThePreferenceWithSimPowerChecks
 	preference_set_string("input_base_addressbook", "SIM1");
 	vconf_set_int("db/telephony/sim_power_state1", 0);
 	EXPECT_EQ(CtInputData(nullptr).getAddressbookId(), 0) << "a SIM that is off";
+
+	// An emergency contact (type 126) stays on the phone whatever is chosen.
+	preference_set_string("input_base_addressbook", "work@example.com");
+	CtInputData data(nullptr, request(nullptr, {{"type", "126"}}).get());
+	EXPECT_EQ(data.getAddressbookId(), 0);
+	data.setAddressbookInfo(account);
+	EXPECT_EQ(data.getAddressbookId(), 0);
+	data.setFullName("Help");
+	int id = 0;
+	ASSERT_EQ(data.insertContact(&id), 0);
+	EXPECT_EQ(CtInputData(readContact(id)).getAddressbookId(), 0);
 }
 
 TEST_F(CtInputDataStoreTest, SimContactKeepsTheSecondOfExactlyTwoNumbers)

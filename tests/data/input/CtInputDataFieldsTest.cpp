@@ -70,31 +70,20 @@ TEST(CtDataTypeTables, NumberAndMessengerPositionsBothWays)
 
 TEST(CtDataTypeTables, NextTypes)
 {
-	EXPECT_EQ(nextNumberType({}), 64);
-	EXPECT_EQ(nextNumberType({64, 12, 10}), 1 << 29);
-	EXPECT_EQ(nextNumberType({64, 12, 10, 1 << 29, 20, 18, 128}), 0);
-	EXPECT_EQ(nextNumberType({64, 12, 10, 1 << 29, 20, 18}), 128);
-
-	EXPECT_EQ(nextHomeWorkType({}), 2);
-	EXPECT_EQ(nextHomeWorkType({2 | 1}), 4);
-	EXPECT_EQ(nextHomeWorkType({6}), 0);
-
-	EXPECT_EQ(nextEventType({}), 2);
-	EXPECT_EQ(nextEventType({2}), 3);
-	EXPECT_EQ(nextEventType({3, 2}), 0);
-	EXPECT_EQ(nextEventType({3}), 2);
-
-	EXPECT_EQ(nextRelationshipType({}), 1);
-	EXPECT_EQ(nextRelationshipType({1, 2, 0, 15, -4}), 3);
-	std::vector<int> all;
+	std::vector<int> allRelationships;
 	for (int t = 1; t <= 14; ++t)
-		all.push_back(t);
-	EXPECT_EQ(nextRelationshipType(all), 14);
-
-	EXPECT_EQ(nextMessengerType({}), 7);
-	EXPECT_EQ(nextMessengerType({7, 4}), 10);
-	EXPECT_EQ(nextMessengerType({7, 4, 10, 8, 2, 6}), 9);
-	EXPECT_EQ(nextMessengerType({7, 4, 10, 8, 2, 6}, CONTACTS_MESSENGER_TYPE_CUSTOM), 1);
+		allRelationships.push_back(t);
+	const std::vector<int> sixMessengers = {7, 4, 10, 8, 2, 6};
+	// {what the helper gives, what it should give}
+	const std::pair<int, int> cases[] = {{nextNumberType({}), 64}, {nextNumberType({64, 12, 10}), 1 << 29},
+		{nextNumberType({64, 12, 10, 1 << 29, 20, 18, 128}), 0}, {nextNumberType({64, 12, 10, 1 << 29, 20, 18}), 128},
+		{nextHomeWorkType({}), 2}, {nextHomeWorkType({2 | 1}), 4}, {nextHomeWorkType({6}), 0},
+		{nextEventType({}), 2}, {nextEventType({2}), 3}, {nextEventType({3, 2}), 0}, {nextEventType({3}), 2},
+		{nextRelationshipType({}), 1}, {nextRelationshipType({1, 2, 0, 15, -4}), 3},
+		{nextRelationshipType(allRelationships), 14}, {nextMessengerType({}), 7}, {nextMessengerType({7, 4}), 10},
+		{nextMessengerType(sixMessengers), 9}, {nextMessengerType(sixMessengers, CONTACTS_MESSENGER_TYPE_CUSTOM), 1}};
+	for (size_t i = 0; i < std::size(cases); ++i)
+		EXPECT_EQ(cases[i].first, cases[i].second) << "case " << i;
 }
 
 TEST_F(CtInputDataFieldsTest, AddedChildrenTakeTheNextFreeType)

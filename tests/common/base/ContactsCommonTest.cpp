@@ -12,7 +12,7 @@
 
 TEST(ContactsCommon, NumberDashesFollowTheRegion)
 {
-	// What the region does not know stays as typed.
+	// Known formats get dashes; what the region does not know stays as typed.
 	const std::tuple<const char*, const char*, const char*> cases[] = {{"2015550123", "US", "201-555-0123"},
 		{"+12015550123", "US", "+1-201-555-0123"}, {"0212345678", "KR", "02-1234-5678"},
 		{"01012345678", "KR", "010-1234-5678"}, {"030123456", "DE", "030-123456"},

@@ -1,5 +1,5 @@
 // Shared by the common-layer test programs: a store or a window per test,
-// groups, owned C texts, environment overrides and where pictures go.
+// owned C texts, environment overrides and where pictures go.
 #pragma once
 
 #include "../data/detail/DetailTestStore.h"
@@ -84,22 +84,6 @@ private:
 	std::string m_name, m_old;
 	bool m_had = false;
 };
-
-// Stores a group of the address book; returns its id.
-inline int addGroup(int addressbookId, const char* name, const char* systemId = nullptr)
-{
-	contacts_record_h group = nullptr;
-	contacts_record_create(_contacts_group._uri, &group);
-	contacts_record_set_int(group, _contacts_group.address_book_id, addressbookId);
-	if (name)
-		contacts_record_set_str(group, _contacts_group.name, name);
-	if (systemId)
-		contacts_record_set_str(group, _contacts_group.system_id, systemId);
-	int id = 0;
-	EXPECT_EQ(CONTACTS_ERROR_NONE, contacts_db_insert_record(group, &id));
-	contacts_record_destroy(group, true);
-	return id;
-}
 
 // Where a picture for review goes; the folder is kept after the run.
 inline std::string shotPath(const std::string& name)

@@ -7,23 +7,19 @@
 
 #include <fstream>
 #include <string>
+#include <tuple>
 #include <sys/stat.h>
 
 TEST(ContactsCommon, NumberDashesFollowTheRegion)
 {
-	EXPECT_EQ("201-555-0123", ContactsCommon::addNumberDashesForRegion("2015550123", "US"));
-	EXPECT_EQ("+1-201-555-0123", ContactsCommon::addNumberDashesForRegion("+12015550123", "US"));
-	EXPECT_EQ("02-1234-5678", ContactsCommon::addNumberDashesForRegion("0212345678", "KR"));
-	EXPECT_EQ("010-1234-5678", ContactsCommon::addNumberDashesForRegion("01012345678", "KR"));
-	EXPECT_EQ("030-123456", ContactsCommon::addNumberDashesForRegion("030123456", "DE"));
-	EXPECT_EQ("020-7946-0018", ContactsCommon::addNumberDashesForRegion("02079460018", "GB"));
-
-	// What the region does not know stays as typed.
-	EXPECT_EQ("112", ContactsCommon::addNumberDashesForRegion("112", "US"));
-	EXPECT_EQ("*123#", ContactsCommon::addNumberDashesForRegion("*123#", "US"));
-	EXPECT_EQ("hello", ContactsCommon::addNumberDashesForRegion("hello", "US"));
-	EXPECT_EQ("", ContactsCommon::addNumberDashesForRegion(nullptr, "US"));
-	EXPECT_EQ("2015550123", ContactsCommon::addNumberDashesForRegion("2015550123", nullptr));
+	// Known formats get dashes; what the region does not know stays as typed.
+	const std::tuple<const char*, const char*, const char*> cases[] = {{"2015550123", "US", "201-555-0123"},
+		{"+12015550123", "US", "+1-201-555-0123"}, {"0212345678", "KR", "02-1234-5678"},
+		{"01012345678", "KR", "010-1234-5678"}, {"030123456", "DE", "030-123456"},
+		{"02079460018", "GB", "020-7946-0018"}, {"112", "US", "112"}, {"*123#", "US", "*123#"},
+		{"hello", "US", "hello"}, {nullptr, "US", ""}, {"2015550123", nullptr, "2015550123"}};
+	for (const auto& [number, region, dashed] : cases)
+		EXPECT_EQ(dashed, ContactsCommon::addNumberDashesForRegion(number, region)) << (number ? number : "null");
 	std::string huge(100000, '5');
 	EXPECT_LE(ContactsCommon::addNumberDashesForRegion(huge.c_str(), "US").size(), 1024u);
 

@@ -63,9 +63,7 @@ TEST_F(CtProfileAgentTest, SettingsPersistAndDefaultsHold)
 	EXPECT_EQ(3, CtContactsAgentUtil::getPreferenceProfilePrivacyLevel());
 	EXPECT_EQ(1, CtContactsAgentUtil::getPreferenceProfileType());
 	EXPECT_TRUE(agent->getProfileProperty(CT_PROFILE_PROPERTY_ADDRESS));
-	EXPECT_EQ(2u, signals.size());
-	for (const auto& s : signals)
-		EXPECT_EQ(std::make_pair(14, 2), s);
+	EXPECT_EQ(signals, (std::vector<std::pair<int, int>>(2, {14, 2})));
 }
 
 TEST_F(CtProfileAgentTest, ShareWithListRoundTripsAndMarksTheChoice)
@@ -81,14 +79,13 @@ TEST_F(CtProfileAgentTest, ShareWithListRoundTripsAndMarksTheChoice)
 	EXPECT_EQ(0, preference_get_boolean("my_profile_sharing_selected_contacts_set", &set));
 	EXPECT_TRUE(set);
 	ASSERT_EQ(3, CtContactsAgentUtil::getPreferenceSelectedContactsList(&ids));
-	EXPECT_EQ(12, ids[0]);
-	EXPECT_EQ(99, ids[2]);
+	EXPECT_EQ(std::vector<int>(ids, ids + 3), std::vector<int>(chosen, chosen + 3));
 	free(ids);
 
 	// A damaged stored list gives the ids it still holds.
 	ASSERT_EQ(0, preference_set_string("profile_sharing_permitted_list", "7,x,-3,,8"));
 	ASSERT_EQ(2, CtContactsAgentUtil::getPreferenceSelectedContactsList(&ids));
-	EXPECT_EQ(8, ids[1]);
+	EXPECT_EQ(std::vector<int>(ids, ids + 2), (std::vector<int>{7, 8}));
 	free(ids);
 	EXPECT_FALSE(CtContactsAgentMgr::getInstance()->setPermittedList(nullptr, 2));
 	EXPECT_TRUE(CtContactsAgentMgr::getInstance()->setPermittedList(nullptr, 0));

@@ -65,14 +65,13 @@ TEST_F(CtRegistryMgrTest, ChangeSignalReachesListenersUntilRemoved)
 
 	registry->raiseChangeSignal(CT_REGISTRY_KEY_PERSON_DELETED, 42);
 	registry->raiseChangeSignal(CT_REGISTRY_KEY_PROFILE_SHARING_STATE, 2);
-	ASSERT_EQ(2u, got.size());
-	EXPECT_EQ(std::make_pair(2, 42), got[0]);
-	EXPECT_EQ(std::make_pair(14, 2), got[1]);
+	const std::vector<std::pair<int, int>> expected{{2, 42}, {14, 2}};
+	EXPECT_EQ(expected, got);
 
 	ct::log::clear();
 	registry->removeChangeListener(id);
 	registry->removeChangeListener(id);
 	EXPECT_TRUE(ct::log::contains("* Critical * Already removed listener! =" + std::to_string(id), DLOG_ERROR));
 	registry->raiseChangeSignal(CT_REGISTRY_KEY_FAVORITE_CHANGED, 1);
-	EXPECT_EQ(2u, got.size());
+	EXPECT_EQ(expected, got);
 }

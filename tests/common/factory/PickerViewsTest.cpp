@@ -16,6 +16,7 @@
 #include <glib.h>
 
 #include <filesystem>
+#include <map>
 #include <string>
 #include <vector>
 
@@ -25,7 +26,6 @@ namespace {
 
 class PickerViewsTest : public StoreTest {
 protected:
-
 	static std::vector<std::string> names(CtPersonPickerView* view)
 	{
 		std::vector<std::string> out;
@@ -60,24 +60,13 @@ protected:
 		screen.pumpUntilIdle();
 		return names(view);
 	}
-
-	static app_control_h linkRequest(int personId, int max)
-	{
-		app_control_h request = nullptr;
-		app_control_create(&request);
-		app_control_add_extra_data(request, "type", "131");
-		app_control_add_extra_data(request, "ct_selected_person_id", std::to_string(personId).c_str());
-		app_control_add_extra_data(request, "ct_max", std::to_string(max).c_str());
-		app_control_add_extra_data(request, "hide_create_button", "1");
-		return request;
-	}
 };
 
 } // namespace
 
 TEST_F(PickerViewsTest, RelationshipPickerFiltersByNameAndRaisesTheChosenPerson)
 {
-	int anna = addSimplePerson("Anna");
+	addSimplePerson("Anna");
 	addSimplePerson("Bert");
 	int aane = addSimplePerson("Åne");
 	std::vector<std::pair<ctRegistryKey, int>> signals;
@@ -102,7 +91,6 @@ TEST_F(PickerViewsTest, RelationshipPickerFiltersByNameAndRaisesTheChosenPerson)
 		EXPECT_TRUE(pumpUntil([&] { return screen.viewCount() == 0; }, 3.0));
 	}
 	CtRegistryMgr::getInstance()->removeChangeListener(listener);
-	EXPECT_GT(anna, 0);
 }
 
 TEST_F(PickerViewsTest, SearchSurvivesInvalidUtf8AndOverlongTexts)
@@ -142,7 +130,11 @@ TEST_F(PickerViewsTest, LinkPickerLeavesOutTheBasePersonRefusesWithNoRoomAndLink
 	int other = addSimplePerson("Other", &otherContact);
 	addSimplePerson("Third");
 	for (int max : {0, 9}) {
-		app_control_h request = linkRequest(base, max);
+		app_control_h request = nullptr;
+		app_control_create(&request);
+		for (const auto& [key, value] : std::map<std::string, std::string>{{"type", "131"},
+				 {"ct_selected_person_id", std::to_string(base)}, {"ct_max", std::to_string(max)}, {"hide_create_button", "1"}})
+			app_control_add_extra_data(request, key.c_str(), value.c_str());
 		ContactsData data{0, request, nullptr, 0};
 		ScreenHarness screen;
 		auto* view = static_cast<CtContactPickerView*>(CtDllViewFactory::getInstance()->getCtListViewClass(&data));

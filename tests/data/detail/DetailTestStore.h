@@ -148,6 +148,22 @@ inline std::string personText(int personId, unsigned int property)
 	return out;
 }
 
+// Stores a group of the address book; returns its id.
+inline int addGroup(int addressbookId, const char* name, const char* systemId = nullptr)
+{
+	contacts_record_h group = nullptr;
+	contacts_record_create(_contacts_group._uri, &group);
+	contacts_record_set_int(group, _contacts_group.address_book_id, addressbookId);
+	if (name)
+		contacts_record_set_str(group, _contacts_group.name, name);
+	if (systemId)
+		contacts_record_set_str(group, _contacts_group.system_id, systemId);
+	int id = 0;
+	EXPECT_EQ(CONTACTS_ERROR_NONE, contacts_db_insert_record(group, &id));
+	contacts_record_destroy(group, true);
+	return id;
+}
+
 // Reopens the database (last connection closes it), as a restart would.
 inline void reopenStore()
 {

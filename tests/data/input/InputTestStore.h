@@ -1,5 +1,5 @@
-// Helpers of the editable-contact tests: a fresh store per test, groups,
-// reading stored contacts back and launch requests (contacts, address books
+// Helpers of the editable-contact tests: a fresh store per test, reading
+// stored contacts back and launch requests (contacts, groups, address books
 // and the main-loop pump come from the detail tests' store helpers).
 #pragma once
 
@@ -13,11 +13,12 @@
 #include <vconf.h>
 
 #include <map>
+#include <memory>
 #include <string>
 
 namespace ct::test {
 
-// A fresh data folder, the main loop and a connection for one test.
+// A fresh data folder, the main loop, a connection and SIM 1 on for one test.
 class InputStoreTest : public ::testing::Test {
 protected:
 	void SetUp() override
@@ -35,53 +36,19 @@ protected:
 		ecore_shutdown();
 	}
 
-	// Closes and reopens the database, so reads come from the file.
-	void reopen()
-	{
-		contacts_disconnect();
-		ASSERT_EQ(CONTACTS_ERROR_NONE, contacts_connect());
-	}
-
 	TempDataDir m_dir;
 };
+
+inline std::string str(const char* text)
+{
+	return text ? text : "<null>";
+}
 
 inline contacts_record_h readContact(int contactId)
 {
 	contacts_record_h contact = nullptr;
 	contacts_db_get_record(_contacts_contact._uri, contactId, &contact);
 	return contact;
-}
-
-inline int addGroup(int addressbookId, const char* name, const char* systemId)
-{
-	contacts_record_h group = nullptr;
-	contacts_record_create(_contacts_group._uri, &group);
-	contacts_record_set_int(group, _contacts_group.address_book_id, addressbookId);
-	contacts_record_set_str(group, _contacts_group.name, name);
-	if (systemId)
-		contacts_record_set_str(group, _contacts_group.system_id, systemId);
-	int id = 0;
-	EXPECT_EQ(CONTACTS_ERROR_NONE, contacts_db_insert_record(group, &id));
-	contacts_record_destroy(group, true);
-	return id;
-}
-
-inline int addressbookIdByName(const char* name)
-{
-	contacts_list_h list = nullptr;
-	contacts_db_get_all_records(_contacts_address_book._uri, 0, 0, &list);
-	contacts_record_h book = nullptr;
-	int found = -1;
-	while (found < 0 && contacts_list_get_current_record_p(list, &book) == CONTACTS_ERROR_NONE) {
-		char* bookName = nullptr;
-		contacts_record_get_str_p(book, _contacts_address_book.name, &bookName);
-		if (bookName && std::string(bookName) == name)
-			contacts_record_get_int(book, _contacts_address_book.id, &found);
-		if (contacts_list_next(list) != CONTACTS_ERROR_NONE)
-			break;
-	}
-	contacts_list_destroy(list, true);
-	return found;
 }
 
 inline std::string textOf(contacts_record_h record, unsigned int property)
@@ -91,13 +58,6 @@ inline std::string textOf(contacts_record_h record, unsigned int property)
 	return value ? value : "";
 }
 
-inline int childCount(contacts_record_h record, unsigned int property)
-{
-	int count = 0;
-	contacts_record_get_child_record_count(record, property, &count);
-	return count;
-}
-
 inline contacts_record_h childAt(contacts_record_h record, unsigned int property, int index)
 {
 	contacts_record_h child = nullptr;
@@ -105,24 +65,17 @@ inline contacts_record_h childAt(contacts_record_h record, unsigned int property
 	return child;
 }
 
-// A launch request that the test owns.
-class Request {
-public:
-	explicit Request(const char* operation, std::map<std::string, std::string> extras = {})
-	{
-		app_control_create(&m_handle);
-		if (operation)
-			app_control_set_operation(m_handle, operation);
-		for (const auto& extra : extras)
-			app_control_add_extra_data(m_handle, extra.first.c_str(), extra.second.c_str());
-	}
-	~Request() { app_control_destroy(m_handle); }
-	Request(const Request&) = delete;
-	Request& operator=(const Request&) = delete;
-	app_control_h get() const { return m_handle; }
-
-private:
-	app_control_h m_handle = nullptr;
-};
+// A launch request with an operation (may be null) and extra data; the test owns it.
+using Request = std::unique_ptr<app_control_s, int (*)(app_control_h)>;
+inline Request request(const char* operation, const std::map<std::string, std::string>& extras = {})
+{
+	app_control_h handle = nullptr;
+	app_control_create(&handle);
+	if (operation)
+		app_control_set_operation(handle, operation);
+	for (const auto& [key, value] : extras)
+		app_control_add_extra_data(handle, key.c_str(), value.c_str());
+	return Request(handle, app_control_destroy);
+}
 
 } // namespace ct::test

@@ -52,15 +52,6 @@ void expectAtomic(const ConnectedStore& store, const std::function<int()>& op)
 	FAIL() << "the write never succeeded";
 }
 
-RecordPtr bigContact()
-{
-	RecordPtr contact = makeContact({ "Big", "Contact", { "1", "2", "3", "4", "5", "6" }, { "a@b", "c@d", "e@f" } });
-	for (int i = 0; i < 10; ++i)
-		contacts_record_set_str(addChild(contact.get(), _contacts_contact.url, _contacts_url._uri), _contacts_url.url,
-			("http://x/" + std::to_string(i)).c_str());
-	return contact;
-}
-
 } // namespace
 
 TEST(Atomicity, InsertUpdateDeleteAndLinkLoseNothingWhenTheDiskFills)
@@ -68,7 +59,10 @@ TEST(Atomicity, InsertUpdateDeleteAndLinkLoseNothingWhenTheDiskFills)
 	ConnectedStore store;
 	int keep = insertContact({ "Keep", "Me", { "42" } });
 
-	RecordPtr contact = bigContact();
+	RecordPtr contact = makeContact({ "Big", "Contact", { "1", "2", "3", "4", "5", "6" }, { "a@b", "c@d", "e@f" } });
+	for (int i = 0; i < 10; ++i)
+		contacts_record_set_str(addChild(contact.get(), _contacts_contact.url, _contacts_url._uri), _contacts_url.url,
+			("http://x/" + std::to_string(i)).c_str());
 	expectAtomic(store, [&]() { return contacts_db_insert_record(contact.get(), nullptr); });
 	int id = intOf(contact.get(), _contacts_contact.id);
 	ASSERT_GT(id, 0);

@@ -14,14 +14,10 @@
 
 namespace ct::test {
 
-struct RecordDeleter {
-	void operator()(contacts_record_h r) const { contacts_record_destroy(r, true); }
-};
+struct RecordDeleter { void operator()(contacts_record_h r) const { contacts_record_destroy(r, true); } };
 using RecordPtr = std::unique_ptr<contacts_record_s, RecordDeleter>;
 
-struct ListDeleter {
-	void operator()(contacts_list_h l) const { contacts_list_destroy(l, true); }
-};
+struct ListDeleter { void operator()(contacts_list_h l) const { contacts_list_destroy(l, true); } };
 using ListPtr = std::unique_ptr<contacts_list_s, ListDeleter>;
 
 // A fresh data folder with the service connected for the scope.
@@ -144,6 +140,15 @@ inline int personOf(int contactId)
 	return c ? intOf(c.get(), _contacts_contact.person_id) : 0;
 }
 
+// The text property of every child under list, in order.
+inline std::vector<std::string> texts(contacts_record_h r, unsigned list, unsigned prop)
+{
+	std::vector<std::string> out;
+	for (int i = 0; contacts_record_h child = childAt(r, list, i); ++i)
+		out.push_back(strOf(child, prop));
+	return out;
+}
+
 inline int childCount(contacts_record_h r, unsigned prop)
 {
 	int count = -1;
@@ -156,23 +161,6 @@ inline int countOf(const char* uri)
 	int count = -1;
 	EXPECT_EQ(CONTACTS_ERROR_NONE, contacts_db_get_count(uri, &count));
 	return count;
-}
-
-// Ids of the records returned by a query, in order.
-inline std::vector<int> queryIds(contacts_query_h query, unsigned idProp, int offset = 0, int limit = 0)
-{
-	contacts_list_h list = nullptr;
-	std::vector<int> ids;
-	EXPECT_EQ(CONTACTS_ERROR_NONE, contacts_db_get_records_with_query(query, offset, limit, &list));
-	ListPtr owner(list);
-	int count = 0;
-	contacts_list_get_count(list, &count);
-	for (int i = 0; i < count; ++i, contacts_list_next(list)) {
-		contacts_record_h r = nullptr;
-		contacts_list_get_current_record_p(list, &r);
-		ids.push_back(intOf(r, idProp));
-	}
-	return ids;
 }
 
 // A query with its filter on one view, destroyed with the scope.
@@ -189,10 +177,22 @@ struct QueryOwner {
 		contacts_filter_destroy(filter);
 		contacts_query_destroy(query);
 	}
+	// Ids of the records found, in order.
 	std::vector<int> run(unsigned idProp, int offset = 0, int limit = 0)
 	{
 		contacts_query_set_filter(query, filter);
-		return queryIds(query, idProp, offset, limit);
+		contacts_list_h list = nullptr;
+		EXPECT_EQ(CONTACTS_ERROR_NONE, contacts_db_get_records_with_query(query, offset, limit, &list));
+		ListPtr owner(list);
+		int count = 0;
+		contacts_list_get_count(list, &count);
+		std::vector<int> ids;
+		for (int i = 0; i < count; ++i, contacts_list_next(list)) {
+			contacts_record_h r = nullptr;
+			contacts_list_get_current_record_p(list, &r);
+			ids.push_back(intOf(r, idProp));
+		}
+		return ids;
 	}
 };
 

@@ -22,6 +22,15 @@ int defaultOf(contacts_person_property_e property, int person)
 	return id;
 }
 
+// "display name|display contact|link count|books|thumbnail|has e-mail" of the person.
+std::string summary(int personId)
+{
+	RecordPtr p = getRecord(_contacts_person._uri, personId);
+	return strOf(p.get(), _contacts_person.display_name) + "|" + std::to_string(intOf(p.get(), _contacts_person.display_contact_id))
+		+ "|" + std::to_string(intOf(p.get(), _contacts_person.link_count)) + "|" + strOf(p.get(), _contacts_person.addressbook_ids)
+		+ "|" + strOf(p.get(), _contacts_person.image_thumbnail_path) + "|" + std::to_string(boolOf(p.get(), _contacts_person.has_email));
+}
+
 } // namespace
 
 TEST(Person, LinkedContactsAggregateIntoOnePersonWithDefaultsAndUnlinkAgain)
@@ -39,14 +48,9 @@ TEST(Person, LinkedContactsAggregateIntoOnePersonWithDefaultsAndUnlinkAgain)
 	EXPECT_EQ(personA, personOf(b));
 	contacts_record_h gone = nullptr;
 	EXPECT_EQ(CONTACTS_ERROR_NO_DATA, contacts_db_get_record(_contacts_person._uri, personB, &gone));
-	RecordPtr person = getRecord(_contacts_person._uri, personA);
-	EXPECT_EQ("Ann Lee", strOf(person.get(), _contacts_person.display_name));
-	EXPECT_EQ(a, intOf(person.get(), _contacts_person.display_contact_id));
-	EXPECT_EQ(2, intOf(person.get(), _contacts_person.link_count));
-	EXPECT_EQ("0 " + std::to_string(book), strOf(person.get(), _contacts_person.addressbook_ids));
-	EXPECT_EQ("/img/a.jpg", strOf(person.get(), _contacts_person.image_thumbnail_path));
-	EXPECT_TRUE(boolOf(person.get(), _contacts_person.has_email));
-	EXPECT_GT(intOf(person.get(), _contacts_person.changed_ver), markerBefore);
+	const std::string books = "|0 " + std::to_string(book) + "|";
+	EXPECT_EQ("Ann Lee|" + std::to_string(a) + "|2" + books + "/img/a.jpg|1", summary(personA));
+	EXPECT_GT(intOf(getRecord(_contacts_person._uri, personA).get(), _contacts_person.changed_ver), markerBefore);
 
 	// Defaults: the name contact and the image.
 	ASSERT_EQ(CONTACTS_ERROR_NONE, contacts_person_set_default_property(CONTACTS_PERSON_PROPERTY_NAME_CONTACT, personA, b));
@@ -55,9 +59,7 @@ TEST(Person, LinkedContactsAggregateIntoOnePersonWithDefaultsAndUnlinkAgain)
 	store.reopen();
 	EXPECT_EQ(b, defaultOf(CONTACTS_PERSON_PROPERTY_NAME_CONTACT, personA));
 	EXPECT_EQ(imageId, defaultOf(CONTACTS_PERSON_PROPERTY_IMAGE, personA));
-	person = getRecord(_contacts_person._uri, personA);
-	EXPECT_EQ("Annie", strOf(person.get(), _contacts_person.display_name));
-	EXPECT_EQ("/img/b.jpg", strOf(person.get(), _contacts_person.image_thumbnail_path));
+	EXPECT_EQ("Annie|" + std::to_string(b) + "|2" + books + "/img/b.jpg|1", summary(personA));
 	// Ids that are not the person's are refused.
 	int stranger = insertContact({ "Zed", "" });
 	EXPECT_EQ(CONTACTS_ERROR_INVALID_PARAMETER,
@@ -71,9 +73,7 @@ TEST(Person, LinkedContactsAggregateIntoOnePersonWithDefaultsAndUnlinkAgain)
 	int newPerson = 0;
 	ASSERT_EQ(CONTACTS_ERROR_NONE, contacts_person_unlink_contact(personA, b, &newPerson));
 	EXPECT_EQ(newPerson, personOf(b));
-	person = getRecord(_contacts_person._uri, personA);
-	EXPECT_EQ("Ann Lee", strOf(person.get(), _contacts_person.display_name));
-	EXPECT_EQ(1, intOf(person.get(), _contacts_person.link_count));
+	EXPECT_EQ("Ann Lee|" + std::to_string(a) + "|1|0|/img/a.jpg|0", summary(personA));
 	EXPECT_EQ(CONTACTS_ERROR_INVALID_PARAMETER, contacts_person_unlink_contact(personA, a, &newPerson));
 	EXPECT_EQ(CONTACTS_ERROR_INVALID_PARAMETER, contacts_person_link_person(personA, personA));
 	EXPECT_EQ(CONTACTS_ERROR_NO_DATA, contacts_person_link_person(personA, 9999));
@@ -188,9 +188,8 @@ TEST(Group, GroupsAndRelationsFollowTheirContacts)
 	EXPECT_EQ(CONTACTS_ERROR_INVALID_PARAMETER, contacts_group_add_contact(groupId + 50, other));
 	store.reopen();
 	RecordPtr read = getRecord(_contacts_contact._uri, id);
-	ASSERT_EQ(1, childCount(read.get(), _contacts_contact.group_relation));
+	EXPECT_EQ(std::vector<std::string>{ "Family" }, texts(read.get(), _contacts_contact.group_relation, _contacts_group_relation.name));
 	EXPECT_EQ(groupId, intOf(childAt(read.get(), _contacts_contact.group_relation), _contacts_group_relation.group_id));
-	EXPECT_EQ("Family", strOf(childAt(read.get(), _contacts_contact.group_relation), _contacts_group_relation.name));
 	EXPECT_EQ("emergency", strOf(getRecord(_contacts_group._uri, groupId).get(), _contacts_group.system_id));
 	EXPECT_EQ(2, countOf(_contacts_group_relation._uri));
 	ASSERT_EQ(CONTACTS_ERROR_NONE, contacts_group_remove_contact(groupId, other));
@@ -223,10 +222,8 @@ TEST(MyProfile, ProfileKeepsChildrenStatusAndPictureOrderApartFromContacts)
 	RecordPtr read = getRecord(_contacts_my_profile._uri, id);
 	EXPECT_EQ("Me", strOf(read.get(), _contacts_my_profile.display_name));
 	EXPECT_EQ("Busy", strOf(read.get(), _contacts_my_profile_ex.status));
-	ASSERT_EQ(2, childCount(read.get(), _contacts_my_profile.image));
-	contacts_record_h image = childAt(read.get(), _contacts_my_profile.image, 1);
-	EXPECT_EQ(1, intOf(image, _contacts_image_ex.order));
-	EXPECT_EQ("/p1", strOf(image, _contacts_image.path));
+	EXPECT_EQ((std::vector<std::string>{ "/p2", "/p1" }), texts(read.get(), _contacts_my_profile.image, _contacts_image.path));
+	EXPECT_EQ(1, intOf(childAt(read.get(), _contacts_my_profile.image, 1), _contacts_image_ex.order));
 	EXPECT_EQ(0, countOf(_contacts_number._uri));
 	EXPECT_EQ(0, countOf(_contacts_person._uri));
 	contacts_record_set_str(read.get(), _contacts_my_profile_ex.status, "Free");

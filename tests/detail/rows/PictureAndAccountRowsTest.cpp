@@ -81,6 +81,10 @@ protected:
 			EXPECT_EQ(CONTACTS_ERROR_NONE, contacts_person_link_person(base, personOf(ids[i])));
 		return base;
 	}
+	Evas_Object* pictureOf(Elm_Object_Item* item)
+	{
+		return elm_object_part_content_get(content(item, "elm.icon"), "elm.swallow.content");
+	}
 	int personWithPictures(const std::vector<std::string>& paths)
 	{
 		contacts_record_h contact = newContact(0, "Pia");
@@ -100,17 +104,15 @@ TEST_F(PictureAndAccountRowsTest, WithoutPicturesTheDefaultPictureIsShownAndNoth
 	Elm_Object_Item* item = show(row);
 	EXPECT_EQ(DETAIL_ITEM_MULTI_IMAGE, row->getItemType());
 	EXPECT_EQ("detail.multi.image", ScreenHarness::itemStyle(item));
-	Evas_Object* layout = content(item, "elm.icon");
-	ASSERT_NE(nullptr, layout);
-	EXPECT_EQ("layout/detail/contact_image", layoutGroup(layout));
-	EXPECT_EQ("contacts_caller_id_default_full.png", imageGroup(elm_object_part_content_get(layout, "elm.swallow.content")));
+	EXPECT_EQ("layout/detail/contact_image", layoutGroup(content(item, "elm.icon")));
+	EXPECT_EQ("contacts_caller_id_default_full.png", imageGroup(pictureOf(item)));
 	EXPECT_EQ("", row->getCopyText());
 	EXPECT_EQ(nullptr, row->getPager());
 
 	std::string custom = picture("custom_default.png", 64, 64, 0xFF336699, 0xFF6699CC);
 	vconf_set_str(kDefaultImageKey, custom.c_str());
 	Elm_Object_Item* second = show(new CtDetailViewMultiImageItem(m_view, data, false));
-	EXPECT_EQ(custom, imageFile(elm_object_part_content_get(content(second, "elm.icon"), "elm.swallow.content")));
+	EXPECT_EQ(custom, imageFile(pictureOf(second)));
 }
 
 TEST_F(PictureAndAccountRowsTest, OnePictureFillsTheAreaOrSitsSmallInTheLowResolutionLayout)
@@ -119,16 +121,13 @@ TEST_F(PictureAndAccountRowsTest, OnePictureFillsTheAreaOrSitsSmallInTheLowResol
 	CtDetailData* data = load(personWithPictures({path}));
 	auto* row = new CtDetailViewMultiImageItem(m_view, data, false);
 	Elm_Object_Item* item = show(row);
-	Evas_Object* layout = content(item, "elm.icon");
-	EXPECT_EQ("layout/detail/contact_image", layoutGroup(layout));
-	EXPECT_EQ(path, imageFile(elm_object_part_content_get(layout, "elm.swallow.content")));
+	EXPECT_EQ("layout/detail/contact_image", layoutGroup(content(item, "elm.icon")));
+	EXPECT_EQ(path, imageFile(pictureOf(item)));
 	EXPECT_EQ(path, row->getCopyText());
 	ScreenHarness::selectItem(item);
-	ASSERT_EQ(1u, m_view->imagePages.size());
-	EXPECT_EQ(0, m_view->imagePages[0]);
+	EXPECT_EQ(std::vector<int>{0}, m_view->imagePages);
 
-	auto* low = new CtDetailViewMultiImageItem(m_view, data, true);
-	Elm_Object_Item* lowItem = show(low);
+	Elm_Object_Item* lowItem = show(new CtDetailViewMultiImageItem(m_view, data, true));
 	EXPECT_EQ("detail.multi.image/low", ScreenHarness::itemStyle(lowItem));
 	EXPECT_EQ("layout/detail/contact_image/low_resolution", layoutGroup(content(lowItem, "elm.icon")));
 }
@@ -149,8 +148,7 @@ TEST_F(PictureAndAccountRowsTest, SeveralPicturesMakeAPagerWithOneIndicatorPerPi
 	Evas_Object* pager = row->getPager();
 	ASSERT_NE(nullptr, pager);
 	EXPECT_EQ(pager, elm_object_part_content_get(layout, "scroller"));
-	Evas_Object* box = elm_object_content_get(pager);
-	Eina_List* pages = elm_box_children_get(box);
+	Eina_List* pages = elm_box_children_get(elm_object_content_get(pager));
 	EXPECT_EQ(3u, eina_list_count(pages));
 	eina_list_free(pages);
 
@@ -158,11 +156,9 @@ TEST_F(PictureAndAccountRowsTest, SeveralPicturesMakeAPagerWithOneIndicatorPerPi
 	ASSERT_NE(nullptr, index);
 	EXPECT_TRUE(elm_index_horizontal_get(index));
 	EXPECT_TRUE(elm_index_autohide_disabled_get(index));
-	Elm_Object_Item* first = elm_index_item_find(index, (void*)1);
-	ASSERT_NE(nullptr, first);
 	EXPECT_NE(nullptr, elm_index_item_find(index, (void*)3));
 	EXPECT_EQ(nullptr, elm_index_item_find(index, (void*)4));
-	EXPECT_EQ(first, elm_index_selected_item_get(index, 0));
+	EXPECT_EQ(elm_index_item_find(index, (void*)1), elm_index_selected_item_get(index, 0));
 
 	EXPECT_EQ(paths[0], row->getCopyText());
 	elm_scroller_page_show(pager, 2, 0);
@@ -170,8 +166,7 @@ TEST_F(PictureAndAccountRowsTest, SeveralPicturesMakeAPagerWithOneIndicatorPerPi
 	EXPECT_EQ(2, row->getCurrentPage());
 	EXPECT_EQ(paths[2], row->getCopyText());
 	ScreenHarness::selectItem(item);
-	ASSERT_EQ(1u, m_view->imagePages.size());
-	EXPECT_EQ(2, m_view->imagePages[0]);
+	EXPECT_EQ(std::vector<int>{2}, m_view->imagePages);
 }
 
 TEST_F(PictureAndAccountRowsTest, LinkedAccountsShowSevenIconsThenTheEighthOrTheMoreIcon)
@@ -205,10 +200,10 @@ TEST_F(PictureAndAccountRowsTest, LinkedAccountsShowSevenIconsThenTheEighthOrThe
 TEST_F(PictureAndAccountRowsTest, BasicInfoRowShowsTheNameAndItsStarTogglesTheFavourite)
 {
 	contacts_record_h contact = newContact(0, "Ari");
-	contacts_record_h nickname = addChild(contact, _contacts_contact.nickname, _contacts_nickname._uri);
-	contacts_record_set_str(nickname, _contacts_nickname.name, "Ace");
-	contacts_record_h company = addChild(contact, _contacts_contact.company, _contacts_company._uri);
-	contacts_record_set_str(company, _contacts_company.name, "Velmora");
+	contacts_record_set_str(addChild(contact, _contacts_contact.nickname, _contacts_nickname._uri),
+			_contacts_nickname.name, "Ace");
+	contacts_record_set_str(addChild(contact, _contacts_contact.company, _contacts_company._uri),
+			_contacts_company.name, "Velmora");
 	int personId = storePerson(contact);
 	CtDetailData* data = load(personId);
 	ASSERT_FALSE(data->isFavorite());
@@ -222,8 +217,8 @@ TEST_F(PictureAndAccountRowsTest, BasicInfoRowShowsTheNameAndItsStarTogglesTheFa
 	EXPECT_EQ(DETAIL_ITEM_BASIC_INFO, row->getItemType());
 	EXPECT_EQ("Ari", text(item, "main.name"));
 	std::vector<std::string> subs = {text(item, "sub.name1"), text(item, "sub.name2"), text(item, "sub.name3")};
-	EXPECT_NE(subs.end(), std::find(subs.begin(), subs.end(), "Ace"));
-	EXPECT_NE(subs.end(), std::find(subs.begin(), subs.end(), "Velmora"));
+	for (const char* sub : {"Ace", "Velmora"})
+		EXPECT_NE(subs.end(), std::find(subs.begin(), subs.end(), sub)) << sub;
 	EXPECT_NE(nullptr, content(item, "elm.icon.2"));
 
 	std::vector<std::pair<int, int>> signals;
@@ -233,17 +228,15 @@ TEST_F(PictureAndAccountRowsTest, BasicInfoRowShowsTheNameAndItsStarTogglesTheFa
 	ASSERT_NE(nullptr, star);
 	Evas_Coord x, y, w, h;
 	evas_object_geometry_get(star, &x, &y, &w, &h);
-	Evas* evas = evas_object_evas_get(star);
-	// A tap beside the star is an ordinary row tap.
-	evas_event_feed_mouse_move(evas, x - 30, y + h / 2, 0, nullptr);
-	evas_event_feed_mouse_down(evas, 1, EVAS_BUTTON_NONE, 0, nullptr);
-	evas_event_feed_mouse_up(evas, 1, EVAS_BUTTON_NONE, 0, nullptr);
+	auto tapAt = [evas = evas_object_evas_get(star)](int tx, int ty) {
+		evas_event_feed_mouse_move(evas, tx, ty, 0, nullptr);
+		evas_event_feed_mouse_down(evas, 1, EVAS_BUTTON_NONE, 0, nullptr);
+		evas_event_feed_mouse_up(evas, 1, EVAS_BUTTON_NONE, 0, nullptr);
+	};
+	tapAt(x - 30, y + h / 2); // beside the star: an ordinary row tap
 	EXPECT_FALSE(row->getSkipOnce());
-	evas_event_feed_mouse_move(evas, x + w / 2, y + h / 2, 0, nullptr);
-	evas_event_feed_mouse_down(evas, 1, EVAS_BUTTON_NONE, 0, nullptr);
-	evas_event_feed_mouse_up(evas, 1, EVAS_BUTTON_NONE, 0, nullptr);
+	tapAt(x + w / 2, y + h / 2);
 	CtRegistryMgr::getInstance()->removeChangeListener(listener);
-
 	EXPECT_TRUE(row->getSkipOnce());
 	row->clearSkipOnce();
 	EXPECT_FALSE(row->getSkipOnce());
@@ -251,39 +244,34 @@ TEST_F(PictureAndAccountRowsTest, BasicInfoRowShowsTheNameAndItsStarTogglesTheFa
 	ASSERT_EQ(1u, signals.size());
 	EXPECT_EQ(CT_REGISTRY_KEY_FAVORITE_CHANGED, signals[0].first);
 	reopenStore();
-	CtDetailData reread(personId);
-	EXPECT_TRUE(reread.isFavorite());
-}
+	EXPECT_TRUE(CtDetailData(personId).isFavorite());
 
-TEST_F(PictureAndAccountRowsTest, NamelessPersonIsShownAsUnknown)
-{
-	CtDetailData* data = load(storePerson(newContact(0, nullptr)));
-	Elm_Object_Item* item = show(new CtDetailViewBasicInfoItem(data, 0));
-	EXPECT_EQ(ContactsCommon::translate("IDS_LOGS_MBODY_UNKNOWN"), text(item, "main.name"));
+	Elm_Object_Item* nameless = show(new CtDetailViewBasicInfoItem(load(storePerson(newContact(0, nullptr))), 0));
+	EXPECT_EQ(ContactsCommon::translate("IDS_LOGS_MBODY_UNKNOWN"), text(nameless, "main.name"));
 }
 
 TEST_F(PictureAndAccountRowsTest, SocialProfileOpensInTheSocialAppWithDecodedExtras)
 {
-	CtDetailViewFacebookItem::SocialProfile own;
-	own.appId = FACEBOOK_APP_ID;
-	own.operation = APP_CONTROL_OPERATION_VIEW;
-	own.uri = "fb://profile/42";
-	own.extraData = b64("profile_id") + ":" + b64("42") + "," + b64("source") + ":" + b64("contacts") + ",broken";
-	app_control_h handle = CtDetailViewFacebookItem::createLaunchRequest(own);
+	auto request = [](const char* appId, const char* operation, const char* uri, std::string extras) {
+		CtDetailViewFacebookItem::SocialProfile profile;
+		profile.appId = appId;
+		profile.operation = operation ? operation : "";
+		profile.uri = uri;
+		profile.extraData = extras;
+		return CtDetailViewFacebookItem::createLaunchRequest(profile);
+	};
+	app_control_h handle = request(FACEBOOK_APP_ID, APP_CONTROL_OPERATION_VIEW, "fb://profile/42",
+			b64("profile_id") + ":" + b64("42") + "," + b64("source") + ":" + b64("contacts") + ",broken");
 	ASSERT_NE(nullptr, handle);
-	EXPECT_EQ("42", extraOf(handle, "profile_id"));
-	EXPECT_EQ("contacts", extraOf(handle, "source"));
-	EXPECT_EQ("<none>", extraOf(handle, "fb.appcontrol.launch.type"));
 	char* uri = nullptr;
 	app_control_get_uri(handle, &uri);
-	EXPECT_STREQ("fb://profile/42", uri);
+	EXPECT_EQ((std::vector<std::string>{"42", "contacts", "<none>", "fb://profile/42"}),
+			(std::vector<std::string>{extraOf(handle, "profile_id"), extraOf(handle, "source"),
+				extraOf(handle, "fb.appcontrol.launch.type"), uri ? uri : ""}));
 	free(uri);
 	app_control_destroy(handle);
 
-	CtDetailViewFacebookItem::SocialProfile other;
-	other.appId = "org.example.other";
-	other.uri = "https://social.example/ari";
-	handle = CtDetailViewFacebookItem::createLaunchRequest(other);
+	handle = request("org.example.other", nullptr, "https://social.example/ari", "");
 	ASSERT_NE(nullptr, handle);
 	char* app = nullptr;
 	app_control_get_app_id(handle, &app);
@@ -293,8 +281,7 @@ TEST_F(PictureAndAccountRowsTest, SocialProfileOpensInTheSocialAppWithDecodedExt
 	EXPECT_EQ("https://social.example/ari", extraOf(handle, "fb.appcontrol.launch.info"));
 	app_control_destroy(handle);
 
-	CtDetailData* bare = load(addSimplePerson("Ari"));
-	auto* row = new CtDetailViewFacebookItem(bare);
+	auto* row = new CtDetailViewFacebookItem(load(addSimplePerson("Ari")));
 	Elm_Object_Item* item = show(row);
 	EXPECT_EQ(DETAIL_ITEM_FACEBOOK, row->getItemType());
 	EXPECT_EQ(ContactsCommon::translate("IDS_PB_MBODY_VIEW_FACEBOOK_PROFILE"), text(item, "elm.text.main.left"));
@@ -302,15 +289,12 @@ TEST_F(PictureAndAccountRowsTest, SocialProfileOpensInTheSocialAppWithDecodedExt
 	EXPECT_TRUE(m_launches->launches().empty()) << "a contact without a profile opens nothing";
 
 	contacts_record_h contact = newContact(0, "Bea");
-	contacts_record_h profile = nullptr;
-	ASSERT_EQ(CONTACTS_ERROR_NONE, contacts_record_create(_contacts_profile._uri, &profile));
+	contacts_record_h profile = addChild(contact, _contacts_contact.profile, _contacts_profile._uri);
 	contacts_record_set_str(profile, _contacts_profile.app_id, FACEBOOK_APP_ID);
 	contacts_record_set_str(profile, _contacts_profile.service_operation, APP_CONTROL_OPERATION_VIEW);
 	contacts_record_set_str(profile, _contacts_profile.uri, "fb://profile/7");
 	contacts_record_set_str(profile, _contacts_profile.extra_data, (b64("profile_id") + ":" + b64("7")).c_str());
-	ASSERT_EQ(CONTACTS_ERROR_NONE, contacts_record_add_child_record(contact, _contacts_contact.profile, profile));
-	Elm_Object_Item* stored = show(new CtDetailViewFacebookItem(load(storePerson(contact))));
-	ScreenHarness::selectItem(stored);
+	ScreenHarness::selectItem(show(new CtDetailViewFacebookItem(load(storePerson(contact)))));
 	auto launches = m_launches->launches();
 	ASSERT_EQ(1u, launches.size());
 	EXPECT_EQ(FACEBOOK_APP_ID, launches[0].appId);
@@ -321,16 +305,19 @@ TEST_F(PictureAndAccountRowsTest, SocialProfileOpensInTheSocialAppWithDecodedExt
 TEST_F(PictureAndAccountRowsTest, ProfileSharingRowTellsTheSharingState)
 {
 	CtDetailData* data = load(addSimplePerson("Me"));
-	preference_set_boolean(CT_PREF_PROFILE_SHARING_STATUS, false);
-	Elm_Object_Item* off = show(new CtDetailViewProfileSharingItem(data));
-	EXPECT_EQ(ContactsCommon::translate("IDS_PB_MBODY_PROFILE_SHARING"), text(off, "elm.text.sub.left.top"));
-	EXPECT_EQ(ContactsCommon::translate("IDS_PB_BODY_OFF_M_NOT_USED"), text(off, "elm.text.main.left.bottom"));
-	preference_set_boolean(CT_PREF_PROFILE_SHARING_STATUS, true);
-	preference_set_int(CT_PREF_PROFILE_TYPE, 1);
-	Elm_Object_Item* business = show(new CtDetailViewProfileSharingItem(data));
-	EXPECT_EQ(ContactsCommon::translate("IDS_PB_HEADER_BUSINESS_PROFILE_ABB"), text(business, "elm.text.main.left.bottom"));
-	preference_set_int(CT_PREF_PROFILE_TYPE, 0);
-	Elm_Object_Item* personal = show(new CtDetailViewProfileSharingItem(data));
-	EXPECT_EQ(ContactsCommon::translate("IDS_PB_HEADER_PERSONAL_PROFILE_ABB"), text(personal, "elm.text.main.left.bottom"));
+	struct Case {
+		bool sharing;
+		int type;
+		const char* value;
+	};
+	for (Case c : {Case{false, 0, "IDS_PB_BODY_OFF_M_NOT_USED"}, Case{true, 1, "IDS_PB_HEADER_BUSINESS_PROFILE_ABB"},
+			 Case{true, 0, "IDS_PB_HEADER_PERSONAL_PROFILE_ABB"}}) {
+		preference_set_boolean(CT_PREF_PROFILE_SHARING_STATUS, c.sharing);
+		preference_set_int(CT_PREF_PROFILE_TYPE, c.type);
+		Elm_Object_Item* item = show(new CtDetailViewProfileSharingItem(data));
+		EXPECT_EQ((std::vector<std::string>{ContactsCommon::translate("IDS_PB_MBODY_PROFILE_SHARING"),
+					  ContactsCommon::translate(c.value)}),
+				labelAndValue(item));
+	}
 	preference_set_boolean(CT_PREF_PROFILE_SHARING_STATUS, false);
 }

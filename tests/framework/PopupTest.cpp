@@ -5,7 +5,6 @@
 #include "WMenuPopup.h"
 #include "WPopup.h"
 #include "WToastPopup.h"
-#include "notification.h"
 
 #include <gtest/gtest.h>
 
@@ -32,7 +31,6 @@ WPopup* makeTwoButtonPopup(std::vector<std::string>& clicks, bool keepOnOk = fal
 using Popup = ViewTest;
 using MenuPopup = ViewTest;
 using ToastPopup = ViewTest;
-using Harness = ViewTest;
 
 } // namespace
 
@@ -184,13 +182,4 @@ TEST_F(ToastPopup, ClosesItselfAfterItsTimeout)
 	auto alive = toast->getWeakPtr();
 	EXPECT_STREQ(elm_object_text_get(toast->getEvasObj()), "Saved");
 	EXPECT_TRUE(screen.pumpUntil([&] { return alive.expired(); }));
-}
-
-TEST_F(Harness, ReadsPostedNotices)
-{
-	ScreenHarness::clearNotices();
-	EXPECT_EQ(notification_status_message_post("Saved"), 0);
-	EXPECT_EQ(ScreenHarness::notices(), (std::vector<std::string> { "Saved" }));
-	ScreenHarness::clearNotices();
-	EXPECT_TRUE(ScreenHarness::notices().empty());
 }

@@ -79,12 +79,7 @@ private:
 // A one-line row that counts live rows and selections.
 class CountingRow : public app_assist::WGenlistItem {
 public:
-	explicit CountingRow(int index, int* liveRows, int* selections = nullptr)
-		: m_index(index)
-		, m_live(liveRows)
-		, m_selections(selections)
-	{
-	}
+	CountingRow(int index, int* liveRows, int* selections) : m_index(index), m_live(liveRows), m_selections(selections) {}
 
 	Elm_Genlist_Item_Class* getItemClassStatic() override
 	{
@@ -100,54 +95,19 @@ public:
 	void onSelect(Elm_Object_Item* item) override
 	{
 		elm_genlist_item_selected_set(item, EINA_FALSE);
-		if (m_selections)
-			++*m_selections;
+		++*m_selections;
 	}
-	int index() const { return m_index; }
 
 private:
 	static char* __textCb(void* data, Evas_Object*, const char* part)
 	{
-		auto* row = static_cast<CountingRow*>(data);
-		if (strcmp(part, "elm.text") != 0)
-			return nullptr;
-		return strdup(("Row " + std::to_string(row->m_index)).c_str());
+		int index = static_cast<CountingRow*>(data)->m_index;
+		return strcmp(part, "elm.text") ? nullptr : strdup(("Row " + std::to_string(index)).c_str());
 	}
 
 	int m_index;
 	LiveCount m_live;
 	int* m_selections;
-};
-
-// A view whose root is a genlist of `rows` CountingRows.
-class ListView : public app_assist::WView {
-public:
-	ListView(int rows, int* liveRows)
-		: m_rows(rows)
-		, m_liveRows(liveRows)
-	{
-		setTitle("List");
-	}
-	Evas_Object* genlist = nullptr;
-	int selections = 0;
-
-protected:
-	Evas_Object* onCreate(Evas_Object* parent, void*) override
-	{
-		genlist = elm_genlist_add(parent);
-		elm_genlist_mode_set(genlist, ELM_LIST_COMPRESS);
-		elm_genlist_homogeneous_set(genlist, EINA_TRUE);
-		for (int i = 0; i < m_rows; ++i) {
-			auto* row = new CountingRow(i, m_liveRows, &selections);
-			row->setElmObjectItem(elm_genlist_item_append(genlist, row->getItemClass(), row, nullptr,
-				ELM_GENLIST_ITEM_NONE, row->getSelectCb(), nullptr));
-		}
-		return genlist;
-	}
-
-private:
-	int m_rows;
-	int* m_liveRows;
 };
 
 // A screen per test, with a helper to push a recording view onto it.

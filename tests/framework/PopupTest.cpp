@@ -34,7 +34,7 @@ using ToastPopup = ViewTest;
 
 } // namespace
 
-TEST_F(Popup, ButtonsAppearInCallOrderAndCloseThePopupAsTheBackKeyDoesBeforeTheView)
+TEST_F(Popup, ButtonsAppearInCallOrderAndANewPopupTheBackKeyOrTheViewsEndCloseIt)
 {
 	auto* view = pushView("v");
 	std::vector<std::string> clicks;
@@ -44,10 +44,10 @@ TEST_F(Popup, ButtonsAppearInCallOrderAndCloseThePopupAsTheBackKeyDoesBeforeTheV
 	auto alive = popup->getWeakPtr();
 	EXPECT_EQ(view->getPopup(), popup);
 	Evas_Object* obj = popup->getEvasObj();
-	EXPECT_EQ(ScreenHarness::buttonLabel(elm_object_part_content_get(obj, "button1")), "Cancel");
-	EXPECT_EQ(ScreenHarness::buttonLabel(elm_object_part_content_get(obj, "button2")), "OK");
-	EXPECT_STREQ(elm_object_part_text_get(obj, "title,text"), "Title");
-
+	EXPECT_EQ((std::vector<std::string> { "Title", "Cancel", "OK" }),
+		(std::vector<std::string> { elm_object_part_text_get(obj, "title,text"),
+			ScreenHarness::buttonLabel(elm_object_part_content_get(obj, "button1")),
+			ScreenHarness::buttonLabel(elm_object_part_content_get(obj, "button2")) }));
 	ASSERT_TRUE(ScreenHarness::click(screen.findButton("OK")));
 	EXPECT_FALSE(alive.expired()); // the callback kept it open
 	ASSERT_TRUE(ScreenHarness::click(screen.findButton("Cancel")));
@@ -57,18 +57,43 @@ TEST_F(Popup, ButtonsAppearInCallOrderAndCloseThePopupAsTheBackKeyDoesBeforeTheV
 	EXPECT_EQ(view->getPopup(), nullptr);
 	EXPECT_EQ(screen.findButton("OK"), nullptr);
 
-	popup = makeTwoButtonPopup(clicks);
+	WPopup* first = makeTwoButtonPopup(clicks);
+	view->attachPopup(first);
+	auto aliveFirst = first->getWeakPtr();
+	popup = new WPopup("Second", nullptr);
+	popup->setContent([](Evas_Object* parent) {
+		Evas_Object* label = elm_label_add(parent);
+		elm_object_text_set(label, "built content");
+		return label;
+	});
 	int backs = 0;
 	popup->setOnBack([&backs](bool*) { ++backs; });
 	view->attachPopup(popup);
+	EXPECT_TRUE(aliveFirst.expired());
+	Evas_Object* content = elm_object_content_get(popup->getEvasObj());
+	ASSERT_NE(content, nullptr);
+	EXPECT_STREQ(elm_object_text_get(content), "built content");
 	alive = popup->getWeakPtr();
 	auto aliveView = view->getWeakPtr();
 	screen.sendBackKey();
 	EXPECT_EQ(backs, 1);
 	EXPECT_TRUE(alive.expired());
 	EXPECT_FALSE(aliveView.expired());
-	screen.sendBackKey();
+
+	view->attachPopup(popup = makeTwoButtonPopup(clicks));
+	alive = popup->getWeakPtr();
+	view->popOut();
+	screen.pumpUntilIdle();
+	EXPECT_TRUE(alive.expired());
 	EXPECT_TRUE(aliveView.expired());
+	EXPECT_EQ(clicks.size(), 2u);
+
+	ct::log::clear();
+	auto* crowded = new WPopup();
+	for (int i = 0; i < 4; ++i)
+		crowded->addButton("b", nullptr);
+	EXPECT_TRUE(ct::log::contains("at most 3 buttons"));
+	crowded->destroy();
 }
 
 TEST_F(Popup, ButtonThatDestroysItsOwnViewDoesNotCrash)
@@ -99,39 +124,6 @@ TEST_F(Popup, ButtonThatDestroysItsOwnViewDoesNotCrash)
 	ASSERT_TRUE(ScreenHarness::click(screen.findButton("Leave")));
 	screen.pumpUntilIdle();
 	EXPECT_TRUE(aliveBelow.expired());
-}
-
-TEST_F(Popup, AttachingANewPopupClosesTheOldOneAndViewsCloseTheirPopups)
-{
-	auto* view = pushView("v");
-	std::vector<std::string> clicks;
-	WPopup* first = makeTwoButtonPopup(clicks);
-	view->attachPopup(first);
-	auto aliveFirst = first->getWeakPtr();
-	WPopup* second = new WPopup("Second", nullptr);
-	second->setContent([](Evas_Object* parent) {
-		Evas_Object* label = elm_label_add(parent);
-		elm_object_text_set(label, "built content");
-		return label;
-	});
-	view->attachPopup(second);
-	EXPECT_TRUE(aliveFirst.expired());
-	auto aliveSecond = second->getWeakPtr();
-	Evas_Object* content = elm_object_content_get(second->getEvasObj());
-	ASSERT_NE(content, nullptr);
-	EXPECT_STREQ(elm_object_text_get(content), "built content");
-
-	view->popOut();
-	screen.pumpUntilIdle();
-	EXPECT_TRUE(aliveSecond.expired());
-	EXPECT_TRUE(clicks.empty());
-
-	ct::log::clear();
-	auto* crowded = new WPopup();
-	for (int i = 0; i < 4; ++i)
-		crowded->addButton("b", nullptr);
-	EXPECT_TRUE(ct::log::contains("at most 3 buttons"));
-	crowded->destroy();
 }
 
 TEST_F(MenuPopup, MoreKeyOpensTheMenuWithItemsInAppendOrder)

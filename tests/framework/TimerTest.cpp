@@ -30,9 +30,7 @@ using UiTimer = ViewTest;
 TEST_F(UiTimer, CallbacksRepeatWhileTheyReturnTrueThenTheHandleExpires)
 {
 	auto* view = pushView("v");
-	Counter idler, timer, animator;
-	idler.repeatUntil = 3;
-	animator.repeatUntil = 4;
+	Counter idler{0, 3}, timer, animator{0, 4};
 	WUiTimerHandle idlerHandle = WUiTimer::addIdler(countCb, &idler, view);
 	WUiTimerHandle timerHandle = WUiTimer::addTimer(0.05, countCb, &timer, view);
 	WUiTimerHandle animatorHandle = WUiTimer::addAnimator(countCb, &animator, view);
@@ -41,12 +39,10 @@ TEST_F(UiTimer, CallbacksRepeatWhileTheyReturnTrueThenTheHandleExpires)
 	EXPECT_TRUE(screen.pumpUntil([&] {
 		return idlerHandle.expired() && timerHandle.expired() && animatorHandle.expired();
 	}));
-	EXPECT_EQ(idler.fired, 3);
-	EXPECT_EQ(timer.fired, 1);
-	EXPECT_EQ(animator.fired, 4);
+	EXPECT_EQ((std::vector<int>{3, 1, 4}), (std::vector<int>{idler.fired, timer.fired, animator.fired}));
 }
 
-TEST_F(UiTimer, DestroyCancelsAndTimersDieWithTheirOwner)
+TEST_F(UiTimer, DestroyCancelsTimersDieWithTheirOwnerAndNullInputIsRefused)
 {
 	auto* view = pushView("v");
 	Counter cancelled, orphaned, byObject; // none may fire
@@ -62,6 +58,12 @@ TEST_F(UiTimer, DestroyCancelsAndTimersDieWithTheirOwner)
 	EXPECT_TRUE(ownedByObject.expired());
 	screen.pumpFor(0.2);
 	EXPECT_EQ((std::vector<int>{0, 0, 0}), (std::vector<int>{cancelled.fired, orphaned.fired, byObject.fired}));
+
+	ct::log::clear();
+	EXPECT_TRUE(WUiTimer::addTimer(0.01, countCb, &cancelled, static_cast<app_assist::WControl*>(nullptr)).expired());
+	EXPECT_TRUE(ct::log::contains("owner is null"));
+	EXPECT_TRUE(WUiTimer::addIdler(nullptr, nullptr, static_cast<Evas_Object*>(nullptr)).expired());
+	EXPECT_TRUE(ct::log::contains("callback is null"));
 }
 
 TEST_F(UiTimer, CallbackMayDestroyItsOwnerOrItself)
@@ -86,14 +88,4 @@ TEST_F(UiTimer, CallbackMayDestroyItsOwnerOrItself)
 	EXPECT_TRUE(alive.expired());
 	EXPECT_EQ(std::make_pair(1, 1), std::make_pair(fired, selfFired));
 	evas_object_del(holder);
-}
-
-TEST_F(UiTimer, NullCallbackOrOwnerIsRefused)
-{
-	ct::log::clear();
-	Counter counter;
-	EXPECT_TRUE(WUiTimer::addTimer(0.01, countCb, &counter, static_cast<app_assist::WControl*>(nullptr)).expired());
-	EXPECT_TRUE(ct::log::contains("owner is null"));
-	EXPECT_TRUE(WUiTimer::addIdler(nullptr, nullptr, static_cast<Evas_Object*>(nullptr)).expired());
-	EXPECT_TRUE(ct::log::contains("callback is null"));
 }

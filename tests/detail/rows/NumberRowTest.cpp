@@ -32,7 +32,6 @@ TEST_F(NumberRowTest, ShowsTypeAndEscapedNumberWithCallAndMessageButtonsAndACapp
 {
 	CtDetailData* data = personWithNumber("010-2345-6789");
 	Elm_Object_Item* item = numberRow(data);
-	EXPECT_EQ(DETAIL_ITEM_NUMBER, rowOf(item)->getItemType());
 	EXPECT_EQ("detail/2line.bottom", ScreenHarness::itemStyle(item));
 	EXPECT_EQ((std::vector<std::string>{ContactsCommon::translate("IDS_PB_OPT_MOBILE"), "010-2345-6789"}),
 			labelAndValue(item));
@@ -43,7 +42,8 @@ TEST_F(NumberRowTest, ShowsTypeAndEscapedNumberWithCallAndMessageButtonsAndACapp
 		Evas_Object* button = icons ? elm_object_part_content_get(icons, part) : nullptr;
 		EXPECT_TRUE(button && elm_object_content_get(button)) << part;
 	}
-	EXPECT_EQ(ContactsCommon::translate("IDS_PB_HEADER_PHONE_M_CALL"), text(numberRow(data, true), "elm.text.sub.left.top"));
+	EXPECT_EQ(ContactsCommon::translate("IDS_PB_HEADER_PHONE_M_CALL"),
+			text(numberRow(data, true), "elm.text.sub.left.top"));
 	EXPECT_EQ("&lt;b&gt;5550133&lt;/b&gt;",
 			text(numberRow(personWithNumber("<b>5550133</b>")), "elm.text.main.left.bottom"));
 

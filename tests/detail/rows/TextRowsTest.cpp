@@ -63,7 +63,6 @@ TEST_F(TextRowsTest, EmailRowComposesWithAReplyRequestUnlessPowerSavingOrNoEmail
 	contacts_record_h email = nth(data->getEmailList());
 	auto* row = new CtDetailViewEmailItem(data, email, false);
 	Elm_Object_Item* item = show(row);
-	EXPECT_EQ(DETAIL_ITEM_EMAIL, row->getItemType());
 	EXPECT_EQ((Strings{tr("IDS_PB_OPT_HOME_ABB2"), "ari@example.com"}), labelAndValue(item));
 	EXPECT_EQ("ari@example.com", row->getCopyText());
 	EXPECT_FALSE(elm_object_item_disabled_get(item));
@@ -228,11 +227,9 @@ TEST_F(TextRowsTest, RingtoneGroupsAndStatusRowsCannotBeSelectedAndTheRingtoneSh
 {
 	int personId = addSimplePerson("Ari");
 	CtDetailData* data = load(personId);
-	auto* ringtone = new CtDetailViewRingtoneItem(data);
-	Elm_Object_Item* ringtoneItem = show(ringtone);
+	Elm_Object_Item* ringtoneItem = show(new CtDetailViewRingtoneItem(data));
 	Elm_Object_Item* groupsItem = show(new CtDetailViewGroupsItem(data));
 	Elm_Object_Item* statusItem = show(new CtDetailViewStatusItem(data));
-	EXPECT_EQ(DETAIL_ITEM_RINGTONE, ringtone->getItemType());
 	EXPECT_EQ((Strings{tr("IDS_PB_OPT_RINGTONE"), tr("IDS_PB_BODY_DEFAULT")}), labelAndValue(ringtoneItem));
 	EXPECT_EQ((Strings{tr("IDS_PB_BODY_GROUPS"), data->getGroupNames()}), labelAndValue(groupsItem));
 	EXPECT_EQ(tr("IDS_PB_MBODY_STATUS"), text(statusItem, "elm.text.sub.left.top"));

@@ -140,8 +140,16 @@ TEST_F(CtxPopupTest, LongPressHighlightsTheValueAndTheBackKeyRemovesIt)
 	EXPECT_NE((int)(150 * s) + (int)(72 * s) + (int)(20 * s), expectedPosition(items[6]).y);
 }
 
-TEST_F(CtxPopupTest, CopyPutsTheValueOnTheClipboardAndSurvivesClearedRows)
+TEST_F(CtxPopupTest, CopyPutsTheValueOnTheClipboardAndSurvivesClearedRowsAndARowWithoutCopyTextOpensNothing)
 {
+	Elm_Object_Item* ringtone = show(new CtDetailViewRingtoneItem(load(addSimplePerson("Ari"))));
+	ct::log::clear();
+	EXPECT_EQ(nullptr, open(ringtone));
+	EXPECT_EQ(nullptr, m_view->getPopup());
+	EXPECT_TRUE(ct::log::contains("* Critical * no copy text"));
+	EXPECT_EQ(ELM_SCROLLER_MOVEMENT_NO_BLOCK, elm_scroller_movement_block_get(m_view->genlist));
+	EXPECT_FALSE(rowOf(ringtone)->isHighlighted());
+
 	std::vector<Elm_Object_Item*> items = numberRows(2);
 	CtDetailViewCtxPopup* popup = open(items[1]);
 	ASSERT_NE(nullptr, popup);
@@ -185,16 +193,4 @@ TEST_F(CtxPopupTest, PictureRowCopiesThePictureAsAnImage)
 	ASSERT_FALSE(bytes.empty());
 	EXPECT_TRUE(clip.data == bytes);
 	EXPECT_FALSE(readClipboard(ELM_SEL_FORMAT_TEXT).data == path);
-}
-
-TEST_F(CtxPopupTest, NothingOpensForARowWithoutCopyText)
-{
-	CtDetailData* data = load(addSimplePerson("Ari"));
-	Elm_Object_Item* item = show(new CtDetailViewRingtoneItem(data));
-	ct::log::clear();
-	EXPECT_EQ(nullptr, open(item));
-	EXPECT_EQ(nullptr, m_view->getPopup());
-	EXPECT_TRUE(ct::log::contains("* Critical * no copy text"));
-	EXPECT_EQ(ELM_SCROLLER_MOVEMENT_NO_BLOCK, elm_scroller_movement_block_get(m_view->genlist));
-	EXPECT_FALSE(rowOf(item)->isHighlighted());
 }

@@ -112,10 +112,7 @@ protected:
 	{
 		return {text(item, "elm.text.sub.left.top"), text(item, "elm.text.main.left.bottom")};
 	}
-	Evas_Object* content(Elm_Object_Item* item, const char* part)
-	{
-		return elm_object_item_part_content_get(item, part);
-	}
+	Evas_Object* content(Elm_Object_Item* item, const char* part) { return elm_object_item_part_content_get(item, part); }
 	// Sends an edje mouse signal from `touchPart` of an icon layout.
 	void tapIcon(Evas_Object* layout, const char* touchPart, const char* signal = "mouse,clicked,1");
 	// Writes a `w` x `h` PNG of two colour bands and returns its path.

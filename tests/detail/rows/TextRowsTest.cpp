@@ -17,6 +17,7 @@
 #include <Edje.h>
 
 #include <array>
+#include <fstream>
 #include <map>
 
 using namespace ct::test;
@@ -239,10 +240,7 @@ TEST_F(TextRowsTest, RingtoneGroupsAndStatusRowsCannotBeSelectedAndTheRingtoneSh
 	}
 
 	std::string tone = m_dir.path() + "/Over the Horizon.ogg";
-	FILE* f = fopen(tone.c_str(), "w");
-	ASSERT_NE(nullptr, f);
-	fputs("tone", f);
-	fclose(f);
+	std::ofstream(tone) << "tone";
 	CtDetailData(personId).setRingtone(tone.c_str());
 	Elm_Object_Item* item = show(new CtDetailViewRingtoneItem(load(personId)));
 	EXPECT_EQ("Over the Horizon", text(item, "elm.text.main.left.bottom"));

@@ -27,33 +27,6 @@ private:
 	LiveCount m_live;
 };
 
-// A row whose item class deletes it: through the framework's own callback, or
-// by a plain delete as row classes do.
-class DeletingRow : public app_assist::WGenlistItem {
-public:
-	DeletingRow(int* live, bool plainDelete) : m_live(live), m_plainDelete(plainDelete) {}
-	Elm_Genlist_Item_Class* getItemClassStatic() override
-	{
-		static Elm_Genlist_Item_Class framework = itemClass("group_index", deleteRowCb);
-		static Elm_Genlist_Item_Class plain =
-			itemClass("default", [](void* data, Evas_Object*) { delete static_cast<DeletingRow*>(data); });
-		return m_plainDelete ? &plain : &framework;
-	}
-
-private:
-	static Elm_Genlist_Item_Class itemClass(const char* style, Elm_Gen_Item_Del_Cb del)
-	{
-		Elm_Genlist_Item_Class c = {};
-		c.version = ELM_GENLIST_ITEM_CLASS_VERSION;
-		c.item_style = style;
-		c.func.del = del;
-		return c;
-	}
-
-	LiveCount m_live;
-	bool m_plainDelete;
-};
-
 template <class Row>
 Row* append(Evas_Object* genlist, Row* row)
 {
@@ -85,8 +58,8 @@ TEST_F(GenlistItem, RowsAreReadSelectedAndDeletedWithTheirItemsAndTheirView)
 
 	// Rows whose item class deletes them directly are not touched again.
 	int selfLive = 0;
-	for (bool plainDelete : {false, true})
-		append(genlist, new DeletingRow(&selfLive, plainDelete));
+	for (auto deleter : {CountingRow::kClassCallback, CountingRow::kPlainDelete})
+		append(genlist, new CountingRow(0, &selfLive, &selections, deleter));
 	EXPECT_EQ(selfLive, 2);
 	elm_genlist_clear(genlist);
 	EXPECT_EQ(std::make_pair(0, 0), std::make_pair(selfLive, live));

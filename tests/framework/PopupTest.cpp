@@ -98,10 +98,8 @@ TEST_F(Popup, ButtonsAppearInCallOrderAndANewPopupTheBackKeyOrTheViewsEndCloseIt
 
 TEST_F(Popup, ButtonThatDestroysItsOwnViewDoesNotCrash)
 {
-	auto* below = new RecordingView(log, "below");
-	auto* view = new RecordingView(log, "v");
-	screen.push(below);
-	screen.push(view);
+	auto* below = pushView("below");
+	auto* view = pushView("v");
 	auto* popup = new WPopup();
 	popup->setTextTranslatable("contacts");
 	popup->setTitle("IDS_PB_HEADER_DISCARD_CHANGES_ABB");
@@ -128,7 +126,7 @@ TEST_F(Popup, ButtonThatDestroysItsOwnViewDoesNotCrash)
 
 TEST_F(MenuPopup, MoreKeyOpensTheMenuWithItemsInAppendOrder)
 {
-	auto* view = new RecordingView(log, "v");
+	auto* view = pushView("v");
 	std::vector<std::string> chosen;
 	std::weak_ptr<app_assist::WControl> menuAlive;
 	std::function<void()> openMenu = [&] {
@@ -138,12 +136,9 @@ TEST_F(MenuPopup, MoreKeyOpensTheMenuWithItemsInAppendOrder)
 		view->attachPopup(menu);
 		menuAlive = menu->getWeakPtr();
 	};
-	view->onPushedAction = [&](Elm_Object_Item* item) {
-		view->enableMoreButton(item, [](void* data, Evas_Object*, void*) {
-			(*static_cast<std::function<void()>*>(data))();
-		}, &openMenu);
-	};
-	screen.push(view);
+	EXPECT_TRUE(view->enableMoreButton(view->getNaviItem(), [](void* data, Evas_Object*, void*) {
+		(*static_cast<std::function<void()>*>(data))();
+	}, &openMenu));
 	EXPECT_FALSE(view->enableMoreButton(nullptr, nullptr, nullptr));
 
 	screen.sendMoreKey();

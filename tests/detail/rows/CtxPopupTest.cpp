@@ -43,9 +43,8 @@ protected:
 			addNumber(contact, ("555010" + std::to_string(i)).c_str(), CONTACTS_NUMBER_TYPE_CELL);
 		CtDetailData* data = load(storePerson(contact));
 		std::vector<Elm_Object_Item*> items;
-		for (int i = 0; i < count; ++i) {
+		for (int i = 0; i < count; ++i)
 			items.push_back(show(new CtDetailViewNumberItem(data, nth(data->getNumberList(), i), false, false)));
-		}
 		return items;
 	}
 	CtDetailViewCtxPopup* open(Elm_Object_Item* item)

@@ -11,14 +11,11 @@ namespace {
 class NumberRowTest : public RowTest {
 protected:
 	// A person with one cell number.
-	CtDetailData* personWithNumber(const std::string& number, int* personId = nullptr)
+	CtDetailData* personWithNumber(const std::string& number)
 	{
 		contacts_record_h contact = newContact(0, "Mina");
 		addNumber(contact, number.c_str(), CONTACTS_NUMBER_TYPE_CELL);
-		int id = storePerson(contact);
-		if (personId)
-			*personId = id;
-		return load(id);
+		return load(storePerson(contact));
 	}
 	Elm_Object_Item* numberRow(CtDetailData* data, bool sim = false)
 	{
@@ -59,8 +56,7 @@ TEST_F(NumberRowTest, ShowsTypeAndEscapedNumberWithCallAndMessageButtonsAndACapp
 
 TEST_F(NumberRowTest, CallAndMessageLaunchWithTheirUsageAndAMessageTapIsNotAlsoACall)
 {
-	int personId = 0;
-	CtDetailData* data = personWithNumber("+82 10 1111 2222", &personId);
+	CtDetailData* data = personWithNumber("+82 10 1111 2222");
 	int numberId = 0;
 	contacts_record_get_int(nth(data->getNumberList()), _contacts_number.id, &numberId);
 	Elm_Object_Item* item = numberRow(data);
@@ -73,7 +69,7 @@ TEST_F(NumberRowTest, CallAndMessageLaunchWithTheirUsageAndAMessageTapIsNotAlsoA
 	for (const auto& call : launches) {
 		EXPECT_EQ(APP_CONTROL_OPERATION_CALL, call.operation);
 		EXPECT_EQ("tel:+82 10 1111 2222", call.uri);
-		EXPECT_EQ(std::to_string(personId), call.extra("ctindex"));
+		EXPECT_EQ(std::to_string(data->getPersonId()), call.extra("ctindex"));
 		EXPECT_FALSE(call.replyRequested);
 	}
 	auto usage = usageRecords("PH01");

@@ -47,17 +47,6 @@ void RowTest::TearDown()
 	contacts_disconnect();
 }
 
-int RowTest::storePerson(contacts_record_h contact)
-{
-	return personOf(store(contact));
-}
-
-CtDetailData* RowTest::load(int personId)
-{
-	m_data.push_back(std::make_unique<CtDetailData>(personId));
-	return m_data.back().get();
-}
-
 Elm_Object_Item* RowTest::show(CtDetailViewGenlistItem* row)
 {
 	Elm_Object_Item* item = m_view->append(row);

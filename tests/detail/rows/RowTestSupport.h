@@ -94,9 +94,9 @@ protected:
 	void TearDown() override;
 
 	// Stores a contact and returns its person id.
-	int storePerson(contacts_record_h contact);
+	int storePerson(contacts_record_h contact) { return personOf(store(contact)); }
 	// Loads the person's detail data (kept until the test ends).
-	CtDetailData* load(int personId);
+	CtDetailData* load(int personId) { return m_data.emplace_back(std::make_unique<CtDetailData>(personId)).get(); }
 	Elm_Object_Item* show(CtDetailViewGenlistItem* row);
 	static contacts_record_h nth(Eina_List* list, int index = 0)
 	{

@@ -80,9 +80,8 @@ TEST_F(TextRowsTest, EmailRowComposesWithAReplyRequestUnlessPowerSavingOrNoEmail
 	tapIcon(icon, "touch.icon");
 	auto launches = m_launches->launches();
 	ASSERT_EQ(1u, launches.size());
-	EXPECT_EQ(APP_CONTROL_OPERATION_COMPOSE, launches[0].operation);
-	EXPECT_EQ("mailto:ari@example.com", launches[0].uri);
-	EXPECT_EQ("true", launches[0].extra(RETURN_RESULT_DATA_KEY));
+	EXPECT_EQ((Strings{APP_CONTROL_OPERATION_COMPOSE, "mailto:ari@example.com", "true"}),
+			(Strings{launches[0].operation, launches[0].uri, launches[0].extra(RETURN_RESULT_DATA_KEY)}));
 	EXPECT_EQ(APP_CONTROL_LAUNCH_MODE_GROUP, launches[0].launchMode);
 	ASSERT_EQ(1u, usageRecords("CT0E").size());
 	EXPECT_EQ("", usageRecords("CT0E")[0].extra);

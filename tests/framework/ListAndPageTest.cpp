@@ -27,79 +27,48 @@ private:
 	LiveCount m_live;
 };
 
-// A row whose item class deletes it: through the framework's own callback, or
-// by a plain delete as row classes do.
-class DeletingRow : public app_assist::WGenlistItem {
-public:
-	DeletingRow(int* live, bool plainDelete) : m_live(live), m_plainDelete(plainDelete) {}
-	Elm_Genlist_Item_Class* getItemClassStatic() override
-	{
-		static Elm_Genlist_Item_Class framework = itemClass("group_index", deleteRowCb);
-		static Elm_Genlist_Item_Class plain =
-			itemClass("default", [](void* data, Evas_Object*) { delete static_cast<DeletingRow*>(data); });
-		return m_plainDelete ? &plain : &framework;
-	}
-
-private:
-	static Elm_Genlist_Item_Class itemClass(const char* style, Elm_Gen_Item_Del_Cb del)
-	{
-		Elm_Genlist_Item_Class c = {};
-		c.version = ELM_GENLIST_ITEM_CLASS_VERSION;
-		c.item_style = style;
-		c.func.del = del;
-		return c;
-	}
-
-	LiveCount m_live;
-	bool m_plainDelete;
-};
+template <class Row>
+Row* append(Evas_Object* genlist, Row* row)
+{
+	row->setElmObjectItem(elm_genlist_item_append(genlist, row->getItemClass(), row, nullptr, ELM_GENLIST_ITEM_NONE,
+		row->getSelectCb(), nullptr));
+	return row;
+}
 
 } // namespace
 
-TEST(GenlistItem, RowsAreReadSelectedAndDeletedWithTheirItems)
+using GenlistItem = ViewTest;
+
+TEST_F(GenlistItem, RowsAreReadSelectedAndDeletedWithTheirItemsAndTheirView)
 {
-	int live = 0;
-	{
-		ScreenHarness screen;
-		auto* view = new ListView(5, &live);
-		screen.push(view);
-		EXPECT_EQ(live, 5);
-		Evas_Object* genlist = screen.findGenlist();
-		ASSERT_EQ(genlist, view->genlist);
-		auto rows = ScreenHarness::rowsOf<CountingRow>(genlist);
-		ASSERT_EQ(rows.size(), 5u);
-		EXPECT_EQ(rows[2]->index(), 2);
-		auto even = ScreenHarness::rowsWhere<CountingRow>(genlist, [](CountingRow* r) { return r->index() % 2 == 0; });
-		EXPECT_EQ(even.size(), 3u);
-		Elm_Object_Item* third = rows[2]->getElmObjectItem();
-		EXPECT_EQ(ScreenHarness::itemStyle(third), "default");
-		EXPECT_EQ(ScreenHarness::itemText(third, "elm.text"), "Row 2");
-		EXPECT_EQ(ScreenHarness::itemText(third, "elm.text.sub"), "");
+	int live = 0, selections = 0;
+	RecordingView* view = pushView();
+	Evas_Object* genlist = elm_genlist_add(view->layout);
+	for (int i = 0; i < 5; ++i)
+		append(genlist, new CountingRow(i, &live, &selections));
+	auto rows = ScreenHarness::rowsOf<CountingRow>(genlist);
+	ASSERT_EQ(rows.size(), 5u);
+	Elm_Object_Item* third = rows[2]->getElmObjectItem();
+	EXPECT_EQ(ScreenHarness::itemStyle(third) + "/" + ScreenHarness::itemText(third, "elm.text"), "default/Row 2");
+	ScreenHarness::selectItem(third);
+	EXPECT_EQ(selections, 1);
+	EXPECT_FALSE(elm_genlist_item_selected_get(third));
+	elm_object_item_del(third);
+	EXPECT_EQ(live, 4);
 
-		ScreenHarness::selectItem(third);
-		EXPECT_EQ(view->selections, 1);
-		elm_object_item_del(third);
-		EXPECT_EQ(live, 4);
+	// Rows whose item class deletes them directly are not touched again.
+	int selfLive = 0;
+	for (auto deleter : {CountingRow::kClassCallback, CountingRow::kPlainDelete})
+		append(genlist, new CountingRow(0, &selfLive, &selections, deleter));
+	EXPECT_EQ(selfLive, 2);
+	elm_genlist_clear(genlist);
+	EXPECT_EQ(std::make_pair(0, 0), std::make_pair(selfLive, live));
 
-		int selfLive = 0;
-		for (bool plainDelete : {false, true}) {
-			auto* row = new DeletingRow(&selfLive, plainDelete);
-			row->setElmObjectItem(elm_genlist_item_append(genlist, row->getItemClass(), row, nullptr,
-				ELM_GENLIST_ITEM_NONE, row->getSelectCb(), nullptr));
-		}
-		EXPECT_EQ(selfLive, 2);
-		elm_genlist_clear(genlist);
-		EXPECT_EQ(selfLive, 0);
-		EXPECT_EQ(live, 0);
-
-		auto* again = new CountingRow(9, &live);
-		again->setElmObjectItem(elm_genlist_item_append(genlist, again->getItemClass(), again, nullptr,
-			ELM_GENLIST_ITEM_NONE, again->getSelectCb(), nullptr));
-		again->attachToView(view);
-		EXPECT_EQ(again->getAttachedView(), view);
-		view->popOut();
-		screen.pumpUntilIdle();
-	}
+	auto* again = append(genlist, new CountingRow(9, &live, &selections));
+	again->attachToView(view);
+	EXPECT_EQ(again->getAttachedView(), view);
+	view->popOut();
+	screen.pumpUntilIdle();
 	EXPECT_EQ(live, 0);
 }
 
@@ -126,8 +95,7 @@ TEST_F(PageSlideView, PagesHoldViewsThatDieWithIt)
 	slide->setOnInitScroller([&](Evas_Object* scroller) { initScroller = scroller; });
 	ASSERT_TRUE(screen.push(slide));
 	EXPECT_EQ(initScroller, slide->getScroller());
-	EXPECT_EQ(slide->appendPage("one"), 0);
-	EXPECT_EQ(slide->appendPage("two"), 1);
+	EXPECT_EQ((std::vector<int>{0, 1}), (std::vector<int>{slide->appendPage("one"), slide->appendPage("two")}));
 	EXPECT_EQ(slide->getPageCount(), 2);
 
 	auto* first = new RecordingView(log, "p0");

@@ -5,7 +5,6 @@
 #include "WMenuPopup.h"
 #include "WPopup.h"
 #include "WToastPopup.h"
-#include "notification.h"
 
 #include <gtest/gtest.h>
 
@@ -32,11 +31,10 @@ WPopup* makeTwoButtonPopup(std::vector<std::string>& clicks, bool keepOnOk = fal
 using Popup = ViewTest;
 using MenuPopup = ViewTest;
 using ToastPopup = ViewTest;
-using Harness = ViewTest;
 
 } // namespace
 
-TEST_F(Popup, ButtonsAppearInCallOrderAndCloseThePopupAsTheBackKeyDoesBeforeTheView)
+TEST_F(Popup, ButtonsAppearInCallOrderAndANewPopupTheBackKeyOrTheViewsEndCloseIt)
 {
 	auto* view = pushView("v");
 	std::vector<std::string> clicks;
@@ -46,10 +44,10 @@ TEST_F(Popup, ButtonsAppearInCallOrderAndCloseThePopupAsTheBackKeyDoesBeforeTheV
 	auto alive = popup->getWeakPtr();
 	EXPECT_EQ(view->getPopup(), popup);
 	Evas_Object* obj = popup->getEvasObj();
-	EXPECT_EQ(ScreenHarness::buttonLabel(elm_object_part_content_get(obj, "button1")), "Cancel");
-	EXPECT_EQ(ScreenHarness::buttonLabel(elm_object_part_content_get(obj, "button2")), "OK");
-	EXPECT_STREQ(elm_object_part_text_get(obj, "title,text"), "Title");
-
+	EXPECT_EQ((std::vector<std::string> { "Title", "Cancel", "OK" }),
+		(std::vector<std::string> { elm_object_part_text_get(obj, "title,text"),
+			ScreenHarness::buttonLabel(elm_object_part_content_get(obj, "button1")),
+			ScreenHarness::buttonLabel(elm_object_part_content_get(obj, "button2")) }));
 	ASSERT_TRUE(ScreenHarness::click(screen.findButton("OK")));
 	EXPECT_FALSE(alive.expired()); // the callback kept it open
 	ASSERT_TRUE(ScreenHarness::click(screen.findButton("Cancel")));
@@ -59,26 +57,49 @@ TEST_F(Popup, ButtonsAppearInCallOrderAndCloseThePopupAsTheBackKeyDoesBeforeTheV
 	EXPECT_EQ(view->getPopup(), nullptr);
 	EXPECT_EQ(screen.findButton("OK"), nullptr);
 
-	popup = makeTwoButtonPopup(clicks);
+	WPopup* first = makeTwoButtonPopup(clicks);
+	view->attachPopup(first);
+	auto aliveFirst = first->getWeakPtr();
+	popup = new WPopup("Second", nullptr);
+	popup->setContent([](Evas_Object* parent) {
+		Evas_Object* label = elm_label_add(parent);
+		elm_object_text_set(label, "built content");
+		return label;
+	});
 	int backs = 0;
 	popup->setOnBack([&backs](bool*) { ++backs; });
 	view->attachPopup(popup);
+	EXPECT_TRUE(aliveFirst.expired());
+	Evas_Object* content = elm_object_content_get(popup->getEvasObj());
+	ASSERT_NE(content, nullptr);
+	EXPECT_STREQ(elm_object_text_get(content), "built content");
 	alive = popup->getWeakPtr();
 	auto aliveView = view->getWeakPtr();
 	screen.sendBackKey();
 	EXPECT_EQ(backs, 1);
 	EXPECT_TRUE(alive.expired());
 	EXPECT_FALSE(aliveView.expired());
-	screen.sendBackKey();
+
+	view->attachPopup(popup = makeTwoButtonPopup(clicks));
+	alive = popup->getWeakPtr();
+	view->popOut();
+	screen.pumpUntilIdle();
+	EXPECT_TRUE(alive.expired());
 	EXPECT_TRUE(aliveView.expired());
+	EXPECT_EQ(clicks.size(), 2u);
+
+	ct::log::clear();
+	auto* crowded = new WPopup();
+	for (int i = 0; i < 4; ++i)
+		crowded->addButton("b", nullptr);
+	EXPECT_TRUE(ct::log::contains("at most 3 buttons"));
+	crowded->destroy();
 }
 
 TEST_F(Popup, ButtonThatDestroysItsOwnViewDoesNotCrash)
 {
-	auto* below = new RecordingView(log, "below");
-	auto* view = new RecordingView(log, "v");
-	screen.push(below);
-	screen.push(view);
+	auto* below = pushView("below");
+	auto* view = pushView("v");
 	auto* popup = new WPopup();
 	popup->setTextTranslatable("contacts");
 	popup->setTitle("IDS_PB_HEADER_DISCARD_CHANGES_ABB");
@@ -103,42 +124,9 @@ TEST_F(Popup, ButtonThatDestroysItsOwnViewDoesNotCrash)
 	EXPECT_TRUE(aliveBelow.expired());
 }
 
-TEST_F(Popup, AttachingANewPopupClosesTheOldOneAndViewsCloseTheirPopups)
-{
-	auto* view = pushView("v");
-	std::vector<std::string> clicks;
-	WPopup* first = makeTwoButtonPopup(clicks);
-	view->attachPopup(first);
-	auto aliveFirst = first->getWeakPtr();
-	WPopup* second = new WPopup("Second", nullptr);
-	second->setContent([](Evas_Object* parent) {
-		Evas_Object* label = elm_label_add(parent);
-		elm_object_text_set(label, "built content");
-		return label;
-	});
-	view->attachPopup(second);
-	EXPECT_TRUE(aliveFirst.expired());
-	auto aliveSecond = second->getWeakPtr();
-	Evas_Object* content = elm_object_content_get(second->getEvasObj());
-	ASSERT_NE(content, nullptr);
-	EXPECT_STREQ(elm_object_text_get(content), "built content");
-
-	view->popOut();
-	screen.pumpUntilIdle();
-	EXPECT_TRUE(aliveSecond.expired());
-	EXPECT_TRUE(clicks.empty());
-
-	ct::log::clear();
-	auto* crowded = new WPopup();
-	for (int i = 0; i < 4; ++i)
-		crowded->addButton("b", nullptr);
-	EXPECT_TRUE(ct::log::contains("at most 3 buttons"));
-	crowded->destroy();
-}
-
 TEST_F(MenuPopup, MoreKeyOpensTheMenuWithItemsInAppendOrder)
 {
-	auto* view = new RecordingView(log, "v");
+	auto* view = pushView("v");
 	std::vector<std::string> chosen;
 	std::weak_ptr<app_assist::WControl> menuAlive;
 	std::function<void()> openMenu = [&] {
@@ -148,12 +136,9 @@ TEST_F(MenuPopup, MoreKeyOpensTheMenuWithItemsInAppendOrder)
 		view->attachPopup(menu);
 		menuAlive = menu->getWeakPtr();
 	};
-	view->onPushedAction = [&](Elm_Object_Item* item) {
-		view->enableMoreButton(item, [](void* data, Evas_Object*, void*) {
-			(*static_cast<std::function<void()>*>(data))();
-		}, &openMenu);
-	};
-	screen.push(view);
+	EXPECT_TRUE(view->enableMoreButton(view->getNaviItem(), [](void* data, Evas_Object*, void*) {
+		(*static_cast<std::function<void()>*>(data))();
+	}, &openMenu));
 	EXPECT_FALSE(view->enableMoreButton(nullptr, nullptr, nullptr));
 
 	screen.sendMoreKey();
@@ -184,13 +169,4 @@ TEST_F(ToastPopup, ClosesItselfAfterItsTimeout)
 	auto alive = toast->getWeakPtr();
 	EXPECT_STREQ(elm_object_text_get(toast->getEvasObj()), "Saved");
 	EXPECT_TRUE(screen.pumpUntil([&] { return alive.expired(); }));
-}
-
-TEST_F(Harness, ReadsPostedNotices)
-{
-	ScreenHarness::clearNotices();
-	EXPECT_EQ(notification_status_message_post("Saved"), 0);
-	EXPECT_EQ(ScreenHarness::notices(), (std::vector<std::string> { "Saved" }));
-	ScreenHarness::clearNotices();
-	EXPECT_TRUE(ScreenHarness::notices().empty());
 }

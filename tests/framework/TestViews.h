@@ -29,7 +29,6 @@ public:
 
 	bool allowPop = true;
 	std::function<void()> onPopAction;
-	std::function<void(Elm_Object_Item*)> onPushedAction;
 	int becameTop = 0;
 	Evas_Object* layout = nullptr;
 
@@ -43,12 +42,7 @@ protected:
 		return layout;
 	}
 	void onCreated() override { m_log.push_back(m_tag + ":onCreated"); }
-	void onPushed(Elm_Object_Item* item) override
-	{
-		m_log.push_back(m_tag + ":onPushed");
-		if (onPushedAction)
-			onPushedAction(item);
-	}
+	void onPushed(Elm_Object_Item*) override { m_log.push_back(m_tag + ":onPushed"); }
 	bool onPop() override
 	{
 		m_log.push_back(m_tag + ":onPop");
@@ -76,78 +70,49 @@ private:
 	int* m_live;
 };
 
-// A one-line row that counts live rows and selections.
+// A one-line row that counts live rows and selections. Its item class leaves
+// the delete to the framework, or deletes the row itself: through the
+// framework's callback, or by a plain delete as row classes do.
 class CountingRow : public app_assist::WGenlistItem {
 public:
-	explicit CountingRow(int index, int* liveRows, int* selections = nullptr)
-		: m_index(index)
-		, m_live(liveRows)
-		, m_selections(selections)
+	enum Deleter { kFramework, kClassCallback, kPlainDelete };
+	CountingRow(int index, int* liveRows, int* selections, Deleter deleter = kFramework)
+		: m_index(index), m_live(liveRows), m_selections(selections), m_deleter(deleter)
 	{
 	}
 
 	Elm_Genlist_Item_Class* getItemClassStatic() override
 	{
-		static Elm_Genlist_Item_Class itc = [] {
-			Elm_Genlist_Item_Class c = {};
-			c.version = ELM_GENLIST_ITEM_CLASS_VERSION;
-			c.item_style = "default";
-			c.func.text_get = __textCb;
-			return c;
-		}();
-		return &itc;
+		static Elm_Genlist_Item_Class classes[] = {itemClass(nullptr), itemClass(deleteRowCb),
+			itemClass([](void* data, Evas_Object*) { delete static_cast<CountingRow*>(data); })};
+		return &classes[m_deleter];
 	}
 	void onSelect(Elm_Object_Item* item) override
 	{
 		elm_genlist_item_selected_set(item, EINA_FALSE);
-		if (m_selections)
-			++*m_selections;
+		++*m_selections;
 	}
-	int index() const { return m_index; }
 
 private:
+	static Elm_Genlist_Item_Class itemClass(Elm_Gen_Item_Del_Cb del)
+	{
+		Elm_Genlist_Item_Class c = {};
+		c.version = ELM_GENLIST_ITEM_CLASS_VERSION;
+		c.item_style = "default";
+		c.func.text_get = __textCb;
+		c.func.del = del;
+		return c;
+	}
 	static char* __textCb(void* data, Evas_Object*, const char* part)
 	{
-		auto* row = static_cast<CountingRow*>(data);
-		if (strcmp(part, "elm.text") != 0)
-			return nullptr;
-		return strdup(("Row " + std::to_string(row->m_index)).c_str());
+		int index = static_cast<CountingRow*>(data)->m_index;
+		return strcmp(part, "elm.text") ? nullptr : strdup(("Row " + std::to_string(index)).c_str());
 	}
 
 	int m_index;
 	LiveCount m_live;
 	int* m_selections;
-};
-
-// A view whose root is a genlist of `rows` CountingRows.
-class ListView : public app_assist::WView {
-public:
-	ListView(int rows, int* liveRows)
-		: m_rows(rows)
-		, m_liveRows(liveRows)
-	{
-		setTitle("List");
-	}
-	Evas_Object* genlist = nullptr;
-	int selections = 0;
-
-protected:
-	Evas_Object* onCreate(Evas_Object* parent, void*) override
-	{
-		genlist = elm_genlist_add(parent);
-		elm_genlist_mode_set(genlist, ELM_LIST_COMPRESS);
-		elm_genlist_homogeneous_set(genlist, EINA_TRUE);
-		for (int i = 0; i < m_rows; ++i) {
-			auto* row = new CountingRow(i, m_liveRows, &selections);
-			row->setElmObjectItem(elm_genlist_item_append(genlist, row->getItemClass(), row, nullptr,
-				ELM_GENLIST_ITEM_NONE, row->getSelectCb(), nullptr));
-		}
-		return genlist;
-	}
-
-private:
-	int m_rows;
-	int* m_liveRows;
+	Deleter m_deleter;
 };
 
 // A screen per test, with a helper to push a recording view onto it.

@@ -23,8 +23,6 @@ TEST(ViewTeardown, PushThenBackRunsEveryStepInOrderAndClosingTheScreenEndsTheRes
 		EXPECT_EQ(WView_getInstanceFromEvasObj(view->getEvasObj()), view);
 		EXPECT_EQ(WView_getWindowEvasObj(view), screen.win());
 		EXPECT_EQ(WView_getWindowBaseLayoutEvasObj(view), screen.window().getBaseLayoutEvasObj());
-		EXPECT_EQ(view->getNaviframe(), screen.naviframe());
-		EXPECT_NE(view->getNaviItem(), nullptr);
 		view->setTitle("Details");
 		EXPECT_EQ(ScreenHarness::naviText(view), "Details");
 
@@ -40,67 +38,29 @@ TEST(ViewTeardown, PushThenBackRunsEveryStepInOrderAndClosingTheScreenEndsTheRes
 		"b:onDestroy", "b:destructor" }));
 }
 
-TEST_F(ViewLifecycle, RefusedPopKeepsTheViewUntilAllowed)
+TEST_F(ViewLifecycle, NestedViewsPopTopFirstByBackKeyTitleButtonOrDestroyAndEndOnce)
 {
-	auto* view = new RecordingView(log, "a");
-	view->allowPop = false;
-	ASSERT_TRUE(screen.push(view));
-	auto alive = view->getWeakPtr();
-
-	screen.sendBackKey();
-	EXPECT_FALSE(alive.expired());
-	EXPECT_EQ(screen.viewCount(), 1);
-	view->popOut();
-	screen.pumpUntilIdle();
-	EXPECT_FALSE(alive.expired());
-
-	view->allowPop = true;
-	view->popOut();
-	screen.pumpUntilIdle();
-	EXPECT_TRUE(alive.expired());
-	EXPECT_EQ(std::count(log.begin(), log.end(), "a:onPop"), 3);
-}
-
-TEST_F(ViewLifecycle, NestedPushesPopTopFirstAndTitleBackButtonPops)
-{
-	auto* a = new RecordingView(log, "a");
-	auto* b = new RecordingView(log, "b");
-	auto* c = new RecordingView(log, "c");
-	ASSERT_TRUE(screen.push(a));
-	ASSERT_TRUE(screen.push(b));
-	ASSERT_TRUE(screen.push(c));
+	auto* a = pushView("a");
+	auto* b = pushView("b");
+	auto* c = pushView("c");
 	EXPECT_EQ(screen.viewCount(), 3);
+	auto aliveA = a->getWeakPtr();
 	auto aliveB = b->getWeakPtr();
-	auto aliveC = c->getWeakPtr();
+	c->onPopAction = [c] { c->destroy(); c->destroy(); };
 
 	screen.sendBackKey();
-	EXPECT_TRUE(aliveC.expired());
+	EXPECT_EQ(std::count(log.begin(), log.end(), "c:destructor"), 1);
 	EXPECT_EQ(screen.topView(), b);
 	EXPECT_GE(b->becameTop, 1);
 
 	Evas_Object* prev = elm_object_item_part_content_get(b->getNaviItem(), "prev_btn");
-	ASSERT_NE(prev, nullptr);
 	EXPECT_TRUE(ScreenHarness::click(prev));
 	screen.pumpUntilIdle();
 	EXPECT_TRUE(aliveB.expired());
 	EXPECT_EQ(screen.topView(), a);
 	EXPECT_LT(std::find(log.begin(), log.end(), "c:destructor"), std::find(log.begin(), log.end(), "b:destructor"));
-}
-
-TEST_F(ViewLifecycle, ViewsDestroyedInOnPopOrTwiceEndOnce)
-{
-	auto* a = new RecordingView(log, "a");
-	auto* b = new RecordingView(log, "b");
-	screen.push(a);
-	screen.push(b);
-	b->onPopAction = [b] { b->destroy(); b->destroy(); };
-	auto aliveB = b->getWeakPtr();
-	screen.sendBackKey();
-	EXPECT_TRUE(aliveB.expired());
-	EXPECT_EQ(std::count(log.begin(), log.end(), "b:destructor"), 1);
 
 	// Destroying directly removes the view from the naviframe at once.
-	auto aliveA = a->getWeakPtr();
 	a->destroy();
 	EXPECT_TRUE(aliveA.expired());
 	EXPECT_EQ(screen.viewCount(), 0);
@@ -135,19 +95,29 @@ TEST_F(ViewLifecycle, BadInputIsRefusedAndLogged)
 	EXPECT_EQ(WView_getWindowEvasObj(nullptr), nullptr);
 }
 
-TEST_F(ViewLifecycle, LastViewBackHandlerDecides)
+TEST_F(ViewLifecycle, BackIsRefusedByOnPopOrByTheLastViewHandler)
 {
+	auto* view = new RecordingView(log, "a");
+	view->allowPop = false;
+	ASSERT_TRUE(screen.push(view));
+	auto alive = view->getWeakPtr();
+	screen.sendBackKey();
+	view->popOut();
+	screen.pumpUntilIdle();
+	EXPECT_FALSE(alive.expired());
+	EXPECT_EQ(std::count(log.begin(), log.end(), "a:onPop"), 2);
+
 	int asked = 0;
 	bool letGo = false;
 	screen.naviframe()->setOnLastViewBack([&](bool* popOut) {
 		++asked;
 		*popOut = letGo;
 	});
-	screen.push(new RecordingView(log, "a"));
+	view->allowPop = true;
 	screen.sendBackKey();
 	EXPECT_EQ(asked, 1);
-	EXPECT_EQ(screen.viewCount(), 1);
+	EXPECT_FALSE(alive.expired());
 	letGo = true;
 	screen.sendBackKey();
-	EXPECT_EQ(screen.viewCount(), 0);
+	EXPECT_TRUE(alive.expired());
 }

@@ -8,32 +8,28 @@
 namespace ct::test {
 namespace {
 
-std::string withStandIn()
-{
-	return "CONTACTS_LOG_LEVEL=info CONTACTS_DETAILS_LIBRARY=" + shellQuoted(standInDetailsLibrary());
-}
-
-TEST(DemoDetailLibraryTest, DetailScreenComesFromTheLoadedLibraryAndItsRequestsReachTheDemoHandlers)
+TEST(DemoDetailLibraryTest, DetailScreensComeFromTheLoadedLibraryAndItsRequestsReachTheDemoHandlers)
 {
 	TempDataDir data;
+	std::string library = hostBuildFile("libcontacts-demo-stand-in-details.so");
+	std::string standIn = "CONTACTS_LOG_LEVEL=info CONTACTS_DETAILS_LIBRARY=" + shellQuoted(library);
 	std::string shot = data.file("person.png");
-	DemoRun run = runDemo(data.path(), "--person 2 --screenshot " + shellQuoted(shot), withStandIn());
+	DemoRun run = runDemo(data.path(), "--person 2 --screenshot " + shellQuoted(shot), standIn);
 	ASSERT_EQ(0, run.exitCode) << run.output;
-	EXPECT_GT(std::filesystem::file_size(shot), 1000u);
+	EXPECT_TRUE(isPng(shot));
 	EXPECT_EQ(std::string::npos, run.output.find("no detail screen")) << run.output;
 	// The stand-in's call request was answered by the demo's phone.
 	EXPECT_NE(std::string::npos, run.output.find("demo handler: Call: tel:+person2")) << run.output;
 	// Factories the library lacks are named, not fatal.
 	EXPECT_NE(std::string::npos, run.output.find("createCtInputView is not exported")) << run.output;
 	EXPECT_EQ(std::string::npos, run.output.find("createCtDetailView is not exported")) << run.output;
-}
 
-TEST(DemoDetailLibraryTest, ScreenshotsIncludeTheDetailScreensOfChosenPersons)
-{
-	TempDataDir data;
+	// The screenshot series: the list, then the detail screens of chosen persons.
 	std::string dir = data.file("shots");
-	DemoRun run = runDemo(data.path(), "--screenshots " + shellQuoted(dir), withStandIn());
+	run = runDemo(data.path(), "--screenshots " + shellQuoted(dir), standIn);
 	ASSERT_EQ(0, run.exitCode) << run.output;
+	EXPECT_NE(std::string::npos, run.output.find(dir + "/01-person-list.png")) << run.output;
+	EXPECT_TRUE(isPng(dir + "/01-person-list.png"));
 	int detailShots = 0;
 	for (const auto& entry : std::filesystem::directory_iterator(dir)) {
 		std::string name = entry.path().filename().string();

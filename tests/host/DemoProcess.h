@@ -4,6 +4,8 @@
 
 #include <cstdio>
 #include <cstdlib>
+#include <filesystem>
+#include <fstream>
 #include <string>
 #include <sys/wait.h>
 
@@ -14,10 +16,11 @@ struct DemoRun {
 	std::string output;   // stdout and stderr together
 };
 
-inline std::string demoBinary()
+// A file the build put in its host folder.
+inline std::string hostBuildFile(const char* name)
 {
 	const char* dir = getenv("CONTACTS_TEST_BIN_DIR");
-	return std::string(dir ? dir : ".") + "/host/contacts-demo";
+	return std::string(dir ? dir : ".") + "/host/" + name;
 }
 
 // Quotes an argument for the shell.
@@ -29,17 +32,11 @@ inline std::string shellQuoted(const std::string& arg)
 	return out + "'";
 }
 
-inline std::string standInDetailsLibrary()
-{
-	const char* dir = getenv("CONTACTS_TEST_BIN_DIR");
-	return std::string(dir ? dir : ".") + "/host/libcontacts-demo-stand-in-details.so";
-}
-
 // `env` is put before the command as is ("NAME=value ...").
 inline DemoRun runDemo(const std::string& dataDir, const std::string& args, const std::string& env = "")
 {
 	std::string command = env + " CONTACTS_DATA_DIR=" + shellQuoted(dataDir) + " ELM_ENGINE=buffer " +
-		shellQuoted(demoBinary()) + " " + args + " 2>&1";
+		shellQuoted(hostBuildFile("contacts-demo")) + " " + args + " 2>&1";
 	DemoRun run;
 	FILE* pipe = popen(command.c_str(), "r");
 	if (!pipe)
@@ -51,6 +48,15 @@ inline DemoRun runDemo(const std::string& dataDir, const std::string& args, cons
 	int status = pclose(pipe);
 	run.exitCode = WIFEXITED(status) ? WEXITSTATUS(status) : -1;
 	return run;
+}
+
+// A PNG file of a real picture (more than a few bytes).
+inline bool isPng(const std::string& path)
+{
+	std::ifstream in(path, std::ios::binary);
+	char signature[8] = {};
+	in.read(signature, sizeof(signature));
+	return in && std::string(signature + 1, 3) == "PNG" && std::filesystem::file_size(path) > 1000;
 }
 
 } // namespace ct::test

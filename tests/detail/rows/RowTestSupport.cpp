@@ -5,9 +5,10 @@
 
 namespace ct::test {
 
-bool writePicture(Evas* evas, const std::string& path, int w, int h, unsigned int top, unsigned int bottom)
+std::string RowTest::picture(const char* name, int w, int h, unsigned int top, unsigned int bottom)
 {
-	Evas_Object* image = evas_object_image_filled_add(evas);
+	std::string path = m_dir.path() + "/" + name;
+	Evas_Object* image = evas_object_image_filled_add(evas_object_evas_get(m_screen->win()));
 	evas_object_image_colorspace_set(image, EVAS_COLORSPACE_ARGB8888);
 	evas_object_image_size_set(image, w, h);
 	auto* pixels = static_cast<unsigned int*>(evas_object_image_data_get(image, EINA_TRUE));
@@ -15,9 +16,9 @@ bool writePicture(Evas* evas, const std::string& path, int w, int h, unsigned in
 		for (int x = 0; x < w; ++x)
 			pixels[y * w + x] = y < h / 2 ? top : bottom;
 	evas_object_image_data_set(image, pixels);
-	bool saved = evas_object_image_save(image, path.c_str(), nullptr, nullptr);
+	EXPECT_TRUE(evas_object_image_save(image, path.c_str(), nullptr, nullptr));
 	evas_object_del(image);
-	return saved;
+	return path;
 }
 
 std::vector<usagelog::Record> usageRecords(const std::string& feature)
@@ -32,7 +33,7 @@ std::vector<usagelog::Record> usageRecords(const std::string& feature)
 void RowTest::SetUp()
 {
 	ASSERT_EQ(CONTACTS_ERROR_NONE, contacts_connect());
-	m_screen = std::make_unique<ScreenHarness>(ScreenHarness::kWidth, m_screenHeight);
+	m_screen = std::make_unique<ScreenHarness>();
 	m_view = new RowHostView();
 	ASSERT_TRUE(m_screen->push(m_view));
 	m_launches = new LaunchRecorder();
@@ -44,17 +45,6 @@ void RowTest::TearDown()
 	m_screen.reset();
 	m_data.clear();
 	contacts_disconnect();
-}
-
-int RowTest::storePerson(contacts_record_h contact)
-{
-	return personOf(store(contact));
-}
-
-CtDetailData* RowTest::load(int personId)
-{
-	m_data.push_back(std::make_unique<CtDetailData>(personId));
-	return m_data.back().get();
 }
 
 Elm_Object_Item* RowTest::show(CtDetailViewGenlistItem* row)
@@ -69,13 +59,6 @@ void RowTest::tapIcon(Evas_Object* layout, const char* touchPart, const char* si
 	ASSERT_NE(nullptr, layout);
 	elm_layout_signal_emit(layout, signal, touchPart);
 	edje_object_message_signal_process(elm_layout_edje_get(layout));
-}
-
-std::string RowTest::picture(const char* name, int w, int h, unsigned int top, unsigned int bottom)
-{
-	std::string path = m_dir.path() + "/" + name;
-	EXPECT_TRUE(writePicture(evas_object_evas_get(m_screen->win()), path, w, h, top, bottom));
-	return path;
 }
 
 } // namespace ct::test

@@ -84,9 +84,6 @@ private:
 	std::vector<appcontrol::Registration> m_registrations;
 };
 
-// Writes a `w` x `h` PNG of two colour bands (for picture rows).
-bool writePicture(Evas* evas, const std::string& path, int w, int h, unsigned int top, unsigned int bottom);
-
 // Usage-log records with `feature`.
 std::vector<usagelog::Record> usageRecords(const std::string& feature);
 
@@ -97,20 +94,30 @@ protected:
 	void TearDown() override;
 
 	// Stores a contact and returns its person id.
-	int storePerson(contacts_record_h contact);
+	int storePerson(contacts_record_h contact) { return personOf(store(contact)); }
 	// Loads the person's detail data (kept until the test ends).
-	CtDetailData* load(int personId);
+	CtDetailData* load(int personId) { return m_data.emplace_back(std::make_unique<CtDetailData>(personId)).get(); }
 	Elm_Object_Item* show(CtDetailViewGenlistItem* row);
-	std::string text(Elm_Object_Item* item, const char* part) { return ScreenHarness::itemText(item, part); }
-	Evas_Object* content(Elm_Object_Item* item, const char* part)
+	static contacts_record_h nth(Eina_List* list, int index = 0)
 	{
-		return elm_object_item_part_content_get(item, part);
+		return static_cast<contacts_record_h>(eina_list_nth(list, index));
 	}
+	static CtDetailViewGenlistItem* rowOf(Elm_Object_Item* item)
+	{
+		return static_cast<CtDetailViewGenlistItem*>(elm_object_item_data_get(item));
+	}
+	std::string text(Elm_Object_Item* item, const char* part) { return ScreenHarness::itemText(item, part); }
+	// The texts of the usual two-line row: the label above, the value below.
+	std::vector<std::string> labelAndValue(Elm_Object_Item* item)
+	{
+		return {text(item, "elm.text.sub.left.top"), text(item, "elm.text.main.left.bottom")};
+	}
+	Evas_Object* content(Elm_Object_Item* item, const char* part) { return elm_object_item_part_content_get(item, part); }
 	// Sends an edje mouse signal from `touchPart` of an icon layout.
 	void tapIcon(Evas_Object* layout, const char* touchPart, const char* signal = "mouse,clicked,1");
+	// Writes a `w` x `h` PNG of two colour bands and returns its path.
 	std::string picture(const char* name, int w, int h, unsigned int top, unsigned int bottom);
 
-	int m_screenHeight = ScreenHarness::kHeight;
 	TempDataDir m_dir;
 	std::unique_ptr<ScreenHarness> m_screen;
 	RowHostView* m_view = nullptr;

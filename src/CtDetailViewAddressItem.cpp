@@ -14,8 +14,9 @@ const int kAddressBytes = 1024;
 
 CtDetailViewAddressItem::CtDetailViewAddressItem(CtDetailViewItemOwner* owner, CtDetailDataBase* data,
 		contacts_record_h record, bool powerSaving)
-	: CtDetailViewGenlistItem(data), m_owner(owner), m_record(record), m_powerSaving(powerSaving)
+	: CtDetailViewGenlistItem(data), m_owner(owner), m_record(record)
 {
+	m_powerSaving = powerSaving;
 }
 
 std::string CtDetailViewAddressItem::getCopyText()

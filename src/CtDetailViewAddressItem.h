@@ -19,11 +19,6 @@ public: // CtDetailViewGenlistItem
 	// The full address.
 	std::string getCopyText() override;
 	int getItemType() override { return DETAIL_ITEM_ADDRESS; }
-	void setPowerSaving(bool on) override
-	{
-		m_powerSaving = on;
-		invalidateContent();
-	}
 	void onSelect(Elm_Object_Item* item) override;
 	void onSetElmObjectItem(Elm_Object_Item* item) override;
 
@@ -36,7 +31,6 @@ protected:
 private:
 	CtDetailViewItemOwner* m_owner;
 	contacts_record_h m_record;
-	bool m_powerSaving;
 };
 
 #endif

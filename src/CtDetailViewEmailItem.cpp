@@ -11,9 +11,10 @@
 #include <cstring>
 
 CtDetailViewEmailItem::CtDetailViewEmailItem(CtDetailDataBase* data, contacts_record_h record, bool powerSaving)
-	: CtDetailViewGenlistItem(data), m_record(record), m_powerSaving(powerSaving),
+	: CtDetailViewGenlistItem(data), m_record(record),
 	  m_emailAppEnabled(ctCommoncheckEmailAppEnable())
 {
+	m_powerSaving = powerSaving;
 }
 
 std::string CtDetailViewEmailItem::getCopyText()

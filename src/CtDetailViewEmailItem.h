@@ -16,11 +16,6 @@ public:
 public: // CtDetailViewGenlistItem
 	std::string getCopyText() override;
 	int getItemType() override { return DETAIL_ITEM_EMAIL; }
-	void setPowerSaving(bool on) override
-	{
-		m_powerSaving = on;
-		invalidateContent();
-	}
 	void onSelect(Elm_Object_Item* item) override;
 	void onSetElmObjectItem(Elm_Object_Item* item) override;
 
@@ -32,7 +27,6 @@ protected:
 
 private:
 	contacts_record_h m_record;
-	bool m_powerSaving;
 	bool m_emailAppEnabled;
 };
 

@@ -67,10 +67,6 @@ int CtDetailViewGenlistItem::getItemType()
 	return DETAIL_ITEM_NONE;
 }
 
-void CtDetailViewGenlistItem::setPowerSaving(bool)
-{
-}
-
 std::string CtDetailViewGenlistItem::getIconColorCode()
 {
 	CtSimMgr* sim = CtSimMgr::getInstance();

@@ -41,9 +41,14 @@ public:
 	// The text the copy popup copies; empty when the row has nothing to copy.
 	virtual std::string getCopyText();
 	virtual int getItemType();
-	// Rows that depend on power saving (video call, e-mail, address) take the
-	// new state; the caller updates the item.
-	virtual void setPowerSaving(bool on);
+	// Power saving turns off the actions of the video-call, e-mail and
+	// address rows; the caller updates the item.
+	void setPowerSaving(bool on)
+	{
+		m_powerSaving = on;
+		invalidateContent();
+	}
+	bool isPowerSaving() const { return m_powerSaving; }
 
 	// Contents made so far are not reused when the item is realized or its
 	// parts updated again; call it when what the contents show has changed.
@@ -86,6 +91,7 @@ protected:
 	static void insertUsageLog(const char* feature, const char* extra);
 
 	bool highlighted = false;
+	bool m_powerSaving = false;
 
 private:
 	static char* __textGetCb(void* data, Evas_Object* obj, const char* part);

@@ -7,8 +7,9 @@
 
 CtDetailViewVideoCallItem::CtDetailViewVideoCallItem(CtDetailViewItemOwner* owner, CtDetailDataBase* data,
 		bool powerSaving)
-	: CtDetailViewGenlistItem(data), m_owner(owner), m_powerSaving(powerSaving)
+	: CtDetailViewGenlistItem(data), m_owner(owner)
 {
+	m_powerSaving = powerSaving;
 }
 
 std::string CtDetailViewVideoCallItem::getText(const char* part)

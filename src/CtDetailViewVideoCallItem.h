@@ -14,11 +14,6 @@ public:
 
 public: // CtDetailViewGenlistItem
 	int getItemType() override { return DETAIL_ITEM_VIDEO_CALL; }
-	void setPowerSaving(bool on) override
-	{
-		m_powerSaving = on;
-		invalidateContent();
-	}
 	void onSelect(Elm_Object_Item* item) override;
 	void onSetElmObjectItem(Elm_Object_Item* item) override;
 
@@ -30,7 +25,6 @@ protected:
 
 private:
 	CtDetailViewItemOwner* m_owner;
-	bool m_powerSaving;
 };
 
 #endif

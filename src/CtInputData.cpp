@@ -630,6 +630,18 @@ contacts_record_h CtInputData::__addChild(unsigned int property, const char* chi
 	return child;
 }
 
+contacts_record_h CtInputData::__addTextChild(unsigned int property, const char* childUri, unsigned int textProperty,
+		const char* text, unsigned int typeProperty, int type)
+{
+	contacts_record_h child = __addChild(property, childUri);
+	if (!child)
+		return nullptr;
+	if (typeProperty)
+		contacts_record_set_int(child, typeProperty, type);
+	setTextIfGiven(child, textProperty, text);
+	return child;
+}
+
 int CtInputData::__removeChild(unsigned int property, contacts_record_h child)
 {
 	WPRET_VM(!child || !m_contactRecord, CONTACTS_ERROR_INVALID_PARAMETER, "Invalid param : record");
@@ -841,12 +853,7 @@ Eina_List* CtInputData::getNumberList() { return childList(m_contactRecord, _con
 contacts_record_h CtInputData::addNumber(const char* number)
 {
 	int type = getNextNumberType();
-	contacts_record_h child = __addChild(_contacts_contact.number, _contacts_number._uri);
-	if (child) {
-		contacts_record_set_int(child, _contacts_number.type, type);
-		setTextIfGiven(child, _contacts_number.number, number);
-	}
-	return child;
+	return __addTextChild(_contacts_contact.number, _contacts_number._uri, _contacts_number.number, number, _contacts_number.type, type);
 }
 
 int CtInputData::setNumberNumber(contacts_record_h record, const char* number)
@@ -886,12 +893,7 @@ Eina_List* CtInputData::getEmailList() { return childList(m_contactRecord, _cont
 contacts_record_h CtInputData::addEmail(const char* email)
 {
 	int type = getNextEmailType();
-	contacts_record_h child = __addChild(_contacts_contact.email, _contacts_email._uri);
-	if (child) {
-		contacts_record_set_int(child, _contacts_email.type, type);
-		setTextIfGiven(child, _contacts_email.email, email);
-	}
-	return child;
+	return __addTextChild(_contacts_contact.email, _contacts_email._uri, _contacts_email.email, email, _contacts_email.type, type);
 }
 
 int CtInputData::setEmailEmail(contacts_record_h record, const char* email)
@@ -921,10 +923,7 @@ contacts_record_h CtInputData::getNoteRecord() { return __firstChild(_contacts_c
 
 contacts_record_h CtInputData::addNote(const char* note)
 {
-	contacts_record_h child = __addChild(_contacts_contact.note, _contacts_note._uri);
-	if (child)
-		setTextIfGiven(child, _contacts_note.note, note);
-	return child;
+	return __addTextChild(_contacts_contact.note, _contacts_note._uri, _contacts_note.note, note);
 }
 
 int CtInputData::setNote(contacts_record_h record, const char* note) { return setTextIfGiven(record, _contacts_note.note, note); }
@@ -1000,12 +999,7 @@ Eina_List* CtInputData::getMessengerList() { return childList(m_contactRecord, _
 contacts_record_h CtInputData::addMessenger(const char* messenger)
 {
 	int type = getNextMessengerType();
-	contacts_record_h child = __addChild(_contacts_contact.messenger, _contacts_messenger._uri);
-	if (child) {
-		contacts_record_set_int(child, _contacts_messenger.type, type);
-		setTextIfGiven(child, _contacts_messenger.im_id, messenger);
-	}
-	return child;
+	return __addTextChild(_contacts_contact.messenger, _contacts_messenger._uri, _contacts_messenger.im_id, messenger, _contacts_messenger.type, type);
 }
 
 int CtInputData::setMessengerMessenger(contacts_record_h record, const char* messenger)
@@ -1040,10 +1034,7 @@ Eina_List* CtInputData::getWebsiteList() { return childList(m_contactRecord, _co
 
 contacts_record_h CtInputData::addWebsite(const char* website)
 {
-	contacts_record_h child = __addChild(_contacts_contact.url, _contacts_url._uri);
-	if (child)
-		setTextIfGiven(child, _contacts_url.url, website);
-	return child;
+	return __addTextChild(_contacts_contact.url, _contacts_url._uri, _contacts_url.url, website);
 }
 
 int CtInputData::setWebsiteWebsite(contacts_record_h record, const char* website)
@@ -1061,12 +1052,7 @@ Eina_List* CtInputData::getRelationshipList() { return childList(m_contactRecord
 contacts_record_h CtInputData::addRelationship(const char* relationship)
 {
 	int type = getNextRelationshipType();
-	contacts_record_h child = __addChild(_contacts_contact.relationship, _contacts_relationship._uri);
-	if (child) {
-		contacts_record_set_int(child, _contacts_relationship.type, type);
-		setTextIfGiven(child, _contacts_relationship.name, relationship);
-	}
-	return child;
+	return __addTextChild(_contacts_contact.relationship, _contacts_relationship._uri, _contacts_relationship.name, relationship, _contacts_relationship.type, type);
 }
 
 int CtInputData::setRelationshipRelationship(contacts_record_h record, const char* relationship)

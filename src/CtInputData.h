@@ -198,6 +198,10 @@ private:
 	contacts_record_h __firstChild(unsigned int property, bool create);
 	contacts_record_h __imageOwner();
 	contacts_record_h __addChild(unsigned int property, const char* childUri);
+	// A new child with `text` in `textProperty` and, when `typeProperty` is
+	// not 0, `type` in it.
+	contacts_record_h __addTextChild(unsigned int property, const char* childUri, unsigned int textProperty,
+		const char* text, unsigned int typeProperty = 0, int type = 0);
 	int __removeChild(unsigned int property, contacts_record_h child);
 	std::vector<int> __childTypes(unsigned int property, unsigned int typeProperty);
 	int __setNamePart(unsigned int property, const char* text);

@@ -183,6 +183,7 @@ CtDetailView::CtDetailView(const CtGalSearchData* galData)
 CtDetailView::~CtDetailView()
 {
 	WENTER();
+	__stopAddingRows();
 	__closePopup();
 	CtRegistryMgr::getInstance()->unRegisterVconfChangedCb(VCONFKEY_SETAPPL_PSMODE, __powerSavingModeChangedCb, this);
 	if (!m_galData) {
@@ -348,11 +349,25 @@ void CtDetailView::__addAllItems()
 	m_numberIndex = m_emailIndex = m_noteIndex = m_addressIndex = 0;
 	m_eventIndex = m_relationshipIndex = m_websiteIndex = m_messengerIndex = 0;
 	m_currentKind = KIND_PICTURE;
-	app_assist::WUiTimer::destroy(m_rowAnimator);
-	// The first rows go in at once, so the screen's first frame shows them.
+	__stopAddingRows();
+	// The first rows go in at once, so the screen's first frame shows them;
+	// the rest follow one per frame once that frame is drawn.
 	if (__addItemsForFrame())
-		m_rowAnimator = app_assist::WUiTimer::addAnimator(
-			[this](void*) { return __addItemsForFrame(); }, nullptr, this);
+		m_firstFrame = std::make_unique<app_assist::WNextFrame>(m_genlist, [this] {
+			m_rowAnimator = app_assist::WUiTimer::addAnimator(
+				[this](void*) { return __addItemsForFrame(); }, nullptr, this);
+		});
+}
+
+void CtDetailView::__stopAddingRows()
+{
+	m_firstFrame.reset();
+	app_assist::WUiTimer::destroy(m_rowAnimator);
+}
+
+bool CtDetailView::isBuildingRows() const
+{
+	return (m_firstFrame && m_firstFrame->isPending()) || app_assist::WUiTimer::isAlive(m_rowAnimator);
 }
 
 bool CtDetailView::__addItemsForFrame()
@@ -643,7 +658,7 @@ void CtDetailView::__updateGenlist()
 	if (m_galData)
 		return;
 	int personId = m_detailData->getPersonId();
-	app_assist::WUiTimer::destroy(m_rowAnimator);
+	__stopAddingRows();
 	m_detailData->detachListener();
 	// The rows borrow the old data's records: they go before it does.
 	elm_genlist_clear(m_genlist);

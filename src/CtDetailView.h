@@ -7,6 +7,7 @@
 #include "CtSimListener.h"
 #include "CtView.h"
 #include "ICtChangeListener.h"
+#include "WNextFrame.h"
 #include "WUiTimer.h"
 #include "WView.h"
 
@@ -45,7 +46,7 @@ public:
 	bool isCompactLayout() const { return m_isCompactLayout; }
 	bool isPowerSaving() const { return m_isPowerSaving; }
 	// Rows are still being added over animation frames.
-	bool isBuildingRows() const { return app_assist::WUiTimer::isAlive(m_rowAnimator); }
+	bool isBuildingRows() const;
 	// How many times the list was rebuilt after a change of the person.
 	int getRebuildCount() const { return m_rebuildCount; }
 
@@ -82,6 +83,7 @@ private:
 	void __connectCallBlock();
 	void __disconnectCallBlock();
 	void __addAllItems();
+	void __stopAddingRows();
 	bool __addItemsForFrame();
 	bool __addItemOfKind(int& budget);
 	bool __addNextListItem(int& budget);
@@ -150,6 +152,7 @@ private:
 	std::weak_ptr<app_assist::WControl> m_popup;
 	bool m_rebuiltWhileShown = false;
 
+	std::unique_ptr<app_assist::WNextFrame> m_firstFrame;
 	app_assist::WUiTimerHandle m_rowAnimator;
 	Evas_Object* m_naviframeObj = nullptr;
 	int m_rebuildCount = 0;

@@ -2,6 +2,7 @@
 #include "TestViews.h"
 
 #include "LogSink.h"
+#include "WNextFrame.h"
 #include "WUiTimer.h"
 
 #include <gtest/gtest.h>
@@ -88,4 +89,43 @@ TEST_F(UiTimer, CallbackMayDestroyItsOwnerOrItself)
 	EXPECT_TRUE(alive.expired());
 	EXPECT_EQ(std::make_pair(1, 1), std::make_pair(fired, selfFired));
 	evas_object_del(holder);
+}
+
+TEST_F(UiTimer, NextFrameRunsOnceAfterADrawnFrameAndIsDroppedWithItsObject)
+{
+	Evas* canvas = evas_object_evas_get(screen.win());
+	int frames = 0;
+	Evas_Event_Cb countFrame = [](void* data, Evas*, void*) { ++*static_cast<int*>(data); };
+	evas_event_callback_priority_add(canvas, EVAS_CALLBACK_RENDER_POST, EVAS_CALLBACK_PRIORITY_BEFORE, countFrame, &frames);
+	Evas_Object* box = evas_object_rectangle_add(canvas);
+	evas_object_resize(box, 40, 40);
+	evas_object_show(box);
+
+	std::vector<int> seenAt; // frames drawn when each waiter ran
+	auto once = std::make_unique<app_assist::WNextFrame>(box, [&] { seenAt.push_back(frames); });
+	std::unique_ptr<app_assist::WNextFrame> selfDestroying;
+	selfDestroying = std::make_unique<app_assist::WNextFrame>(box, [&] {
+		seenAt.push_back(frames);
+		selfDestroying.reset();
+	});
+	auto dropped = std::make_unique<app_assist::WNextFrame>(box, [&] { seenAt.push_back(-1); });
+	dropped.reset();
+	EXPECT_TRUE(once->isPending());
+	EXPECT_TRUE(seenAt.empty());
+	EXPECT_TRUE(screen.pumpUntil([&] { return seenAt.size() >= 2; }));
+	screen.pumpFrames(3);
+	EXPECT_EQ((std::vector<int>{1, 1}), seenAt);
+	EXPECT_FALSE(once->isPending());
+	EXPECT_EQ(nullptr, selfDestroying);
+
+	auto orphan = std::make_unique<app_assist::WNextFrame>(box, [&] { seenAt.push_back(-2); });
+	evas_object_del(box);
+	EXPECT_FALSE(orphan->isPending());
+	screen.pumpFrames(3);
+	EXPECT_EQ(2u, seenAt.size());
+	evas_event_callback_del_full(canvas, EVAS_CALLBACK_RENDER_POST, countFrame, &frames);
+
+	ct::log::clear();
+	EXPECT_FALSE(app_assist::WNextFrame(nullptr, [] {}).isPending());
+	EXPECT_TRUE(ct::log::contains("Invalid param"));
 }

@@ -203,20 +203,24 @@ TEST_F(CtDetailViewTest, RowsFollowTheKindOrderSixInTheFirstFrameThenOnePerFrame
 {
 	int personId = storeRichPerson();
 	auto* view = static_cast<CtDetailView*>(createCtDetailView(personId, nullptr));
-	ASSERT_TRUE(m_screen->naviframe()->push(view));
-	// Row counts seen at each later frame, after the screen's own step.
+	// Row counts in each drawn frame.
 	struct Frames {
-		CtDetailView* view;
+		CtDetailView* view = nullptr;
 		std::vector<size_t> counts;
-	} frames = {view, {kinds(view).size()}};
-	Ecore_Animator* recorder = ecore_animator_add([](void* data) -> Eina_Bool {
+	} frames;
+	Evas* canvas = evas_object_evas_get(m_screen->win());
+	Evas_Event_Cb recorder = [](void* data, Evas*, void*) {
 		auto* f = static_cast<Frames*>(data);
-		f->counts.push_back(kinds(f->view).size());
-		return ECORE_CALLBACK_RENEW;
-	}, &frames);
+		if (f->view && f->view->getGenlist())
+			f->counts.push_back(kinds(f->view).size());
+	};
+	evas_event_callback_add(canvas, EVAS_CALLBACK_RENDER_POST, recorder, &frames);
+	ASSERT_TRUE(m_screen->naviframe()->push(view));
+	frames.view = view;
 	ASSERT_TRUE(m_screen->pumpUntil([view] { return !view->isBuildingRows(); }));
 	m_screen->pumpFrames(2);
-	ecore_animator_del(recorder);
+	evas_event_callback_del_full(canvas, EVAS_CALLBACK_RENDER_POST, recorder, &frames);
+	ASSERT_FALSE(frames.counts.empty());
 	EXPECT_EQ(6u, frames.counts.front());
 	for (size_t i = 1; i < frames.counts.size(); ++i)
 		EXPECT_LE(frames.counts[i] - frames.counts[i - 1], 1u) << "frame " << i;

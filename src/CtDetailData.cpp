@@ -185,11 +185,22 @@ void CtDetailData::init()
 	if (err != CONTACTS_ERROR_NONE)
 		WFAILED("contacts_db_get_current_version", err);
 	__subscribe();
-	if (m_personRecord) {
-		m_timeFormatter = CtCommonGetTimeFormatter();
-		m_timeFormatterWithoutYear = CtCommonGetTimeFormatterWithoutYear();
+	if (m_personRecord)
 		__loadGroupNames();
-	}
+}
+
+i18n_udate_h CtDetailData::getTimeFormatter()
+{
+	if (!m_timeFormatter && m_personRecord)
+		m_timeFormatter = CtCommonGetTimeFormatter();
+	return m_timeFormatter;
+}
+
+i18n_udate_h CtDetailData::getTimeFormatterWithoutYear()
+{
+	if (!m_timeFormatterWithoutYear && m_personRecord)
+		m_timeFormatterWithoutYear = CtCommonGetTimeFormatterWithoutYear();
+	return m_timeFormatterWithoutYear;
 }
 
 void CtDetailData::deInit()

@@ -77,8 +77,9 @@ public: // CtDetailDataBase
 	int getEvent(contacts_record_h record) override;
 	Eina_List* getNoteList() override { return m_noteList; }
 	const char* getNote(contacts_record_h record) override;
-	i18n_udate_h getTimeFormatter() override { return m_timeFormatter; }
-	i18n_udate_h getTimeFormatterWithoutYear() override { return m_timeFormatterWithoutYear; }
+	// Made at first use: most persons have no event to format.
+	i18n_udate_h getTimeFormatter() override;
+	i18n_udate_h getTimeFormatterWithoutYear() override;
 	bool getReadOnlyMode() override;
 	Eina_List* getNameList() override { return m_nameList; }
 	Eina_List* getImageList() override { return m_imageList; }

@@ -74,6 +74,17 @@ std::string CtDetailViewGenlistItem::getIconColorCode()
 	return code && *code ? code : kDefaultIconColor;
 }
 
+const std::string& CtDetailViewGenlistItem::iconColorCode()
+{
+	// Settings reads cost a database query; the SIM state is read again
+	// when the contents are invalidated.
+	if (m_iconColorGeneration != m_contentGeneration) {
+		m_iconColor = getIconColorCode();
+		m_iconColorGeneration = m_contentGeneration;
+	}
+	return m_iconColor;
+}
+
 Elm_Genlist_Item_Class* CtDetailViewGenlistItem::getItemClassNew()
 {
 	Elm_Genlist_Item_Class* itc = elm_genlist_item_class_new();
@@ -161,7 +172,7 @@ void CtDetailViewGenlistItem::addIconButton(Evas_Object* layout, const char* par
 	WPRET_M(!layout, "Invalid param : layout");
 	Evas_Object* button = uxt_button_add(layout, "btn_with_swallow");
 	WPRET_M(!button, "uxt_button_add() is fail");
-	std::string code = getIconColorCode() + (disabled ? "D" : "");
+	std::string code = iconColorCode() + (disabled ? "D" : "");
 	Evas_Object* icon = ctCommonCreateImage(button, kIconEdj, image, code.c_str());
 	elm_object_content_set(button, icon);
 	evas_object_propagate_events_set(button, EINA_FALSE);
@@ -213,12 +224,12 @@ void CtDetailViewGenlistItem::__iconClickedCb(void* data, Evas_Object*, const ch
 	static_cast<CtDetailViewGenlistItem*>(data)->onIconClicked(source);
 }
 
-void CtDetailViewGenlistItem::__iconPressedCb(void*, Evas_Object* obj, const char*, const char* source)
+void CtDetailViewGenlistItem::__iconPressedCb(void* data, Evas_Object* obj, const char*, const char* source)
 {
-	recolorIcon(obj, source, getIconColorCode() + "P");
+	recolorIcon(obj, source, static_cast<CtDetailViewGenlistItem*>(data)->iconColorCode() + "P");
 }
 
-void CtDetailViewGenlistItem::__iconReleasedCb(void*, Evas_Object* obj, const char*, const char* source)
+void CtDetailViewGenlistItem::__iconReleasedCb(void* data, Evas_Object* obj, const char*, const char* source)
 {
-	recolorIcon(obj, source, getIconColorCode());
+	recolorIcon(obj, source, static_cast<CtDetailViewGenlistItem*>(data)->iconColorCode());
 }

@@ -60,6 +60,8 @@ public:
 
 	// The colour code of action icons: the SIM colour when one SIM is in use, else "A03O004".
 	static std::string getIconColorCode();
+	// getIconColorCode() as read when the current contents were made.
+	const std::string& iconColorCode();
 
 public: // WGenlistItem
 	Elm_Genlist_Item_Class* getItemClassNew() override;
@@ -103,6 +105,8 @@ private:
 
 	CtDetailDataBase* m_data;
 	unsigned m_contentGeneration = 1;
+	std::string m_iconColor;
+	unsigned m_iconColorGeneration = 0;
 };
 
 #endif

@@ -12,6 +12,8 @@
 #include "CtDetailViewGenlistItem.h"
 #include "CtDetailViewNumberItem.h"
 #include "CtRegistryMgr.h"
+#include "CtSimMgr.h"
+#include "CtCommonWidgetUtil.h"
 #include "LogSink.h"
 #include "ScreenHarness.h"
 #include "TempDataDir.h"
@@ -386,6 +388,44 @@ TEST_F(CtDetailViewTest, BlockingANumberMarksItsRowWithoutARebuild)
 	EXPECT_TRUE(m_screen->pumpUntil([&] { return !numbers[0]->isBlocked(); }));
 	EXPECT_EQ(nullptr, blockMark());
 	phone_misc_disconnect(blockList);
+}
+
+// The "ct_icon" colour class of the call icon of a number row, as r,g,b.
+std::string callIconColor(CtDetailViewNumberItem* row)
+{
+	Evas_Object* layout = elm_object_item_part_content_get(row->getElmObjectItem(), "elm.icon.2");
+	Evas_Object* button = layout ? elm_object_part_content_get(layout, "elm.icon1") : nullptr;
+	Evas_Object* image = button ? elm_object_content_get(button) : nullptr;
+	Evas_Object* edje = image ? elm_image_object_get(image) : nullptr;
+	int c[12] = {};
+	if (!edje || !edje_object_color_class_get(edje, "ct_icon", &c[0], &c[1], &c[2], &c[3], &c[4], &c[5], &c[6],
+			&c[7], &c[8], &c[9], &c[10], &c[11]))
+		return "none";
+	return std::to_string(c[0]) + "," + std::to_string(c[1]) + "," + std::to_string(c[2]);
+}
+
+std::string themeColor(const char* code)
+{
+	int r = -1, g = -1, b = -1, a = -1;
+	EXPECT_TRUE(ctCommonGetThemeColor(code, &r, &g, &b, &a)) << code;
+	return std::to_string(r) + "," + std::to_string(g) + "," + std::to_string(b);
+}
+
+TEST_F(CtDetailViewTest, ASimSwitchedOffRecoloursTheShownIconsWithoutARebuild)
+{
+	CtDetailView* view = show(storeRichPerson());
+	auto numbers = ScreenHarness::rowsOf<CtDetailViewNumberItem>(view->getGenlist());
+	ASSERT_FALSE(numbers.empty());
+	const std::string bothSims = themeColor(CtDetailViewGenlistItem::getIconColorCode().c_str());
+	EXPECT_EQ(bothSims, callIconColor(numbers[0]));
+
+	ASSERT_EQ(0, vconf_set_int(VCONFKEY_TELEPHONY_SIM_POWER_STATE2, 0));
+	const std::string firstSim = themeColor(CtSimMgr::getInstance()->getSimColor(0));
+	ASSERT_NE(bothSims, firstSim);
+	EXPECT_TRUE(m_screen->pumpUntil([&] { return callIconColor(numbers[0]) == firstSim; }));
+	EXPECT_EQ(0, view->getRebuildCount());
+	vconf_set_int(VCONFKEY_TELEPHONY_SIM_POWER_STATE2, 1);
+	EXPECT_TRUE(m_screen->pumpUntil([&] { return callIconColor(numbers[0]) == bothSims; }));
 }
 
 TEST_F(CtDetailViewTest, VideoCallAndAddressRowsLaunchTheirApplications)

@@ -196,10 +196,21 @@ int Database::open(const std::string& path, OpenMode mode)
 
 void Database::close()
 {
+	m_statements.clear();
 	if (m_db) {
 		sqlite3_close_v2(m_db);
 		m_db = nullptr;
 	}
+}
+
+Statement& Database::cached(const std::string& sql) const
+{
+	// A statement that failed to prepare (a locked schema, say) is tried again.
+	std::unique_ptr<Statement>& slot = m_statements[sql];
+	if (!slot || !slot->valid())
+		slot = std::make_unique<Statement>(m_db, sql.c_str());
+	slot->reset();
+	return *slot;
 }
 
 int Database::exec(const char* sql)

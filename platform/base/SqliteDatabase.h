@@ -4,7 +4,9 @@
 #include <sqlite3.h>
 
 #include <cstdint>
+#include <memory>
 #include <string>
+#include <unordered_map>
 
 namespace ct::db {
 
@@ -78,6 +80,9 @@ public:
 	// Runs SQL without parameters (schema scripts). SQLITE_OK or the error.
 	int exec(const char* sql);
 	Statement prepare(const char* sql) const { return Statement(m_db, sql); }
+	// The statement for `sql`, prepared once per connection and reset; hold
+	// it in a CachedStatement. One thread at a time.
+	Statement& cached(const std::string& sql) const;
 
 	std::string errorMessage() const;
 	int64_t lastInsertRowId() const;
@@ -88,6 +93,22 @@ public:
 private:
 	sqlite3* m_db = nullptr;
 	std::string m_path;
+	mutable std::unordered_map<std::string, std::unique_ptr<Statement>> m_statements;
+};
+
+// A cached statement, reset when the holder goes out of scope so that no
+// read transaction stays open.
+class CachedStatement {
+public:
+	explicit CachedStatement(Statement& st) : m_st(st) {}
+	~CachedStatement() { m_st.reset(); }
+	CachedStatement(const CachedStatement&) = delete;
+	CachedStatement& operator=(const CachedStatement&) = delete;
+	Statement* operator->() { return &m_st; }
+	Statement& operator*() { return m_st; }
+
+private:
+	Statement& m_st;
 };
 
 // BEGIN IMMEDIATE on construction; rolls back unless commit() succeeded.

@@ -65,8 +65,9 @@ std::string CallBlockList::cleanNumber(const std::string& number)
 
 int CallBlockList::find(int type, const std::string& number) const
 {
-	auto st = m_db.prepare("SELECT 1 FROM blocked WHERE type = ? AND number = ?");
-	int rc = st.bind(1, type).bind(2, cleanNumber(number)).step();
+	// Asked once per number row of every detail screen.
+	ct::db::CachedStatement st(m_db.cached("SELECT 1 FROM blocked WHERE type = ? AND number = ?"));
+	int rc = st->bind(1, type).bind(2, cleanNumber(number)).step();
 	if (rc == SQLITE_ROW)
 		return 1;
 	return rc == SQLITE_DONE ? 0 : storageError(m_db, "find", rc);

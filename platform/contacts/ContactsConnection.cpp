@@ -65,7 +65,6 @@ int ContactsConnection::disconnect()
 ContactsConnection::~ContactsConnection()
 {
 	m_watcher.reset();
-	m_statements.clear();
 	m_db.close();
 }
 
@@ -82,10 +81,8 @@ int ContactsConnection::__open()
 	int err = __checkOrCreateSchema();
 	if (err == CONTACTS_ERROR_NONE)
 		err = ContactsSim::ensureAddressBooks(*this);
-	if (err != CONTACTS_ERROR_NONE) {
-		m_statements.clear();
+	if (err != CONTACTS_ERROR_NONE)
 		m_db.close();
-	}
 	return err;
 }
 
@@ -138,15 +135,10 @@ int ContactsConnection::__checkOrCreateSchema()
 
 db::Statement& ContactsConnection::statement(const std::string& sql)
 {
-	auto it = m_statements.find(sql);
-	if (it == m_statements.end()) {
-		auto st = std::make_unique<db::Statement>(m_db.handle(), sql.c_str());
-		if (!st->valid())
-			WERROR("prepare failed (%s): %s", m_db.errorMessage().c_str(), sql.c_str());
-		it = m_statements.emplace(sql, std::move(st)).first;
-	}
-	it->second->reset();
-	return *it->second;
+	db::Statement& st = m_db.cached(sql);
+	if (!st.valid())
+		WERROR("prepare failed (%s): %s", m_db.errorMessage().c_str(), sql.c_str());
+	return st;
 }
 
 int ContactsConnection::failed(const char* what, int sqliteResult)

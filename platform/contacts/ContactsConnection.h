@@ -17,20 +17,7 @@
 
 namespace ct::contacts {
 
-// A cached statement, reset when the holder goes out of scope so that no
-// read transaction stays open.
-class CachedStatement {
-public:
-	explicit CachedStatement(db::Statement& st) : m_st(st) {}
-	~CachedStatement() { m_st.reset(); }
-	CachedStatement(const CachedStatement&) = delete;
-	CachedStatement& operator=(const CachedStatement&) = delete;
-	db::Statement* operator->() { return &m_st; }
-	db::Statement& operator*() { return m_st; }
-
-private:
-	db::Statement& m_st;
-};
+using db::CachedStatement;
 
 // What one write transaction did; filled while it runs.
 struct WriteContext {
@@ -85,7 +72,6 @@ private:
 
 	int m_count = 0;
 	db::Database m_db;
-	std::unordered_map<std::string, std::unique_ptr<db::Statement>> m_statements;
 	int m_lastChangeVersion = 0;
 	std::vector<Callback> m_callbacks;
 	std::map<std::string, int64_t> m_seenVersions;

@@ -106,13 +106,16 @@ int64_t KeyValueStore::__maxSequence() const
 
 int KeyValueStore::get(const std::string& key, Value* out) const
 {
-	auto st = m_db.prepare("SELECT type, value FROM entries WHERE key = ? AND type != 0");
-	int rc = st.bind(1, key).step();
+	// Settings are read far more often than written: the read statement is
+	// prepared once, and shared by the threads that read.
+	std::lock_guard<std::mutex> lock(m_readMutex);
+	ct::db::CachedStatement st(m_db.cached("SELECT type, value FROM entries WHERE key = ? AND type != 0"));
+	int rc = st->bind(1, key).step();
 	if (rc == SQLITE_DONE)
 		return kNotFound;
 	if (rc != SQLITE_ROW)
 		return storageError(m_db, "read", rc);
-	*out = readValue(st, 0, 1);
+	*out = readValue(*st, 0, 1);
 	return kOk;
 }
 

@@ -11,6 +11,7 @@
 #include <functional>
 #include <map>
 #include <memory>
+#include <mutex>
 #include <string>
 #include <vector>
 
@@ -101,6 +102,7 @@ private:
 	void __notify(const std::string& key, const Value& value);
 
 	ct::db::Database m_db;
+	mutable std::mutex m_readMutex;
 	std::unique_ptr<ct::db::StoreChangeWatcher> m_watcher;
 	std::map<std::string, std::vector<std::shared_ptr<Registration>>> m_observers;
 	std::atomic<bool> m_watching{false};

@@ -126,3 +126,32 @@ TEST(SqliteDatabase, EveryFailedWriteLeavesTheTableAsItWas)
 	ASSERT_EQ(SQLITE_OK, reopened.open(dir.file("t.db")));
 	EXPECT_EQ(expected + 2, countRows(reopened));
 }
+
+TEST(SqliteDatabase, CachedStatementsAreResetRetriedAfterAFailedPrepareAndLetOthersWrite)
+{
+	ct::test::TempDataDir dir;
+	const std::string path = dir.file("t.db");
+	Database db;
+	ASSERT_EQ(SQLITE_OK, db.open(path));
+	const std::string query = "SELECT v FROM t WHERE v = ?";
+	EXPECT_FALSE(db.cached(query).valid()); // no table yet
+	ASSERT_EQ(SQLITE_OK, db.exec("CREATE TABLE t(v TEXT)"));
+	ASSERT_EQ(SQLITE_OK, insertTwoRows(db));
+	{
+		ct::db::CachedStatement st(db.cached(query));
+		ASSERT_TRUE(st->valid());
+		EXPECT_EQ(SQLITE_ROW, st->bind(1, "first").step());
+		EXPECT_EQ(&*st, &db.cached(query)) << "prepared once";
+	}
+	// The holder reset it: no read stays open to keep a writer waiting, and
+	// the old binding is gone.
+	Database other;
+	ASSERT_EQ(SQLITE_OK, other.open(path));
+	ASSERT_EQ(SQLITE_OK, insertTwoRows(other));
+	EXPECT_EQ(SQLITE_DONE, ct::db::CachedStatement(db.cached(query))->step());
+	EXPECT_EQ(4, countRows(db));
+
+	db.close();
+	ASSERT_EQ(SQLITE_OK, db.open(path));
+	EXPECT_EQ(SQLITE_ROW, ct::db::CachedStatement(db.cached(query))->bind(1, "second").step());
+}

@@ -241,6 +241,24 @@ int64_t Database::dataVersion() const
 	return st.step() == SQLITE_ROW ? st.columnInt64(0) : -1;
 }
 
+ReadSnapshot::ReadSnapshot(const Database& db)
+	: m_db(db)
+{
+	if (!db.handle() || !sqlite3_get_autocommit(db.handle()))
+		return;
+	CachedStatement begin(db.cached("BEGIN"));
+	m_open = begin->step() == SQLITE_DONE;
+}
+
+ReadSnapshot::~ReadSnapshot()
+{
+	if (!m_open)
+		return;
+	CachedStatement end(m_db.cached("COMMIT"));
+	if (end->step() != SQLITE_DONE)
+		sqlite3_exec(m_db.handle(), "ROLLBACK", nullptr, nullptr, nullptr);
+}
+
 Transaction::Transaction(Database& db)
 	: m_db(db)
 	, m_status(db.exec("BEGIN IMMEDIATE"))

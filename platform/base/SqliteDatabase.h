@@ -130,6 +130,21 @@ private:
 	bool m_open = false;
 };
 
+// A read transaction around several statements, so that they see one state
+// of the file and take the read lock once; nothing when a transaction is
+// already open or cannot begin (the statements then read on their own).
+class ReadSnapshot {
+public:
+	explicit ReadSnapshot(const Database& db);
+	~ReadSnapshot();
+	ReadSnapshot(const ReadSnapshot&) = delete;
+	ReadSnapshot& operator=(const ReadSnapshot&) = delete;
+
+private:
+	const Database& m_db;
+	bool m_open = false;
+};
+
 // Maps an SQLite result to a negative errno-style code: 0, -28 (ENOSPC) for a
 // full disk, -13 (EACCES) for read-only or unopenable files, -16 (EBUSY) for
 // a locked database, -5 (EIO) otherwise.

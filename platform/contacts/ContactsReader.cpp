@@ -77,6 +77,7 @@ int ContactsReader::readRecord(const ViewInfo& view, int id, contacts_record_s**
 	WPRET_VM(!view.findByName("id") || !view.readSource, CONTACTS_ERROR_INVALID_PARAMETER,
 		"records of %s cannot be read by id", view.uri);
 	WPRET_VM(id < 0, CONTACTS_ERROR_INVALID_PARAMETER, "Invalid param : id %d", id);
+	db::ReadSnapshot snapshot(m_conn.database());
 	auto record = std::make_unique<contacts_record_s>(view);
 	{
 		CachedStatement st(m_conn.statement(view.selectByIdSql));

@@ -155,3 +155,29 @@ TEST(SqliteDatabase, CachedStatementsAreResetRetriedAfterAFailedPrepareAndLetOth
 	ASSERT_EQ(SQLITE_OK, db.open(path));
 	EXPECT_EQ(SQLITE_ROW, ct::db::CachedStatement(db.cached(query))->bind(1, "second").step());
 }
+
+TEST(SqliteDatabase, AReadSnapshotSeesOneStateOfTheFileAndNestsInAWrite)
+{
+	ct::test::TempDataDir dir;
+	const std::string path = dir.file("t.db");
+	Database reader, writer;
+	ASSERT_EQ(SQLITE_OK, reader.open(path));
+	ASSERT_EQ(SQLITE_OK, reader.exec("CREATE TABLE t(v TEXT)"));
+	ASSERT_EQ(SQLITE_OK, writer.open(path));
+	{
+		ct::db::ReadSnapshot snapshot(reader);
+		EXPECT_EQ(0, countRows(reader));
+		ASSERT_EQ(SQLITE_OK, insertTwoRows(writer)); // readers never block the writer
+		EXPECT_EQ(0, countRows(reader));
+	}
+	EXPECT_EQ(2, countRows(reader));
+
+	Transaction tx(reader);
+	ASSERT_EQ(SQLITE_OK, tx.status());
+	{
+		ct::db::ReadSnapshot inside(reader);
+		EXPECT_EQ(SQLITE_OK, reader.exec("INSERT INTO t(v) VALUES('third')"));
+	}
+	EXPECT_EQ(SQLITE_OK, tx.commit()) << "the snapshot did not end the write";
+	EXPECT_EQ(3, countRows(writer));
+}

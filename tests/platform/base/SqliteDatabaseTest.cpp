@@ -74,7 +74,6 @@ TEST(SqliteDatabase, BindsTextLiterallyAndPersistsAcrossReopen)
 TEST(SqliteDatabase, ForeignFilesAndBadPathsAreReportedNotOverwritten)
 {
 	ct::test::TempDataDir dir;
-	EXPECT_EQ(dir.path() + "/x.db", ct::platform::dataPath("x.db"));
 	const std::string garbage = dir.file("garbage.db");
 	std::ofstream(garbage, std::ios::binary) << std::string(8192, 'z');
 	Database db;
@@ -88,7 +87,6 @@ TEST(SqliteDatabase, ForeignFilesAndBadPathsAreReportedNotOverwritten)
 	EXPECT_NE(SQLITE_OK, rc);
 	EXPECT_EQ(-13, ct::db::toErrno(rc));
 	EXPECT_NE(0, ct::platform::makeDirectories(notADir + "/sub"));
-	EXPECT_EQ(-28, ct::db::toErrno(SQLITE_FULL));
 }
 
 TEST(SqliteDatabase, EveryFailedWriteLeavesTheTableAsItWas)

@@ -1,4 +1,3 @@
-// ICU date formatters and event dates in several region formats.
 #include "RegionDateFormat.h"
 #include "utils_i18n.h"
 #include "vconf.h"
@@ -78,7 +77,6 @@ TEST(DateFormat, FormatterFromPatternAndUtf16Output)
 {
 	i18n_udate_h formatter = nullptr;
 	ASSERT_EQ(I18N_ERROR_NONE, i18n_udate_create_from_pattern("yyyy-MM-dd HH:mm", "en_US", "UTC", &formatter));
-	EXPECT_EQ("yyyy-MM-dd HH:mm", patternOf(formatter));
 	char* text = nullptr;
 	ASSERT_EQ(I18N_ERROR_NONE, i18n_udate_format_date_utf8(formatter, 0.0, &text));
 	EXPECT_STREQ("1970-01-01 00:00", text);
@@ -90,9 +88,7 @@ TEST(DateFormat, FormatterFromPatternAndUtf16Output)
 	EXPECT_EQ(16, needed);
 	i18n_uchar exact[17];
 	ASSERT_EQ(I18N_ERROR_NONE, i18n_udate_format_date(formatter, 0.0, exact, 17, &needed));
-	EXPECT_EQ(u'1', exact[0]);
-	EXPECT_EQ(u'0', exact[15]);
-	EXPECT_EQ(0, exact[16]);
+	EXPECT_EQ(u"1970-01-01 00:00", std::u16string(reinterpret_cast<const char16_t*>(exact)));
 	EXPECT_EQ(I18N_ERROR_BUFFER_OVERFLOW, i18n_udate_format_date(formatter, 0.0, nullptr, 0, &needed));
 	i18n_udate_destroy(formatter);
 

@@ -1,4 +1,3 @@
-// Locale date texts and the Chinese lunar calendar.
 #include "ui_extension.h"
 
 #include <gtest/gtest.h>
@@ -75,9 +74,6 @@ TEST(LunarCalendar, NewYearsEvesAndThe2023LeapSecondMonthConvertBothWays)
 
 TEST(LunarCalendar, EveryDayFrom1902To2037AndDaysOutsideTheTableRoundTrip)
 {
-	struct tm day = makeDate(1902, 1, 1);
-	time_t t = timegm(&day);
-	const time_t end = timegm(&(day = makeDate(2037, 12, 31)));
 	int checked = 0, leapDays = 0;
 	auto roundTrip = [&](const struct tm& solar) {
 		struct tm lunar = {}, back = {};
@@ -86,16 +82,13 @@ TEST(LunarCalendar, EveryDayFrom1902To2037AndDaysOutsideTheTableRoundTrip)
 		ASSERT_EQ(uxt_util_convert_lunar_time_to_gregorian_time(kLunar, &lunar, leap, &back), 0) << ymd(solar);
 		ASSERT_EQ(ymd(solar), ymd(back));
 		ASSERT_TRUE(lunar.tm_mday >= 1 && lunar.tm_mday <= 30);
-		if (leap) {
-			ASSERT_EQ(uxt_util_is_leap_month_possible(kLunar, &lunar), 1);
-		}
+		ASSERT_TRUE(!leap || uxt_util_is_leap_month_possible(kLunar, &lunar) == 1) << ymd(solar);
 		leapDays += leap;
 		++checked;
 	};
-	for (; t <= end && !testing::Test::HasFatalFailure(); t += 86400) {
-		struct tm solar;
+	struct tm first = makeDate(1902, 1, 1), last = makeDate(2037, 12, 31), solar;
+	for (time_t t = timegm(&first), end = timegm(&last); t <= end && !testing::Test::HasFatalFailure(); t += 86400)
 		roundTrip(*gmtime_r(&t, &solar));
-	}
 	EXPECT_EQ(checked, 49674);
 	// About 50 leap months in 136 years, each 29 or 30 days.
 	EXPECT_GT(leapDays, 45 * 29);

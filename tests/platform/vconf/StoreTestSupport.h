@@ -29,8 +29,6 @@ public:
 		ecore_init();
 	}
 	~EcoreScope() { ecore_shutdown(); }
-	EcoreScope(const EcoreScope&) = delete;
-	EcoreScope& operator=(const EcoreScope&) = delete;
 };
 
 // Iterates the main loop until `done` holds or `limitSeconds` passed (a
@@ -82,9 +80,8 @@ inline int runContactsCtl(const std::string& args, std::string* output = nullptr
 	FILE* pipe = popen(command.c_str(), "r");
 	if (!pipe)
 		return -1;
-	char buffer[512];
 	std::string text;
-	while (fgets(buffer, sizeof buffer, pipe))
+	for (char buffer[512]; fgets(buffer, sizeof buffer, pipe);)
 		text += buffer;
 	int status = pclose(pipe);
 	if (output)

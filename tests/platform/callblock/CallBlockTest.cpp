@@ -2,7 +2,6 @@
 
 #include "../vconf/StoreTestSupport.h"
 #include "SqliteFaultInjector.h"
-#include "TempDataDir.h"
 
 #include <gtest/gtest.h>
 

@@ -54,19 +54,17 @@ TEST(Changes, EveryWriteGetsItsOwnVersionAndIsListedByVersion)
 	contacts_db_get_current_version(&v0);
 	int a = insertContact({ "A", "" });
 	int b = insertContact({ "B", "" });
-	RecordPtr ra = getRecord(_contacts_contact._uri, a);
-	contacts_db_update_record(ra.get());
+	contacts_db_update_record(getRecord(_contacts_contact._uri, a).get());
 	contacts_db_delete_record(_contacts_contact._uri, b);
 	int current = 0;
 	std::vector<Change> changes = changesSince(v0, -1, &current);
-	ASSERT_EQ(4u, changes.size());
-	EXPECT_EQ(a, changes[0].contactId);
-	EXPECT_EQ(CONTACTS_CHANGE_INSERTED, changes[0].type);
-	EXPECT_EQ(CONTACTS_CHANGE_UPDATED, changes[2].type);
-	EXPECT_EQ(b, changes[3].contactId);
-	EXPECT_EQ(CONTACTS_CHANGE_DELETED, changes[3].type);
+	std::vector<std::pair<int, int>> kinds;
+	for (const Change& c : changes)
+		kinds.push_back({ c.contactId, c.type });
+	EXPECT_EQ((std::vector<std::pair<int, int>>{ { a, CONTACTS_CHANGE_INSERTED }, { b, CONTACTS_CHANGE_INSERTED },
+		{ a, CONTACTS_CHANGE_UPDATED }, { b, CONTACTS_CHANGE_DELETED } }), kinds);
 	EXPECT_EQ(v0 + 4, current);
-	EXPECT_EQ(current, changes[3].version);
+	EXPECT_EQ(current, changes.back().version);
 	int last = 0;
 	contacts_db_get_last_change_version(&last);
 	EXPECT_EQ(current, last);
@@ -122,8 +120,7 @@ TEST(Changes, OwnWritesReachCallbacksOnTheNextIterationOncePerViewAndACallbackMa
 	insertContact({ "A", "" });
 	EXPECT_TRUE(person.uris.empty()); // never inside the write
 	ecore_main_loop_iterate();
-	ASSERT_EQ(1u, person.uris.size());
-	EXPECT_EQ(_contacts_person._uri, person.uris[0]);
+	EXPECT_EQ(std::vector<std::string>{ _contacts_person._uri }, person.uris);
 	EXPECT_EQ(1u, contact.uris.size());
 	EXPECT_TRUE(group.uris.empty());
 
@@ -166,12 +163,10 @@ TEST(Changes, WritesOfAnotherProcessOrThreadReachCallbacks)
 	}
 	int status = 0;
 	waitpid(child, &status, 0);
-	ASSERT_TRUE(WIFEXITED(status));
-	ASSERT_EQ(0, WEXITSTATUS(status));
+	ASSERT_TRUE(WIFEXITED(status) && WEXITSTATUS(status) == 0) << status;
 	EXPECT_TRUE(pumpUntil([&]() { return !person.uris.empty(); }));
 	std::vector<Change> changes = changesSince(v0);
-	ASSERT_EQ(1u, changes.size());
-	EXPECT_EQ(CONTACTS_CHANGE_INSERTED, changes[0].type);
+	EXPECT_TRUE(changes.size() == 1 && changes[0].type == CONTACTS_CHANGE_INSERTED);
 
 	// Each thread has its own connection.
 	person.uris.clear();

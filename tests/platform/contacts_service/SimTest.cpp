@@ -31,12 +31,6 @@ TEST(Sim, DefaultSimTakesNamesNumbersAndEmailsWithinItsLimits)
 	EXPECT_EQ(CONTACTS_ERROR_NONE, contacts_sim_is_ready(1, &ready));
 	EXPECT_FALSE(ready);
 	EXPECT_EQ(CONTACTS_ERROR_INVALID_PARAMETER, contacts_sim_is_ready(2, &ready));
-	int len = 0;
-	contacts_sim_get_field_text_max_len(0, CONTACTS_SIM_FIELD_NAME, &len);
-	EXPECT_EQ(14, len);
-	bool supported = false;
-	contacts_sim_get_field_status(0, CONTACTS_SIM_FIELD_EMAIL, &supported);
-	EXPECT_TRUE(supported);
 	int unused = 0;
 	contacts_sim_get_unused_field_count(0, CONTACTS_SIM_FIELD_NAME, &unused);
 	EXPECT_EQ(250, unused);

@@ -117,18 +117,16 @@ TEST(Vcard, PersonVcardCarriesEveryFieldFoldedAndEscaped)
 	auto lines = vcardLines(text, &wellFormed);
 	ASSERT_TRUE(wellFormed);
 	EXPECT_EQ(0u, text.find("BEGIN:VCARD\r\n"));
-	EXPECT_EQ("VCARD", lines.find("END")->second.second);
-	EXPECT_EQ("3.0", lines.find("VERSION")->second.second);
-	EXPECT_EQ("Ánna O'Neil", unescaped(lines.find("FN")->second.second));
-	EXPECT_EQ("O'Neil;Ánna;;;", lines.find("N")->second.second);
-	EXPECT_EQ(2u, lines.count("TEL"));
+	ASSERT_EQ(2u, lines.count("TEL"));
 	EXPECT_EQ("TYPE=CELL", lines.find("TEL")->second.first);
-	EXPECT_EQ("anna@example.com", lines.find("EMAIL")->second.second);
+	for (auto [name, value] : { std::pair{ "END", "VCARD" }, { "VERSION", "3.0" }, { "FN", "Ánna O'Neil" },
+			 { "N", "O'Neil;Ánna;;;" }, { "EMAIL", "anna@example.com" }, { "ORG", "ACME\\; Inc.;" }, { "TITLE", "Boss" },
+			 { "BDAY", "1990-01-02" }, { "ADR", ";;1 Main St;Springfield;;;" } }) {
+		auto line = lines.find(name);
+		EXPECT_TRUE(line != lines.end() && line->second.second == value) << name << ": " << text;
+	}
+	ASSERT_EQ(1u, lines.count("NOTE"));
 	EXPECT_EQ(longNote, unescaped(lines.find("NOTE")->second.second));
-	EXPECT_EQ("ACME\\; Inc.;", lines.find("ORG")->second.second);
-	EXPECT_EQ("Boss", lines.find("TITLE")->second.second);
-	EXPECT_EQ("1990-01-02", lines.find("BDAY")->second.second);
-	EXPECT_EQ(";;1 Main St;Springfield;;;", lines.find("ADR")->second.second);
 
 	EXPECT_EQ(CONTACTS_ERROR_INVALID_PARAMETER, contacts_vcard_make_from_person(contact.get(), &stream));
 	EXPECT_EQ(CONTACTS_ERROR_INVALID_PARAMETER, contacts_vcard_make_from_person(nullptr, &stream));

@@ -1,4 +1,3 @@
-// Results and close requests of UI gadgets.
 #include "UiGadget.h"
 
 #include "LogSink.h"
@@ -53,7 +52,6 @@ TEST_F(UiGadgetTest, ResultsReachTheHostAsCopiesUntilTheGadgetIsClosed)
 	app_control_destroy(result);
 
 	EXPECT_EQ((std::vector<std::string>{"1", "0"}), seen);
-	ASSERT_EQ(2u, gadget.results().size());
 	EXPECT_EQ("1", gadget.resultValue(0, "is_success"));
 	EXPECT_EQ("", gadget.resultValue(0, "id"));
 	EXPECT_EQ("9", gadget.resultValue(1, "id"));

@@ -83,9 +83,7 @@ TEST(SqliteDatabase, ForeignFilesAndBadPathsAreReportedNotOverwritten)
 
 	const std::string notADir = dir.file("plain");
 	std::ofstream(notADir) << "x";
-	int rc = db.open(notADir + "/t.db");
-	EXPECT_NE(SQLITE_OK, rc);
-	EXPECT_EQ(-13, ct::db::toErrno(rc));
+	EXPECT_EQ(-13, ct::db::toErrno(db.open(notADir + "/t.db")));
 	EXPECT_NE(0, ct::platform::makeDirectories(notADir + "/sub"));
 }
 

@@ -3,7 +3,6 @@
 // groups, emergency number and change notification.
 #include "CtInputData.h"
 #include "CtCommonAddressbookUtil.h"
-#include "ICtChangeListener.h"
 #include "InputTestStore.h"
 
 #include "LogSink.h"
@@ -11,18 +10,10 @@
 
 #include <cstdlib>
 #include <fstream>
-#include <memory>
 
 using namespace ct::test;
 
 namespace {
-
-struct RecordingListener : ICtChangeListener {
-	void onDbChanged(const char* viewUri) override { uris.push_back(viewUri ? viewUri : ""); }
-	void onCompleteGetContacts() override {}
-	void onConditionChagned() override {}
-	std::vector<std::string> uris;
-};
 
 // A stored phone contact "Ada Byron" with one mobile number; returns its id.
 int storeAda()

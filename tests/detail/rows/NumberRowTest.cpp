@@ -100,7 +100,6 @@ TEST_F(NumberRowTest, VideoCallRowAsksItsOwnerUnlessPowerSavingIsOn)
 {
 	CtDetailData* data = personWithNumber("5550144");
 	Elm_Object_Item* item = show(new CtDetailViewVideoCallItem(m_view, data, false));
-	EXPECT_EQ(ContactsCommon::translate("IDS_PB_OPT_VIDEO_CALL"), text(item, "elm.text.main.left"));
 	tapIcon(content(item, "elm.icon.2"), "touch.icon");
 	ScreenHarness::selectItem(item);
 	EXPECT_EQ(2, m_view->videoCalls);

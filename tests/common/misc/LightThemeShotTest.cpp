@@ -8,12 +8,6 @@
 #include "WPopup.h"
 
 #include <Ecore_Evas.h>
-#include <gtest/gtest.h>
-
-#include <cstdlib>
-#include <filesystem>
-#include <string>
-#include <vector>
 
 using namespace ct::test;
 

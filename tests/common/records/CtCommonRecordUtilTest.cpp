@@ -8,10 +8,7 @@
 
 #include <vconf.h>
 
-#include <cstdlib>
 #include <cstring>
-#include <memory>
-#include <string>
 
 using namespace ct::test;
 
@@ -101,8 +98,7 @@ TEST_F(CtCommonRecordUtilTest, GroupNamesUseSystemNamesOnceEach)
 TEST_F(CtCommonRecordUtilTest, CompanyExtraNamesNewlinesAndShareText)
 {
 	contacts_record_h contact = newContact(0, "Dana");
-	contacts_record_h company = addChild(contact, _contacts_contact.company, _contacts_company._uri);
-	contacts_record_set_str(company, _contacts_company.job_title, "Chief");
+	addText(contact, _contacts_contact.company, _contacts_company._uri, _contacts_company.job_title, "Chief");
 	addNumber(contact, "0101", CONTACTS_NUMBER_TYPE_CELL);
 	addEmail(contact, "dana@example.com");
 	int personId = personOf(store(contact));

@@ -404,9 +404,8 @@ TEST_F(CtDetailViewTest, VideoCallAndAddressRowsLaunchTheirApplications)
 	ScreenHarness::selectItem(rowsOfKind(view, DETAIL_ITEM_ADDRESS).at(0)->getElmObjectItem());
 	ASSERT_TRUE(m_screen->pumpUntil([] { return ct::appcontrol::launches().size() == 2; }));
 	auto launches = ct::appcontrol::launches();
-	EXPECT_EQ(VIDEO_CALL_OPERATION, launches[0].operation);
-	EXPECT_EQ("tel:010-7777-8888", launches[0].uri);
-	EXPECT_EQ(std::to_string(personId), launches[0].extra("ctindex"));
+	EXPECT_EQ((std::vector<std::string>{VIDEO_CALL_OPERATION, "tel:010-7777-8888", std::to_string(personId)}),
+			(std::vector<std::string>{launches[0].operation, launches[0].uri, launches[0].extra("ctindex")}));
 	EXPECT_EQ(MAPS_APP_ID, launches[1].appId);
 	EXPECT_NE(std::string::npos, launches[1].extra("searchByName").find("5 Harbour Road"));
 

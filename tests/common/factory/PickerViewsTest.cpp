@@ -151,11 +151,10 @@ TEST_F(PickerViewsTest, PickerAnswersTheRequestThatStartedIt)
 		app_control_clone(&received, request);
 		return 0;
 	});
-	app_control_h request = nullptr;
-	app_control_create(&request);
-	app_control_set_app_id(request, "org.test.picker");
+	Request launch = request(nullptr);
+	app_control_set_app_id(launch.get(), "org.test.picker");
 	app_control_h reply = nullptr;
-	ASSERT_EQ(APP_CONTROL_ERROR_NONE, app_control_send_launch_request(request,
+	ASSERT_EQ(APP_CONTROL_ERROR_NONE, app_control_send_launch_request(launch.get(),
 		[](app_control_h, app_control_h answer, app_control_result_e result, void* data) {
 			EXPECT_EQ(result, APP_CONTROL_RESULT_SUCCEEDED);
 			app_control_clone(static_cast<app_control_h*>(data), answer);
@@ -183,7 +182,6 @@ TEST_F(PickerViewsTest, PickerAnswersTheRequestThatStartedIt)
 	EXPECT_EQ(take(id).get(), std::to_string(anna));
 	app_control_destroy(reply);
 	app_control_destroy(received);
-	app_control_destroy(request);
 }
 
 TEST_F(PickerViewsTest, UnlinkListSplitsContactsOffUntilOneIsLeft)

@@ -171,9 +171,8 @@ TEST(CtCommonTextUtil, SimpleResultReachesTheCaller)
 	auto registration = ct::appcontrol::registerAppHandler("test.caller.app", [&](app_control_h request, const auto&) {
 		return app_control_clone(&kept, request);
 	});
-	app_control_h request = nullptr;
-	app_control_create(&request);
-	app_control_set_app_id(request, "test.caller.app");
+	ct::test::Request launch = ct::test::request(nullptr);
+	app_control_set_app_id(launch.get(), "test.caller.app");
 	// What the sender saw: the result and the "is_success" extra.
 	using Seen = std::pair<int, std::string>;
 	auto onReply = [](app_control_h, app_control_h reply, app_control_result_e result, void* data) {
@@ -186,13 +185,13 @@ TEST(CtCommonTextUtil, SimpleResultReachesTheCaller)
 		{nullptr, nullptr, APP_CONTROL_RESULT_CANCELED}, {"is_success", "1", APP_CONTROL_RESULT_SUCCEEDED}};
 	for (const auto& [key, value, result] : answers) {
 		Seen seen{-100, ""};
-		ASSERT_EQ(app_control_send_launch_request(request, onReply, &seen), 0);
+		ASSERT_EQ(app_control_send_launch_request(launch.get(), onReply, &seen), 0);
 		EXPECT_EQ(ctCommonSendSimpleAppControlResult(kept, key, value, result), 0);
 		EXPECT_TRUE(ct::test::pumpUntil([&] { return seen.first != -100; }, 2.0));
 		EXPECT_EQ(seen, Seen(result, value ? value : ""));
 		app_control_destroy(kept);
 	}
-	app_control_destroy(request);
+	launch.reset();
 	ecore_shutdown();
 	EXPECT_EQ(ctCommonSendSimpleAppControlResult(nullptr, nullptr, nullptr, APP_CONTROL_RESULT_FAILED),
 		APP_CONTROL_ERROR_INVALID_PARAMETER);

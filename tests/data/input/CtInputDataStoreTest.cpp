@@ -183,10 +183,8 @@ TEST_F(CtInputDataStoreTest, OwnKeysOfTheContactsApplicationAndThePrimaryEdit)
 		{"ct_phonetic_name", "A Da"}, {"name", "Ada King"}});
 	CtInputData data(nullptr, plain.get());
 	EXPECT_EQ(data.getContactId(), id);
-	EXPECT_EQ(data.getFullName(), "Ada King");
-	EXPECT_EQ(data.getPhoneticFullName(), "A Da");
-	EXPECT_EQ(countOf(data.getNumberList()), 2u);
-	EXPECT_EQ(countOf(data.getAddressList()), 1u);
+	EXPECT_EQ(data.getFullName() + "|" + data.getPhoneticFullName(), "Ada King|A Da");
+	EXPECT_EQ((std::vector<size_t>{countOf(data.getNumberList()), countOf(data.getAddressList())}), (std::vector<size_t>{2, 1}));
 
 	// Types 21 to 23 on a stored contact take no numbers, e-mails or sites; on a new one they do.
 	CtInputData limited(nullptr, request(APP_CONTROL_OPERATION_DEFAULT, {{"person_id", person}, {"type", "22"},

@@ -3,14 +3,11 @@
 #pragma once
 
 #include "../data/detail/DetailTestStore.h"
-#include "TempDataDir.h"
 
 #include <Elementary.h>
 
 #include <cstdlib>
 #include <filesystem>
-#include <memory>
-#include <string>
 
 namespace ct::test {
 
@@ -26,22 +23,6 @@ class LoopTest : public ::testing::Test {
 protected:
 	void SetUp() override { ecore_init(); }
 	void TearDown() override { ecore_shutdown(); }
-};
-
-// A fresh data folder, the main loop and a store connection per test.
-class StoreTest : public ::testing::Test {
-protected:
-	void SetUp() override
-	{
-		ecore_init();
-		ASSERT_EQ(CONTACTS_ERROR_NONE, contacts_connect());
-	}
-	void TearDown() override
-	{
-		contacts_disconnect();
-		ecore_shutdown();
-	}
-	TempDataDir m_dir;
 };
 
 // The toolkit and a plain window per test.

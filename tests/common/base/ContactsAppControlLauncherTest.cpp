@@ -2,9 +2,6 @@
 #include "ContactsAppControlLauncher.h"
 #include "../CommonTestSupport.h"
 
-#include <Elementary.h>
-#include <gtest/gtest.h>
-
 using ct::test::pumpUntil;
 
 namespace {

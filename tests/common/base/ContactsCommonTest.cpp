@@ -3,10 +3,7 @@
 
 #include <vconf.h>
 
-#include <gtest/gtest.h>
-
 #include <fstream>
-#include <string>
 #include <tuple>
 #include <sys/stat.h>
 

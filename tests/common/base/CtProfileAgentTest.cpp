@@ -2,16 +2,9 @@
 #include "CtContactsAgentMgr.h"
 #include "CtContactsAgentUtil.h"
 #include "CtEsuAgentMgr.h"
-#include "CtRegistryMgr.h"
 #include "../CommonTestSupport.h"
 
 #include <app_preference.h>
-
-#include <Ecore.h>
-#include <gtest/gtest.h>
-
-#include <cstdlib>
-#include <vector>
 
 using namespace ct::test;
 
@@ -49,21 +42,18 @@ TEST_F(CtProfileAgentTest, SettingsPersistAndDefaultsHold)
 	EXPECT_EQ(0, agent->getProfileType());
 	EXPECT_FALSE(agent->getProfileProperty(CT_PROFILE_PROPERTY_ADDRESS));
 
-	std::vector<std::pair<int, int>> signals;
-	int id = CtRegistryMgr::getInstance()->addChangeListener(
-		[&](ctRegistryKey key, int value) { signals.emplace_back(key, value); });
+	SignalRecorder signals;
 	EXPECT_TRUE(agent->setPrivacyLevel(3));
 	EXPECT_FALSE(agent->setPrivacyLevel(4));
 	EXPECT_TRUE(agent->setProfileType(1));
 	EXPECT_FALSE(agent->setProfileType(7));
 	EXPECT_TRUE(agent->setProfileProperty(CT_PROFILE_PROPERTY_ADDRESS, true));
 	EXPECT_FALSE(agent->setProfileProperty(CT_PROFILE_PROPERTY_MAX, true));
-	CtRegistryMgr::getInstance()->removeChangeListener(id);
 
 	EXPECT_EQ(3, CtContactsAgentUtil::getPreferenceProfilePrivacyLevel());
 	EXPECT_EQ(1, CtContactsAgentUtil::getPreferenceProfileType());
 	EXPECT_TRUE(agent->getProfileProperty(CT_PROFILE_PROPERTY_ADDRESS));
-	EXPECT_EQ(signals, (std::vector<std::pair<int, int>>(2, {14, 2})));
+	EXPECT_EQ(signals.signals, (std::vector<std::pair<ctRegistryKey, int>>(2, {CT_REGISTRY_KEY_PROFILE_SHARING_STATE, 2})));
 }
 
 TEST_F(CtProfileAgentTest, ShareWithListRoundTripsAndMarksTheChoice)
@@ -153,15 +143,10 @@ TEST_F(CtProfileAgentTest, SharingStatusChangeIsConfirmedThroughTheSignal)
 {
 	auto* esu = CtEsuAgentMgr::getInstance();
 	EXPECT_FALSE(esu->getProfileSharingStatus());
-	std::vector<int> values;
-	int id = CtRegistryMgr::getInstance()->addChangeListener([&](ctRegistryKey key, int value) {
-		if (key == CT_REGISTRY_KEY_PROFILE_SHARING_STATE)
-			values.push_back(value);
-	});
+	SignalRecorder signals;
 	ASSERT_TRUE(esu->setProfileSharingStatus(true));
 	EXPECT_TRUE(esu->getProfileSharingStatus());
-	EXPECT_TRUE(values.empty());
-	EXPECT_TRUE(pumpUntil([&] { return !values.empty(); }, 1.0));
-	EXPECT_EQ(0, values[0]);
-	CtRegistryMgr::getInstance()->removeChangeListener(id);
+	EXPECT_TRUE(signals.signals.empty());
+	EXPECT_TRUE(pumpUntil([&] { return !signals.signals.empty(); }, 1.0));
+	EXPECT_EQ((std::pair<ctRegistryKey, int>(CT_REGISTRY_KEY_PROFILE_SHARING_STATE, 0)), signals.signals[0]);
 }

@@ -1,12 +1,5 @@
-#include "CtRegistryMgr.h"
 #include "LogSink.h"
 #include "../CommonTestSupport.h"
-
-#include <Ecore.h>
-#include <gtest/gtest.h>
-
-#include <string>
-#include <vector>
 
 using ct::test::pumpUntil;
 

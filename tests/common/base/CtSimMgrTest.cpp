@@ -2,11 +2,7 @@
 #include "CtThread.h"
 #include "../CommonTestSupport.h"
 
-#include <Ecore.h>
-#include <gtest/gtest.h>
-
 #include <atomic>
-#include <memory>
 #include <unistd.h>
 
 using ct::test::pumpUntil;

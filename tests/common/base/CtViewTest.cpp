@@ -4,11 +4,6 @@
 
 #include <vconf.h>
 
-#include <Elementary.h>
-#include <gtest/gtest.h>
-
-#include <memory>
-
 using ct::test::pumpUntil;
 
 namespace {

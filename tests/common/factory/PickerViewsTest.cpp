@@ -7,18 +7,10 @@
 #include "CtContactPickerView.h"
 #include "CtDllViewFactory.h"
 #include "CtPersonPickerItem.h"
-#include "CtRegistryMgr.h"
 #include "CtUnlinkContactView.h"
 #include "ScreenHarness.h"
-#include "TempDataDir.h"
 
-#include <app_control.h>
 #include <glib.h>
-
-#include <filesystem>
-#include <map>
-#include <string>
-#include <vector>
 
 using namespace ct::test;
 
@@ -69,9 +61,7 @@ TEST_F(PickerViewsTest, RelationshipPickerFiltersByNameAndRaisesTheChosenPerson)
 	addSimplePerson("Anna");
 	addSimplePerson("Bert");
 	int aane = addSimplePerson("Åne");
-	std::vector<std::pair<ctRegistryKey, int>> signals;
-	int listener = CtRegistryMgr::getInstance()->addChangeListener(
-		[&](ctRegistryKey key, int value) { signals.emplace_back(key, value); });
+	SignalRecorder signals;
 	{
 		ScreenHarness screen;
 		auto* view = relationshipPicker();
@@ -87,10 +77,9 @@ TEST_F(PickerViewsTest, RelationshipPickerFiltersByNameAndRaisesTheChosenPerson)
 		ASSERT_EQ(search(screen, view, "").size(), 3u);
 
 		choose(screen, view, "Åne");
-		EXPECT_EQ(signals, (std::vector<std::pair<ctRegistryKey, int>>{{CT_REGISTRY_KEY_RELATIONSHIP_PERSON, aane}}));
+		EXPECT_EQ(signals.signals, (std::vector<std::pair<ctRegistryKey, int>>{{CT_REGISTRY_KEY_RELATIONSHIP_PERSON, aane}}));
 		EXPECT_TRUE(pumpUntil([&] { return screen.viewCount() == 0; }, 3.0));
 	}
-	CtRegistryMgr::getInstance()->removeChangeListener(listener);
 }
 
 TEST_F(PickerViewsTest, SearchSurvivesInvalidUtf8AndOverlongTexts)
@@ -130,15 +119,12 @@ TEST_F(PickerViewsTest, LinkPickerLeavesOutTheBasePersonRefusesWithNoRoomAndLink
 	int other = addSimplePerson("Other", &otherContact);
 	addSimplePerson("Third");
 	for (int max : {0, 9}) {
-		app_control_h request = nullptr;
-		app_control_create(&request);
-		for (const auto& [key, value] : std::map<std::string, std::string>{{"type", "131"},
-				 {"ct_selected_person_id", std::to_string(base)}, {"ct_max", std::to_string(max)}, {"hide_create_button", "1"}})
-			app_control_add_extra_data(request, key.c_str(), value.c_str());
-		ContactsData data{0, request, nullptr, 0};
+		Request link = request(nullptr, {{"type", "131"}, {"ct_selected_person_id", std::to_string(base)},
+			{"ct_max", std::to_string(max)}, {"hide_create_button", "1"}});
+		ContactsData data{0, link.get(), nullptr, 0};
 		ScreenHarness screen;
 		auto* view = static_cast<CtContactPickerView*>(CtDllViewFactory::getInstance()->getCtListViewClass(&data));
-		app_control_destroy(request); // the picker keeps its own copy
+		link.reset(); // the picker keeps its own copy
 		ASSERT_TRUE(screen.push(view));
 		EXPECT_EQ(view->getLaunchType(), CtContactPickerView::kTypeLinkContacts);
 		EXPECT_EQ(view->getMaxCount(), max);
@@ -165,11 +151,10 @@ TEST_F(PickerViewsTest, PickerAnswersTheRequestThatStartedIt)
 		app_control_clone(&received, request);
 		return 0;
 	});
-	app_control_h request = nullptr;
-	app_control_create(&request);
-	app_control_set_app_id(request, "org.test.picker");
+	Request launch = request(nullptr);
+	app_control_set_app_id(launch.get(), "org.test.picker");
 	app_control_h reply = nullptr;
-	ASSERT_EQ(APP_CONTROL_ERROR_NONE, app_control_send_launch_request(request,
+	ASSERT_EQ(APP_CONTROL_ERROR_NONE, app_control_send_launch_request(launch.get(),
 		[](app_control_h, app_control_h answer, app_control_result_e result, void* data) {
 			EXPECT_EQ(result, APP_CONTROL_RESULT_SUCCEEDED);
 			app_control_clone(static_cast<app_control_h*>(data), answer);
@@ -197,7 +182,6 @@ TEST_F(PickerViewsTest, PickerAnswersTheRequestThatStartedIt)
 	EXPECT_EQ(take(id).get(), std::to_string(anna));
 	app_control_destroy(reply);
 	app_control_destroy(received);
-	app_control_destroy(request);
 }
 
 TEST_F(PickerViewsTest, UnlinkListSplitsContactsOffUntilOneIsLeft)

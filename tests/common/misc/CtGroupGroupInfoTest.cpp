@@ -6,13 +6,9 @@
 #include "CtGroupGroupInfo.h"
 #include "ScreenHarness.h"
 
-#include <string>
-#include <vector>
-
 using namespace ct::test;
 
 using CtGroupGroupInfoTest = StoreTest;
-
 
 TEST_F(CtGroupGroupInfoTest, GroupsOfSeveralAddressbooksGatherUnderTheirShownName)
 {

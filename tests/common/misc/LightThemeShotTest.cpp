@@ -8,12 +8,6 @@
 #include "WPopup.h"
 
 #include <Ecore_Evas.h>
-#include <gtest/gtest.h>
-
-#include <cstdlib>
-#include <filesystem>
-#include <string>
-#include <vector>
 
 using namespace ct::test;
 
@@ -46,8 +40,11 @@ class ShowcaseView : public app_assist::WView {
 protected:
 	Evas_Object* onCreate(Evas_Object* parent, void*) override
 	{
-		CtThemeMgr::getInstance()->addExtensionTheme(edj("contacts/contacts.edj").c_str());
-		CtThemeMgr::getInstance()->addExtensionTheme(edj("contacts/detail_layout.edj").c_str());
+		for (const char* name : {"contacts/contacts.edj", "contacts/detail_layout.edj"}) {
+			std::string path;
+			ContactsCommon::getAppEdjePath(name, path);
+			CtThemeMgr::getInstance()->addExtensionTheme(path.c_str());
+		}
 		Evas_Object* box = elm_box_add(parent);
 		evas_object_size_hint_weight_set(box, EVAS_HINT_EXPAND, EVAS_HINT_EXPAND);
 		Evas_Object* entry = elm_entry_add(box);
@@ -69,12 +66,6 @@ protected:
 	}
 
 private:
-	static std::string edj(const char* name)
-	{
-		std::string path;
-		ContactsCommon::getAppEdjePath(name, path);
-		return path;
-	}
 	static void pack(Evas_Object* box, Evas_Object* obj, double weightY)
 	{
 		evas_object_size_hint_weight_set(obj, EVAS_HINT_EXPAND, weightY);

@@ -2,41 +2,30 @@
 
 #include "AppControlRouter.h"
 #include "DataDir.h"
-#include "TempDataDir.h"
 #include "../../data/detail/DetailTestStore.h"
 
-#include <Ecore.h>
 #include <glib.h>
-#include <gtest/gtest.h>
 
 #include <cerrno>
 #include <cstdlib>
 #include <fstream>
-#include <string>
 #include <tuple>
 #include <sys/stat.h>
 
 namespace {
 
-std::string clean(const char* number, int size = 1024)
+// What a helper that fills a caller's buffer of `size` bytes leaves in it.
+template <typename Fill>
+std::string filled(Fill fill, const char* input, int size = 1024)
 {
 	char out[1024];
-	ctCommonCleanNumber(number, out, size);
-	return out;
-}
-
-std::string cleanForSim(const char* number, int size = 1024)
-{
-	char out[1024];
-	ctCommonCleanNumberForSim(number, out, size);
+	fill(input, out, size);
 	return out;
 }
 
 std::string displayName(const char* path, int size = 1024)
 {
-	char out[1024];
-	ctCommonGetDisplayfileName(path, out, size);
-	return out;
+	return filled(ctCommonGetDisplayfileName, path, size);
 }
 
 std::string readFile(const std::string& path)
@@ -54,11 +43,11 @@ TEST(CtCommonTextUtil, CleaningKeepsOnlyDialableCharactersAndNeverOverflows)
 		{"\xD9\xA1\xD9\xA2\xD9\xA3", "123"}, // Arabic-Indic digits dial as ASCII
 		{"12\xFF" "34", "12"}, {"\xff\xfe", ""}}; // only the valid UTF-8 prefix is read
 	for (const auto& [number, cleaned] : cases)
-		EXPECT_EQ(clean(number), cleaned) << (number ? number : "null");
+		EXPECT_EQ(filled(ctCommonCleanNumber, number), cleaned) << (number ? number : "null");
 	const std::pair<const char*, const char*> simCases[] = {{"+49 30-1234", "+49301234"},
 		{"0049+30+1", "0049301"}, {"123p4w5P6W7", "123,4;5,6;7"}, {"(555) abc", "555"}};
 	for (const auto& [number, cleaned] : simCases)
-		EXPECT_EQ(cleanForSim(number), cleaned) << number;
+		EXPECT_EQ(filled(ctCommonCleanNumberForSim, number), cleaned) << number;
 
 	std::string huge(5000, '7');
 	char out[16];
@@ -69,7 +58,7 @@ TEST(CtCommonTextUtil, CleaningKeepsOnlyDialableCharactersAndNeverOverflows)
 	EXPECT_EQ(ctCommonCleanNumber("123", out, 1), 0);
 	EXPECT_STREQ(out, "");
 	EXPECT_EQ(ctCommonCleanNumber("123", nullptr, 10), 0);
-	EXPECT_EQ(clean(huge.c_str()).size(), 1023u);
+	EXPECT_EQ(filled(ctCommonCleanNumber, huge.c_str()).size(), 1023u);
 }
 
 TEST(CtCommonTextUtil, MarkupBecomesValidPlainText)
@@ -182,9 +171,8 @@ TEST(CtCommonTextUtil, SimpleResultReachesTheCaller)
 	auto registration = ct::appcontrol::registerAppHandler("test.caller.app", [&](app_control_h request, const auto&) {
 		return app_control_clone(&kept, request);
 	});
-	app_control_h request = nullptr;
-	app_control_create(&request);
-	app_control_set_app_id(request, "test.caller.app");
+	ct::test::Request launch = ct::test::request(nullptr);
+	app_control_set_app_id(launch.get(), "test.caller.app");
 	// What the sender saw: the result and the "is_success" extra.
 	using Seen = std::pair<int, std::string>;
 	auto onReply = [](app_control_h, app_control_h reply, app_control_result_e result, void* data) {
@@ -197,13 +185,13 @@ TEST(CtCommonTextUtil, SimpleResultReachesTheCaller)
 		{nullptr, nullptr, APP_CONTROL_RESULT_CANCELED}, {"is_success", "1", APP_CONTROL_RESULT_SUCCEEDED}};
 	for (const auto& [key, value, result] : answers) {
 		Seen seen{-100, ""};
-		ASSERT_EQ(app_control_send_launch_request(request, onReply, &seen), 0);
+		ASSERT_EQ(app_control_send_launch_request(launch.get(), onReply, &seen), 0);
 		EXPECT_EQ(ctCommonSendSimpleAppControlResult(kept, key, value, result), 0);
 		EXPECT_TRUE(ct::test::pumpUntil([&] { return seen.first != -100; }, 2.0));
 		EXPECT_EQ(seen, Seen(result, value ? value : ""));
 		app_control_destroy(kept);
 	}
-	app_control_destroy(request);
+	launch.reset();
 	ecore_shutdown();
 	EXPECT_EQ(ctCommonSendSimpleAppControlResult(nullptr, nullptr, nullptr, APP_CONTROL_RESULT_FAILED),
 		APP_CONTROL_ERROR_INVALID_PARAMETER);

@@ -2,42 +2,17 @@
 #include "CtDetailData.h"
 #include "DetailTestStore.h"
 
-#include "CtRegistryMgr.h"
 #include "LogSink.h"
-#include "TempDataDir.h"
-
-#include <functional>
-#include <memory>
-#include <string>
-#include <vector>
 
 using namespace ct::test;
 
 namespace {
 
-class RecordingListener : public ICtChangeListener {
-public:
-	void onDbChanged(const char* viewUri) override
-	{
-		uris.push_back(viewUri ? viewUri : "");
-		if (onChange)
-			onChange();
-	}
-	void onCompleteGetContacts() override {}
-	void onConditionChagned() override {}
-
-	std::vector<std::string> uris;
-	std::function<void()> onChange;
-};
-
-class CtDetailDataChangeTest : public ::testing::Test {
+class CtDetailDataChangeTest : public StoreTest {
 protected:
 	void SetUp() override
 	{
-		ecore_init();
-		ASSERT_EQ(CONTACTS_ERROR_NONE, contacts_connect());
-		m_registryId = CtRegistryMgr::getInstance()->addChangeListener(
-			[this](ctRegistryKey key, int) { m_registryKeys.push_back(key); });
+		StoreTest::SetUp();
 		contacts_record_h a = newContact(0, "Alpha");
 		addImage(a, "/pics/a.jpg");
 		m_contactA = store(a);
@@ -53,9 +28,7 @@ protected:
 	void TearDown() override
 	{
 		m_data.reset();
-		CtRegistryMgr::getInstance()->removeChangeListener(m_registryId);
-		contacts_disconnect();
-		ecore_shutdown();
+		StoreTest::TearDown();
 	}
 
 	size_t callsAfterSettling(size_t before = 0)
@@ -65,11 +38,9 @@ protected:
 		return m_listener.uris.size();
 	}
 
-	TempDataDir m_dir;
 	RecordingListener m_listener;
 	std::unique_ptr<CtDetailData> m_data;
-	std::vector<ctRegistryKey> m_registryKeys;
-	int m_registryId = 0;
+	SignalRecorder m_signals;
 	int m_contactA = 0;
 	int m_contactB = 0;
 	int m_personId = 0;
@@ -78,15 +49,6 @@ protected:
 };
 
 } // namespace
-
-TEST_F(CtDetailDataChangeTest, UnrelatedContactChangesDoNotNotify)
-{
-	addNumberToStoredContact(m_otherContact, "555");
-	addSimplePerson("Newcomer");
-	ASSERT_EQ(CONTACTS_ERROR_NONE, contacts_db_delete_record(_contacts_person._uri, m_otherPerson));
-	settle(1.0);
-	EXPECT_TRUE(m_listener.uris.empty());
-}
 
 TEST_F(CtDetailDataChangeTest, EachChangeOfThePersonNotifiesOnce)
 {
@@ -109,11 +71,9 @@ TEST_F(CtDetailDataChangeTest, EachChangeOfThePersonNotifiesOnce)
 	EXPECT_EQ(3u, callsAfterSettling(2));
 
 	int otherImage = 0;
-	Eina_List* l = nullptr;
-	void* record = nullptr;
-	EINA_LIST_FOREACH(m_data->getImageList(), l, record) {
+	for (Eina_List* l = m_data->getImageList(); l; l = eina_list_next(l)) {
 		int id = 0;
-		contacts_record_get_int(static_cast<contacts_record_h>(record), _contacts_image.id, &id);
+		contacts_record_get_int(static_cast<contacts_record_h>(eina_list_data_get(l)), _contacts_image.id, &id);
 		if (id != m_data->getDefaultImageId())
 			otherImage = id;
 	}
@@ -129,7 +89,7 @@ TEST_F(CtDetailDataChangeTest, EachChangeOfThePersonNotifiesOnce)
 	EXPECT_EQ(5u, callsAfterSettling(4));
 }
 
-TEST_F(CtDetailDataChangeTest, PhoneLogChangeRaisesTheRegistrySignalOnly)
+TEST_F(CtDetailDataChangeTest, UnrelatedContactsAndPhoneLogChangesDoNotNotify)
 {
 	contacts_record_h log = nullptr;
 	contacts_record_create(_contacts_phone_log._uri, &log);
@@ -137,10 +97,14 @@ TEST_F(CtDetailDataChangeTest, PhoneLogChangeRaisesTheRegistrySignalOnly)
 	contacts_record_set_int(log, _contacts_phone_log.log_type, CONTACTS_PLOG_TYPE_VOICE_INCOMING);
 	ASSERT_EQ(CONTACTS_ERROR_NONE, contacts_db_insert_record(log, nullptr));
 	contacts_record_destroy(log, true);
-	EXPECT_TRUE(pumpUntil([this] { return !m_registryKeys.empty(); }, 2.0));
+	EXPECT_TRUE(pumpUntil([this] { return !m_signals.signals.empty(); }, 2.0));
 	settle();
-	ASSERT_EQ(1u, m_registryKeys.size());
-	EXPECT_EQ(CT_REGISTRY_KEY_PHONELOG_CHANGED, m_registryKeys.front());
+	EXPECT_EQ(1u, m_signals.signals.size());
+	EXPECT_EQ(1, m_signals.count(CT_REGISTRY_KEY_PHONELOG_CHANGED));
+	addNumberToStoredContact(m_otherContact, "555");
+	addSimplePerson("Newcomer");
+	ASSERT_EQ(CONTACTS_ERROR_NONE, contacts_db_delete_record(_contacts_person._uri, m_otherPerson));
+	settle(1.0);
 	EXPECT_TRUE(m_listener.uris.empty());
 }
 
@@ -165,19 +129,11 @@ TEST_F(CtDetailDataChangeTest, ListenerMayDeleteTheDataInsideItsCallback)
 	EXPECT_EQ(1u, m_listener.uris.size());
 }
 
-TEST_F(CtDetailDataChangeTest, NullListenerIsRefusedAndDetachedListenerHearsNothing)
+TEST_F(CtDetailDataChangeTest, GalEntryMissingPersonNullAndDetachedListenersHearNothing)
 {
 	ct::log::clear();
 	m_data->attachListener(nullptr);
 	EXPECT_TRUE(ct::log::contains("* Critical * listener is NULL", DLOG_ERROR));
-	m_data->detachListener();
-	addNumberToStoredContact(m_contactA, "321");
-	settle(1.0);
-	EXPECT_TRUE(m_listener.uris.empty());
-}
-
-TEST_F(CtDetailDataChangeTest, GalEntryAndMissingPersonNeverNotify)
-{
 	CtGalSearchData entry = {nullptr, nullptr, "Gal", "1", nullptr, nullptr, nullptr, nullptr};
 	CtDetailData gal(&entry);
 	RecordingListener galListener;
@@ -186,9 +142,12 @@ TEST_F(CtDetailDataChangeTest, GalEntryAndMissingPersonNeverNotify)
 	RecordingListener nobodyListener;
 	nobody.attachListener(&nobodyListener);
 
-	addNumberToStoredContact(m_otherContact, "1");
 	addNumberToStoredContact(m_contactA, "2");
 	EXPECT_EQ(1u, callsAfterSettling());
 	EXPECT_TRUE(galListener.uris.empty());
 	EXPECT_TRUE(nobodyListener.uris.empty());
+	m_data->detachListener();
+	addNumberToStoredContact(m_contactA, "321");
+	settle();
+	EXPECT_EQ(1u, m_listener.uris.size());
 }

@@ -9,46 +9,31 @@
 #include "CtCommonRecordUtil.h"
 #include "LogSink.h"
 #include "SqliteFaultInjector.h"
-#include "TempDataDir.h"
-
 
 #include <glib.h>
 
 #include <cstdio>
 #include <fstream>
-#include <memory>
-#include <string>
-#include <vector>
 
 using namespace ct::test;
 
 namespace {
 
+contacts_record_h first(Eina_List* list)
+{
+	return static_cast<contacts_record_h>(eina_list_data_get(list));
+}
+
 std::vector<std::string> numbersOf(CtDetailData& data)
 {
 	std::vector<std::string> out;
-	Eina_List* l = nullptr;
-	void* record = nullptr;
-	EINA_LIST_FOREACH(data.getNumberList(), l, record)
-		out.push_back(data.getNumber(static_cast<contacts_record_h>(record)));
+	for (Eina_List* l = data.getNumberList(); l; l = eina_list_next(l))
+		out.push_back(data.getNumber(first(l)));
 	return out;
 }
 
-class CtDetailDataLoadTest : public ::testing::Test {
+class CtDetailDataLoadTest : public StoreTest {
 protected:
-	TempDataDir m_dir;
-
-	void SetUp() override
-	{
-		ecore_init();
-		ASSERT_EQ(CONTACTS_ERROR_NONE, contacts_connect());
-	}
-	void TearDown() override
-	{
-		contacts_disconnect();
-		ecore_shutdown();
-	}
-
 	// Ann (phone book, rich) linked with Bob's contact of a second account.
 	int addRichLinkedPerson(int* annContact, int* otherContact)
 	{
@@ -58,32 +43,25 @@ protected:
 		contacts_record_get_child_record_at_p(ann, _contacts_contact.name, 0, &name);
 		contacts_record_set_str(name, _contacts_name.phonetic_first, "An");
 		contacts_record_set_str(name, _contacts_name.phonetic_last, "Lee");
-		contacts_record_set_str(addChild(ann, _contacts_contact.nickname, _contacts_nickname._uri),
-			_contacts_nickname.name, "Annie");
-		contacts_record_h company = addChild(ann, _contacts_contact.company, _contacts_company._uri);
-		contacts_record_set_str(company, _contacts_company.name, "Acme");
+		addText(ann, _contacts_contact.nickname, _contacts_nickname._uri, _contacts_nickname.name, "Annie");
+		contacts_record_h company = addText(ann, _contacts_contact.company, _contacts_company._uri, _contacts_company.name, "Acme");
 		contacts_record_set_str(company, _contacts_company.department, "Sales");
 		contacts_record_set_str(company, _contacts_company.job_title, "Manager");
 		addNumber(ann, "111", CONTACTS_NUMBER_TYPE_CELL);
 		addNumber(ann, "222", CONTACTS_NUMBER_TYPE_CUSTOM, "Boat");
 		addEmail(ann, "ann@example.com");
-		contacts_record_h address = addChild(ann, _contacts_contact.address, _contacts_address._uri);
-		contacts_record_set_str(address, _contacts_address.street, "1 Main St");
+		contacts_record_h address = addText(ann, _contacts_contact.address, _contacts_address._uri, _contacts_address.street, "1 Main St");
 		contacts_record_set_str(address, _contacts_address.locality, "Springfield");
 		contacts_record_set_str(address, _contacts_address.country, "USA");
-		contacts_record_set_str(addChild(ann, _contacts_contact.messenger, _contacts_messenger._uri),
-			_contacts_messenger.im_id, "ann.im");
-		contacts_record_set_str(addChild(ann, _contacts_contact.url, _contacts_url._uri), _contacts_url.url,
-			"https://ann.example.com");
-		contacts_record_set_str(addChild(ann, _contacts_contact.relationship, _contacts_relationship._uri),
-			_contacts_relationship.name, "Carl");
+		addText(ann, _contacts_contact.messenger, _contacts_messenger._uri, _contacts_messenger.im_id, "ann.im");
+		addText(ann, _contacts_contact.url, _contacts_url._uri, _contacts_url.url, "https://ann.example.com");
+		addText(ann, _contacts_contact.relationship, _contacts_relationship._uri, _contacts_relationship.name, "Carl");
 		contacts_record_h event = addChild(ann, _contacts_contact.event, _contacts_event._uri);
 		contacts_record_set_int(event, _contacts_event.type, CONTACTS_EVENT_TYPE_BIRTH);
 		contacts_record_set_int(event, _contacts_event.date, 19800102);
 		contacts_record_set_int(event, _contacts_event.calendar_type, CONTACTS_EVENT_CALENDAR_TYPE_LUNAR);
 		contacts_record_set_bool(event, _contacts_event.is_leap_month, true);
-		contacts_record_set_str(addChild(ann, _contacts_contact.note, _contacts_note._uri), _contacts_note.note,
-			"likes tea");
+		addText(ann, _contacts_contact.note, _contacts_note._uri, _contacts_note.note, "likes tea");
 		addImage(ann, "/images/ann1.jpg", 1);
 		*annContact = store(ann);
 
@@ -102,17 +80,10 @@ TEST_F(CtDetailDataLoadTest, RichLinkedPersonLoadsEveryFieldOverAllContactsInOrd
 {
 	int annContact = 0, otherContact = 0;
 	int personId = addRichLinkedPerson(&annContact, &otherContact);
-	int groupId = 0;
-	contacts_record_h group = nullptr;
-	contacts_record_create(_contacts_group._uri, &group);
-	contacts_record_set_str(group, _contacts_group.name, "Climbers");
-	ASSERT_EQ(CONTACTS_ERROR_NONE, contacts_db_insert_record(group, &groupId));
-	contacts_record_destroy(group, true);
-	ASSERT_EQ(CONTACTS_ERROR_NONE, contacts_group_add_contact(groupId, annContact));
+	ASSERT_EQ(CONTACTS_ERROR_NONE, contacts_group_add_contact(addGroup(0, "Climbers"), annContact));
 
 	CtDetailData data(personId);
 	EXPECT_EQ(personId, data.getPersonId());
-	EXPECT_EQ(2u, eina_list_count(data.getContactsList()));
 	EXPECT_NE(nullptr, data.getDisplayName());
 	EXPECT_STREQ("Acme Sales, Manager", data.getCompany());
 	EXPECT_STREQ("Annie", data.getExtraName1First());
@@ -123,40 +94,34 @@ TEST_F(CtDetailDataLoadTest, RichLinkedPersonLoadsEveryFieldOverAllContactsInOrd
 	contacts_record_h custom = static_cast<contacts_record_h>(eina_list_nth(data.getNumberList(), 1));
 	EXPECT_EQ(CONTACTS_NUMBER_TYPE_CUSTOM, data.getDataType(custom, _contacts_number.type));
 	EXPECT_STREQ("Boat", data.getDataTypeCustom(custom, _contacts_number.label));
-	EXPECT_EQ(2u, eina_list_count(data.getEmailList()));
-	EXPECT_STREQ("ann@example.com", data.getEmail(static_cast<contacts_record_h>(eina_list_data_get(data.getEmailList()))));
-
 	char address[1024] = {0};
-	data.getAddress(static_cast<contacts_record_h>(eina_list_data_get(data.getAddressList())), address, sizeof(address));
+	data.getAddress(first(data.getAddressList()), address, sizeof(address));
 	EXPECT_STREQ("Springfield\n1 Main St\nUSA", address);
 	char small[8] = {0};
-	data.getAddress(static_cast<contacts_record_h>(eina_list_data_get(data.getAddressList())), small, sizeof(small));
+	data.getAddress(first(data.getAddressList()), small, sizeof(small));
 	EXPECT_STREQ("Springf", small);
 
-	EXPECT_STREQ("ann.im", data.getMessenger(static_cast<contacts_record_h>(eina_list_data_get(data.getMessengerList()))));
-	EXPECT_STREQ("https://ann.example.com", data.getUrl(static_cast<contacts_record_h>(eina_list_data_get(data.getUrlList()))));
-	EXPECT_STREQ("Carl", data.getRelationship(static_cast<contacts_record_h>(eina_list_data_get(data.getRelationshipList()))));
-	contacts_record_h event = static_cast<contacts_record_h>(eina_list_data_get(data.getEventList()));
+	contacts_record_h event = first(data.getEventList());
+	EXPECT_EQ((std::vector<std::string>{"ann@example.com", "ann.im", "https://ann.example.com", "Carl", "likes tea"}),
+		(std::vector<std::string>{data.getEmail(first(data.getEmailList())), data.getMessenger(first(data.getMessengerList())),
+			data.getUrl(first(data.getUrlList())), data.getRelationship(first(data.getRelationshipList())),
+			data.getNote(first(data.getNoteList()))}));
 	EXPECT_EQ(19800102, data.getEvent(event));
 	EXPECT_EQ(CONTACTS_EVENT_CALENDAR_TYPE_LUNAR, data.getCalendarType(event));
 	EXPECT_TRUE(data.getIsLeapMonth(event));
-	EXPECT_STREQ("likes tea", data.getNote(static_cast<contacts_record_h>(eina_list_data_get(data.getNoteList()))));
-	EXPECT_EQ(2u, eina_list_count(data.getNameList()));
-	EXPECT_EQ(2u, eina_list_count(data.getImageList()));
+	EXPECT_EQ((std::vector<unsigned>(4, 2)), (std::vector<unsigned>{eina_list_count(data.getContactsList()),
+		eina_list_count(data.getEmailList()), eina_list_count(data.getNameList()), eina_list_count(data.getImageList())}));
 
 	std::unique_ptr<char, decltype(&free)> second(data.getImagePath(2), free);
 	EXPECT_STREQ("/images/ann2.jpg", second.get());
-	EXPECT_EQ(nullptr, data.getImagePath(3));
-	EXPECT_EQ(nullptr, data.getImagePath(0));
-	EXPECT_EQ(nullptr, data.getImagePath(6));
+	for (int order : {0, 3, 6})
+		EXPECT_EQ(nullptr, data.getImagePath(order)) << order;
 	EXPECT_TRUE(ct::log::contains("* Critical * Invalid Param : order : 6"));
 
 	EXPECT_TRUE(data.getNameContactId() == annContact || data.getNameContactId() == otherContact);
 	EXPECT_EQ("Climbers", data.getGroupNames());
 
-	EXPECT_FALSE(data.getReadOnlyMode());
-	EXPECT_FALSE(data.getFacebookMode());
-	EXPECT_FALSE(data.isSimContact());
+	EXPECT_FALSE(data.getReadOnlyMode() || data.getFacebookMode() || data.isSimContact());
 	EXPECT_TRUE(data.isCurrentPersonValid());
 	std::unique_ptr<char, decltype(&free)> vcard(data.getVcardStream(), free);
 	ASSERT_NE(nullptr, vcard.get());
@@ -178,22 +143,15 @@ TEST_F(CtDetailDataLoadTest, BarePersonShowsNotAssignedAndAMissingOneGivesAnEmpt
 
 	for (int personId : {0, -7, deleted, 999999}) {
 		CtDetailData data(personId);
-		EXPECT_EQ(0, data.getPersonId());
-		EXPECT_EQ(nullptr, data.getDisplayName());
-		EXPECT_EQ(nullptr, data.getContactsList());
-		EXPECT_EQ(nullptr, data.getNumberList());
-		EXPECT_EQ(nullptr, data.getImageList());
-		EXPECT_EQ(nullptr, data.getImagePath(1));
-		EXPECT_EQ(0, data.getDefaultImageId());
-		EXPECT_EQ(0, data.getNameContactId());
-		EXPECT_FALSE(data.isFavorite());
+		for (const void* empty : {(const void*)data.getDisplayName(), (const void*)data.getContactsList(),
+				 (const void*)data.getNumberList(), (const void*)data.getImageList(), (const void*)data.getImagePath(1),
+				 (const void*)data.getContactsWithoutFacebook(), (const void*)data.getVcardStream()})
+			EXPECT_EQ(nullptr, empty) << personId;
+		EXPECT_EQ((std::vector<int>{0, 0, 0}), (std::vector<int>{data.getPersonId(), data.getDefaultImageId(),
+			data.getNameContactId()}));
 		EXPECT_EQ("", data.getGroupNames());
-		EXPECT_FALSE(data.isCurrentPersonValid());
-		EXPECT_FALSE(data.isSimContact());
-		EXPECT_TRUE(data.getReadOnlyMode());
-		EXPECT_TRUE(data.getFacebookMode());
-		EXPECT_EQ(nullptr, data.getContactsWithoutFacebook());
-		EXPECT_EQ(nullptr, data.getVcardStream());
+		EXPECT_FALSE(data.isFavorite() || data.isCurrentPersonValid() || data.isSimContact());
+		EXPECT_TRUE(data.getReadOnlyMode() && data.getFacebookMode());
 		data.setFavorite(true);
 		data.setRingtone("/x.ogg");
 		EXPECT_FALSE(data.isFavorite());
@@ -210,7 +168,6 @@ TEST_F(CtDetailDataLoadTest, FavoriteAndRingtoneWritesPersistAndAFailedWriteKeep
 		EXPECT_FALSE(data.isFavorite());
 		data.setFavorite(true);
 		data.setRingtone(tone.c_str());
-		EXPECT_TRUE(data.isFavorite());
 	}
 	reopenStore();
 	{
@@ -233,7 +190,12 @@ TEST_F(CtDetailDataLoadTest, FavoriteAndRingtoneWritesPersistAndAFailedWriteKeep
 	EXPECT_EQ(nullptr, data.getRingtonePath());
 	EXPECT_TRUE(ct::log::contains("contacts_db_update_record() Failed(-28)"));
 	reopenStore();
-	EXPECT_EQ("<null>", personText(personId, _contacts_person.ringtone_path));
+	contacts_record_h person = nullptr;
+	ASSERT_EQ(CONTACTS_ERROR_NONE, contacts_db_get_record(_contacts_person._uri, personId, &person));
+	char* ringtone = nullptr;
+	contacts_record_get_str_p(person, _contacts_person.ringtone_path, &ringtone);
+	EXPECT_EQ(nullptr, ringtone);
+	contacts_record_destroy(person, true);
 	CtDetailData reread(personId);
 	EXPECT_TRUE(reread.isFavorite());
 }
@@ -248,8 +210,7 @@ TEST_F(CtDetailDataLoadTest, ReadOnlySocialAndSimModesFollowTheAddressBooks)
 	{
 		CtDetailData data(personOf(roContact));
 		EXPECT_TRUE(data.getReadOnlyMode());
-		EXPECT_FALSE(data.getFacebookMode());
-		EXPECT_FALSE(data.isSimContact());
+		EXPECT_FALSE(data.getFacebookMode() || data.isSimContact());
 	}
 	int fbContact = store(newContact(social, "Fb"));
 	{
@@ -266,15 +227,11 @@ TEST_F(CtDetailDataLoadTest, ReadOnlySocialAndSimModesFollowTheAddressBooks)
 		Eina_List* others = data.getContactsWithoutFacebook();
 		ASSERT_EQ(2u, eina_list_count(others));
 		int id = 0;
-		contacts_record_get_int(static_cast<contacts_record_h>(eina_list_data_get(others)), _contacts_contact.id, &id);
+		contacts_record_get_int(first(others), _contacts_contact.id, &id);
 		EXPECT_NE(fbContact, id);
 		ctCommonDestroyRecordList(others);
 	}
-	int simContact = store(newContact(sim, "Sim"));
-	{
-		CtDetailData data(personOf(simContact));
-		EXPECT_TRUE(data.isSimContact());
-	}
+	EXPECT_TRUE(CtDetailData(personOf(store(newContact(sim, "Sim")))).isSimContact());
 }
 
 TEST_F(CtDetailDataLoadTest, GalEntryBuildsInMemoryRecordsAndStoresNothing)
@@ -288,13 +245,11 @@ TEST_F(CtDetailDataLoadTest, GalEntryBuildsInMemoryRecordsAndStoresNothing)
 		EXPECT_STREQ("Corp", data.getCompany());
 		EXPECT_EQ((std::vector<std::string>{"100", "200", "300"}), numbersOf(data));
 		std::vector<int> types;
-		Eina_List* l = nullptr;
-		void* record = nullptr;
-		EINA_LIST_FOREACH(data.getNumberList(), l, record)
-			types.push_back(data.getDataType(static_cast<contacts_record_h>(record), _contacts_number.type));
+		for (Eina_List* l = data.getNumberList(); l; l = eina_list_next(l))
+			types.push_back(data.getDataType(first(l), _contacts_number.type));
 		EXPECT_EQ((std::vector<int>{4, 64, 2}), types);
 		ASSERT_EQ(1u, eina_list_count(data.getEmailList()));
-		contacts_record_h email = static_cast<contacts_record_h>(eina_list_data_get(data.getEmailList()));
+		contacts_record_h email = first(data.getEmailList());
 		EXPECT_STREQ("gail@corp.com", data.getEmail(email));
 		EXPECT_EQ(4, data.getDataType(email, _contacts_email.type));
 		EXPECT_FALSE(data.isCurrentPersonValid());
@@ -303,8 +258,7 @@ TEST_F(CtDetailDataLoadTest, GalEntryBuildsInMemoryRecordsAndStoresNothing)
 	{
 		CtDetailData data(&secondOnly);
 		ASSERT_EQ(1u, eina_list_count(data.getNumberList()));
-		contacts_record_h number = static_cast<contacts_record_h>(eina_list_data_get(data.getNumberList()));
-		EXPECT_EQ(64, data.getDataType(number, _contacts_number.type));
+		EXPECT_EQ(64, data.getDataType(first(data.getNumberList()), _contacts_number.type));
 		EXPECT_EQ(nullptr, data.getEmailList());
 		EXPECT_EQ(nullptr, data.getDisplayName());
 	}

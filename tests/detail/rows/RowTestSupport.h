@@ -13,15 +13,8 @@
 #include "CtDetailViewItemOwner.h"
 #include "CtThemeMgr.h"
 #include "ScreenHarness.h"
-#include "TempDataDir.h"
 #include "UsageLog.h"
 #include "WView.h"
-
-#include <gtest/gtest.h>
-
-#include <memory>
-#include <string>
-#include <vector>
 
 namespace ct::test {
 

@@ -18,7 +18,6 @@
 
 #include <array>
 #include <fstream>
-#include <map>
 
 using namespace ct::test;
 
@@ -108,9 +107,8 @@ TEST_F(TextRowsTest, EmailRowComposesWithAReplyRequestUnlessPowerSavingOrNoEmail
 TEST_F(TextRowsTest, AddressRowWrapsTheAddressAndAsksItsOwnerForTheMap)
 {
 	contacts_record_h contact = newContact(0, "Ari");
-	contacts_record_h address = addChild(contact, _contacts_contact.address, _contacts_address._uri);
+	contacts_record_h address = addText(contact, _contacts_contact.address, _contacts_address._uri, _contacts_address.street, "12 Harbour Road");
 	contacts_record_set_int(address, _contacts_address.type, CONTACTS_ADDRESS_TYPE_HOME);
-	contacts_record_set_str(address, _contacts_address.street, "12 Harbour Road");
 	contacts_record_set_str(address, _contacts_address.locality, "Portsmouth");
 	CtDetailData* data = load(storePerson(contact));
 	contacts_record_h record = nth(data->getAddressList());
@@ -136,7 +134,7 @@ TEST_F(TextRowsTest, WebsiteRowOpensTheUrlAddingHttpOnlyWhenMissing)
 {
 	contacts_record_h contact = newContact(0, "Ari");
 	for (const char* url : {"example.org/ari", "https://secure.example.org"})
-		contacts_record_set_str(addChild(contact, _contacts_contact.url, _contacts_url._uri), _contacts_url.url, url);
+		addText(contact, _contacts_contact.url, _contacts_url._uri, _contacts_url.url, url);
 	CtDetailData* data = load(storePerson(contact));
 	ASSERT_EQ(2u, eina_list_count(data->getUrlList()));
 	Elm_Object_Item* plain = show(new CtDetailViewWebsiteItem(data, nth(data->getUrlList(), 0)));
@@ -183,8 +181,6 @@ TEST_F(TextRowsTest, EventRowsFormatDatesWithAndWithoutYearAndMarkLunarDates)
 	for (const auto& [date, value] : expected)
 		EXPECT_EQ(value, text(rows[date], "elm.text.main.left.bottom")) << date;
 	EXPECT_EQ(tr("IDS_PB_OPT_BIRTHDAY"), text(rows[19900315], "elm.text.sub.left.top"));
-	EXPECT_NE(std::string::npos, expected.at(19900315).find("1990"));
-	EXPECT_EQ(std::string::npos, expected.at(1224).find("0000"));
 
 	ct::log::clear();
 	EXPECT_EQ("", rowOf(rows[20011315])->getCopyText());
@@ -195,15 +191,12 @@ TEST_F(TextRowsTest, EventRowsFormatDatesWithAndWithoutYearAndMarkLunarDates)
 TEST_F(TextRowsTest, MessengerRelationAndNoteRowsShowTheirValuesAndOnlyClearTheSelection)
 {
 	contacts_record_h contact = newContact(0, "Ari");
-	contacts_record_h im = addChild(contact, _contacts_contact.messenger, _contacts_messenger._uri);
+	contacts_record_h im = addText(contact, _contacts_contact.messenger, _contacts_messenger._uri, _contacts_messenger.im_id, "ari_42");
 	contacts_record_set_int(im, _contacts_messenger.type, CONTACTS_MESSENGER_TYPE_CUSTOM);
 	contacts_record_set_str(im, _contacts_messenger.label, "Chatter");
-	contacts_record_set_str(im, _contacts_messenger.im_id, "ari_42");
-	contacts_record_h relation = addChild(contact, _contacts_contact.relationship, _contacts_relationship._uri);
-	contacts_record_set_int(relation, _contacts_relationship.type, CONTACTS_RELATIONSHIP_TYPE_SISTER);
-	contacts_record_set_str(relation, _contacts_relationship.name, "Bo");
-	contacts_record_h note = addChild(contact, _contacts_contact.note, _contacts_note._uri);
-	contacts_record_set_str(note, _contacts_note.note, "Line one\nLine two & more");
+	contacts_record_set_int(addText(contact, _contacts_contact.relationship, _contacts_relationship._uri,
+		_contacts_relationship.name, "Bo"), _contacts_relationship.type, CONTACTS_RELATIONSHIP_TYPE_SISTER);
+	addText(contact, _contacts_contact.note, _contacts_note._uri, _contacts_note.note, "Line one\nLine two & more");
 	CtDetailData* data = load(storePerson(contact));
 
 	Elm_Object_Item* imItem = show(new CtDetailViewMessengerItem(data, nth(data->getMessengerList())));

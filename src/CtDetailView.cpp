@@ -350,24 +350,41 @@ void CtDetailView::__addAllItems()
 	m_eventIndex = m_relationshipIndex = m_websiteIndex = m_messengerIndex = 0;
 	m_currentKind = KIND_PICTURE;
 	__stopAddingRows();
-	// The first rows go in at once, so the screen's first frame shows them;
-	// the rest follow one per frame once that frame is drawn.
+	// The first rows go in at once, so the screen's first frame shows them.
 	if (__addItemsForFrame())
-		m_firstFrame = std::make_unique<app_assist::WNextFrame>(m_genlist, [this] {
-			m_rowAnimator = app_assist::WUiTimer::addAnimator(
-				[this](void*) { return __addItemsForFrame(); }, nullptr, this);
-		});
+		__waitForDrawnRows();
+}
+
+// The rest follow one per drawn frame. A running animator holds the canvas's
+// next frame back to its tick, so it starts only once the first frame is
+// drawn; and a tick that comes before the last row was drawn adds nothing.
+void CtDetailView::__waitForDrawnRows()
+{
+	m_drawnRows = std::make_unique<app_assist::WNextFrame>(m_genlist, [this] {
+		if (!app_assist::WUiTimer::isAlive(m_rowAnimator))
+			m_rowAnimator = app_assist::WUiTimer::addAnimator([this](void*) { return __onRowTick(); }, nullptr, this);
+	});
+}
+
+bool CtDetailView::__onRowTick()
+{
+	if (m_drawnRows && m_drawnRows->isPending())
+		return true;
+	if (!__addItemsForFrame())
+		return false;
+	__waitForDrawnRows();
+	return true;
 }
 
 void CtDetailView::__stopAddingRows()
 {
-	m_firstFrame.reset();
+	m_drawnRows.reset();
 	app_assist::WUiTimer::destroy(m_rowAnimator);
 }
 
 bool CtDetailView::isBuildingRows() const
 {
-	return (m_firstFrame && m_firstFrame->isPending()) || app_assist::WUiTimer::isAlive(m_rowAnimator);
+	return (m_drawnRows && m_drawnRows->isPending()) || app_assist::WUiTimer::isAlive(m_rowAnimator);
 }
 
 bool CtDetailView::__addItemsForFrame()

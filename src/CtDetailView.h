@@ -83,6 +83,8 @@ private:
 	void __connectCallBlock();
 	void __disconnectCallBlock();
 	void __addAllItems();
+	void __waitForDrawnRows();
+	bool __onRowTick();
 	void __stopAddingRows();
 	bool __addItemsForFrame();
 	bool __addItemOfKind(int& budget);
@@ -152,7 +154,7 @@ private:
 	std::weak_ptr<app_assist::WControl> m_popup;
 	bool m_rebuiltWhileShown = false;
 
-	std::unique_ptr<app_assist::WNextFrame> m_firstFrame;
+	std::unique_ptr<app_assist::WNextFrame> m_drawnRows;
 	app_assist::WUiTimerHandle m_rowAnimator;
 	Evas_Object* m_naviframeObj = nullptr;
 	int m_rebuildCount = 0;

@@ -53,8 +53,8 @@ void collect(const std::string& text, const char* pattern, std::set<std::string>
 	}
 }
 
-// The names the detail screens (src/), the shared widgets (common/) and the
-// host application ask for.
+// The names the screens (src/ and its folders), the shared widgets (common/)
+// and the host application ask for.
 AskedNames scanSources()
 {
 	const char* style = R"(getItemStyle\(\) override \{ return ([^;]+);)";
@@ -63,7 +63,9 @@ AskedNames scanSources()
 	const char* part = R"(("(?:elm|touch|copy|main|sub|image|favor)\.[a-z0-9._]+"))";
 	AskedNames names;
 	for (const char* dir : {"src", "common", "host"}) {
-		for (const auto& entry : std::filesystem::directory_iterator(sourceRoot() + "/" + dir)) {
+		for (const auto& entry : std::filesystem::recursive_directory_iterator(sourceRoot() + "/" + dir)) {
+			if (!entry.is_regular_file())
+				continue;
 			std::stringstream read;
 			read << std::ifstream(entry.path()).rdbuf();
 			const std::string text = read.str();

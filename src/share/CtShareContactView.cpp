@@ -20,7 +20,11 @@ namespace {
 
 constexpr const char* kEdjFiles[] = {"contacts/contacts.edj", "contacts/detail_layout.edj"};
 constexpr const char* kResultKey = "person_info";
-constexpr int kPreviewHeight = 150;
+constexpr double kPreviewWeight = 0.4;
+constexpr const char* kPreviewTitleOpen = "<left_margin=16 font_size=13 color=#6B7280FF>";
+constexpr const char* kPreviewTitleClose = "</>";
+constexpr const char* kPreviewTextOpen = "<align=left left_margin=16 right_margin=16 font_size=14 color=#1F2328FF>";
+constexpr const char* kPreviewTextClose = "</>";
 
 // The translated `pattern` with its "%d" replaced by `count`; a translation
 // is never used as a printf format.
@@ -122,27 +126,39 @@ void CtShareContactView::__addExtensionThemes()
 Evas_Object* CtShareContactView::__createPreview(Evas_Object* parent)
 {
 	Evas_Object* panel = elm_box_add(parent);
-	evas_object_size_hint_weight_set(panel, EVAS_HINT_EXPAND, 0.0);
+	// The list keeps most of the height; the preview takes a share of it.
+	evas_object_size_hint_weight_set(panel, EVAS_HINT_EXPAND, kPreviewWeight);
 	evas_object_size_hint_align_set(panel, EVAS_HINT_FILL, EVAS_HINT_FILL);
-	elm_box_padding_set(panel, 0, 4);
+	elm_box_padding_set(panel, 0, ELM_SCALE_SIZE(4));
 
 	m_previewTitle = elm_label_add(panel);
-	elm_object_text_set(m_previewTitle, ContactsCommon::translate("IDS_PB_HEADER_PREVIEW"));
+	__setPreviewTitle();
+	evas_object_size_hint_weight_set(m_previewTitle, EVAS_HINT_EXPAND, 0.0);
 	evas_object_size_hint_align_set(m_previewTitle, 0.0, 0.5);
 	evas_object_show(m_previewTitle);
 	elm_box_pack_end(panel, m_previewTitle);
 
-	m_preview = elm_entry_add(panel);
-	elm_entry_editable_set(m_preview, EINA_FALSE);
-	elm_entry_scrollable_set(m_preview, EINA_TRUE);
-	elm_entry_line_wrap_set(m_preview, ELM_WRAP_MIXED);
+	Evas_Object* scroller = elm_scroller_add(panel);
+	elm_scroller_policy_set(scroller, ELM_SCROLLER_POLICY_OFF, ELM_SCROLLER_POLICY_AUTO);
+	evas_object_size_hint_weight_set(scroller, EVAS_HINT_EXPAND, EVAS_HINT_EXPAND);
+	evas_object_size_hint_align_set(scroller, EVAS_HINT_FILL, EVAS_HINT_FILL);
+	m_preview = elm_label_add(scroller);
+	elm_label_line_wrap_set(m_preview, ELM_WRAP_MIXED);
 	evas_object_size_hint_weight_set(m_preview, EVAS_HINT_EXPAND, 0.0);
-	evas_object_size_hint_align_set(m_preview, EVAS_HINT_FILL, EVAS_HINT_FILL);
-	evas_object_size_hint_min_set(m_preview, 0, ELM_SCALE_SIZE(kPreviewHeight));
+	evas_object_size_hint_align_set(m_preview, EVAS_HINT_FILL, 0.0);
 	evas_object_show(m_preview);
-	elm_box_pack_end(panel, m_preview);
+	elm_object_content_set(scroller, m_preview);
+	evas_object_show(scroller);
+	elm_box_pack_end(panel, scroller);
 	evas_object_show(panel);
 	return panel;
+}
+
+void CtShareContactView::__setPreviewTitle()
+{
+	std::string markup = std::string(kPreviewTitleOpen)
+		+ ctCommonUtf8ToMarkup(ContactsCommon::translate("IDS_PB_HEADER_PREVIEW")) + kPreviewTitleClose;
+	elm_object_text_set(m_previewTitle, markup.c_str());
 }
 
 void CtShareContactView::onDestroy()
@@ -266,7 +282,7 @@ std::string CtShareContactView::getPreviewText() const
 {
 	if (!m_preview)
 		return std::string();
-	char* plain = elm_entry_markup_to_utf8(elm_entry_entry_get(m_preview));
+	char* plain = elm_entry_markup_to_utf8(elm_object_text_get(m_preview));
 	std::string text = plain ? plain : "";
 	free(plain);
 	return text;
@@ -289,7 +305,7 @@ void CtShareContactView::__updateTitle()
 	Elm_Object_Item* naviItem = getNaviItem();
 	WPRET_M(!naviItem, "naviItem is nullptr");
 	std::string title = formatCount(ContactsCommon::translate("IDS_PB_HEADER_PD_SELECTED_ABB3"), m_selectedCount);
-	elm_object_item_part_text_set(naviItem, "elm.text.title", ctCommonUtf8ToMarkup(title.c_str()).c_str());
+	setTitle(ctCommonUtf8ToMarkup(title.c_str()).c_str());
 	if (m_doneButton)
 		elm_object_disabled_set(m_doneButton, m_selectedCount == 0 ? EINA_TRUE : EINA_FALSE);
 }
@@ -297,9 +313,8 @@ void CtShareContactView::__updateTitle()
 void CtShareContactView::__updatePreview()
 {
 	WPRET_M(!m_preview, "preview is nullptr");
-	char* markup = elm_entry_utf8_to_markup(composeText().c_str());
-	elm_object_text_set(m_preview, markup ? markup : "");
-	free(markup);
+	std::string markup = kPreviewTextOpen + ctCommonUtf8ToMarkup(composeText().c_str()) + kPreviewTextClose;
+	elm_object_text_set(m_preview, markup.c_str());
 }
 
 void CtShareContactView::onDbChanged(const char* viewUri)
@@ -358,7 +373,7 @@ void CtShareContactView::onLanguageChanged()
 	if (m_cancelButton)
 		elm_object_text_set(m_cancelButton, ContactsCommon::translate("IDS_TPLATFORM_ACBUTTON_CANCEL_ABB"));
 	if (m_previewTitle)
-		elm_object_text_set(m_previewTitle, ContactsCommon::translate("IDS_PB_HEADER_PREVIEW"));
+		__setPreviewTitle();
 	if (m_genlist)
 		elm_genlist_realized_items_update(m_genlist);
 	__updatePreview();

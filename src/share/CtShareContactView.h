@@ -59,6 +59,7 @@ private:
 	void __initialize(CtLaunchRequest* request);
 	void __addExtensionThemes();
 	Evas_Object* __createPreview(Evas_Object* parent);
+	void __setPreviewTitle();
 	void __addAllItems(const std::set<std::string>& keptMarks);
 	void __addNameItem();
 	void __addFieldItems(Eina_List* records, const char* kind, const std::set<std::string>& keptMarks);

@@ -322,11 +322,11 @@ void CtShareContactView::onDbChanged(const char* viewUri)
 	WDEBUG("changed : %s", viewUri ? viewUri : "");
 	if (m_isClosing)
 		return;
-	// A favourite tap on the name row writes the person: nothing to rebuild.
-	if (m_nameItem && m_nameItem->getSkipOnce()) {
+	// A favourite tap on the name row writes the person too, but the same
+	// notification may carry changes made elsewhere: the list is rebuilt
+	// anyway, and the marks stay.
+	if (m_nameItem && m_nameItem->getSkipOnce())
 		m_nameItem->clearSkipOnce();
-		return;
-	}
 	__updateGenlist();
 }
 

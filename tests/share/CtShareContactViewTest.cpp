@@ -4,7 +4,9 @@
 #include "../data/detail/DetailTestStore.h"
 
 #include "ContactsDetails.h"
+#include "CtDetailData.h"
 #include "CtView.h"
+#include "CtDetailViewBasicInfoItem.h"
 #include "CtShareContactText.h"
 #include "CtShareContactView.h"
 #include "CtShareContactViewItem.h"
@@ -288,6 +290,46 @@ TEST_F(CtShareContactViewTest, OnlyChangesOfTheShownPersonRebuildAndMarksOfRemai
 	ASSERT_TRUE(m_screen->pumpUntil([view] { return view->getRebuildCount() > 1; }));
 	EXPECT_EQ(std::make_pair(std::string("1 selected"), true), titleState(view));
 	EXPECT_EQ("Mina\nStudio\n02-333-4444\n", pressDone(view));
+}
+
+TEST_F(CtShareContactViewTest, AChangeArrivingWithAFavouriteTapIsNotLost)
+{
+	int contactId = 0;
+	int personId = storeMina(&contactId);
+	CtShareContactView* view = open(personId);
+	mark(rowOf(view, "mina@example.com"));
+	m_screen->pumpUntilIdle();
+	auto* name = ScreenHarness::rowsOf<CtDetailViewBasicInfoItem>(view->getGenlist()).at(0);
+	Evas_Object* star = name->getFavoriteIcon();
+	ASSERT_NE(nullptr, star);
+	Evas_Coord x, y, w, h;
+	evas_object_geometry_get(star, &x, &y, &w, &h);
+	Evas* evas = evas_object_evas_get(star);
+	evas_event_feed_mouse_move(evas, x + w / 2, y + h / 2, 0, nullptr);
+	evas_event_feed_mouse_down(evas, 1, EVAS_BUTTON_NONE, 0, nullptr);
+	evas_event_feed_mouse_up(evas, 1, EVAS_BUTTON_NONE, 0, nullptr);
+	ASSERT_TRUE(name->isFavorite());
+	// Another program adds a number before the tap's notification is heard.
+	addNumberToStoredContact(contactId, "010-9999-0000");
+
+	ASSERT_TRUE(m_screen->pumpUntil([view] { return view->getRebuildCount() > 0 && rows(view).size() == 10; }));
+	EXPECT_TRUE(CtDetailData(personId).isFavorite());
+	EXPECT_TRUE(rowOf(view, "mina@example.com")->isMarked());
+	EXPECT_EQ(std::make_pair(std::string("1 selected"), true), titleState(view));
+}
+
+TEST_F(CtShareContactViewTest, ALanguageChangeTranslatesTitleButtonsAndLabels)
+{
+	CtShareContactView* view = open(storeMina());
+	mark(rowOf(view, "010-1111-2222"));
+	CtView::changeLanguage("de_DE.UTF-8");
+	std::vector<std::string> shown = {ScreenHarness::naviText(view),
+		ScreenHarness::buttonLabel(done(view)), ScreenHarness::buttonLabel(titleButton(view, "title_left_btn")),
+		view->getPreviewText()};
+	CtView::changeLanguage("en_US.UTF-8");
+	EXPECT_EQ((std::vector<std::string>{"1 ausgewählt", "Fertig", "Abbrechen", "Mina\nMobil\n010-1111-2222\n"}),
+			shown);
+	EXPECT_EQ("Mina\nMobile\n010-1111-2222\n", view->getPreviewText());
 }
 
 TEST_F(CtShareContactViewTest, MissingPersonsAndMissingRequestsGiveQuietScreens)

@@ -233,8 +233,10 @@ bool DemoApp::__pushScreen(const DemoScreen& screen, int personId)
 
 void DemoApp::__hold(double seconds)
 {
-	// Scripts driving the host from outside wait for the first line and read
-	// the second to learn what the changes made of the screen.
+	// Scripts driving the host from outside wait for the first line, printed
+	// once the screen is up and listening, and read the second to learn what
+	// the changes made of the screen.
+	__settle();
 	printf("holding %s for %g s\n", __topScreenName(), seconds);
 	fflush(stdout);
 	bool ended = false;

@@ -337,7 +337,5 @@ int main(int argc, char** argv)
 	benchmark::Shutdown();
 	contacts_disconnect();
 	ecore_shutdown();
-	std::error_code ec;
-	std::filesystem::remove_all(g_db.dataDir, ec);
 	return 0;
 }

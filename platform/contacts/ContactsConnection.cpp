@@ -165,19 +165,21 @@ int ContactsConnection::write(const std::function<int(WriteContext&)>& fn)
 	if (tx.status() != SQLITE_OK)
 		return failed("BEGIN", tx.status());
 	WriteContext ctx;
-	ctx.version = currentVersion() + 1;
 	{
-		CachedStatement st(statement("UPDATE meta SET value = ? WHERE key = 'version'"));
-		int rc = st->bind(1, ctx.version).run();
-		if (rc != SQLITE_DONE)
+		CachedStatement st(statement("UPDATE meta SET value = value + 1 WHERE key = 'version' RETURNING value"));
+		int rc = st->step();
+		if (rc != SQLITE_ROW)
+			return failed("version", rc);
+		ctx.version = st->columnInt(0);
+		if ((rc = st->step()) != SQLITE_DONE)
 			return failed("version", rc);
 	}
 	int err = fn(ctx);
 	if (err != CONTACTS_ERROR_NONE)
 		return err;
-	for (const std::string& uri : ctx.touchedViews) {
+	for (const std::string& key : ctx.touchedKeys) {
 		CachedStatement st(statement("INSERT OR REPLACE INTO view_versions(uri, version) VALUES (?, ?)"));
-		int rc = st->bind(1, uri).bind(2, ctx.version).run();
+		int rc = st->bind(1, key).bind(2, ctx.version).run();
 		if (rc != SQLITE_DONE)
 			return failed("view version", rc);
 	}
@@ -228,11 +230,12 @@ int ContactsConnection::removeChangedCb(const char* uri, contacts_db_changed_cb 
 
 void ContactsConnection::__dispatchChanges()
 {
-	std::vector<std::string> changed;
-	for (const auto& [uri, version] : __viewVersions()) {
-		if (version > m_seenVersions[uri])
-			changed.push_back(uri);
-		m_seenVersions[uri] = version;
+	std::set<std::string> changed;
+	for (const auto& [key, version] : __viewVersions()) {
+		if (version > m_seenVersions[key])
+			for (std::string& uri : ContactsSchema::urisOfChangeKey(key))
+				changed.insert(std::move(uri));
+		m_seenVersions[key] = version;
 	}
 	std::vector<Callback> pending;
 	for (const std::string& uri : changed)

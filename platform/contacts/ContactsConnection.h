@@ -22,9 +22,10 @@ using db::CachedStatement;
 // What one write transaction did; filled while it runs.
 struct WriteContext {
 	int version = 0;
-	std::set<std::string> touchedViews;
+	// Change keys (ContactsSchema::changeKeyOf) of the views written.
+	std::set<std::string> touchedKeys;
 	std::vector<std::function<void()>> onCommit;
-	void touch(const ViewInfo& v) { touchedViews.insert(v.uri); }
+	void touch(const ViewInfo& v) { touchedKeys.insert(ContactsSchema::changeKeyOf(v)); }
 };
 
 // Maps an SQLite result to a CONTACTS_ERROR_* code.
@@ -53,6 +54,7 @@ public:
 	int write(const std::function<int(WriteContext&)>& fn);
 	int currentVersion();
 	int lastChangeVersion() const { return m_lastChangeVersion; }
+	// The stored setting; a write reads it once (ContactsWriter caches it).
 	int nameDisplayOrder();
 
 	int addChangedCb(const char* uri, contacts_db_changed_cb cb, void* userData);

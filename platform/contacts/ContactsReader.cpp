@@ -8,12 +8,13 @@
 
 namespace ct::contacts {
 
-void fillRecord(contacts_record_s& record, db::Statement& st, const std::vector<const PropertyInfo*>& props)
+void fillRecord(contacts_record_s& record, db::Statement& st, const std::vector<const PropertyInfo*>& props,
+	int firstColumn)
 {
 	for (size_t i = 0; i < props.size(); ++i) {
 		const PropertyInfo* p = props[i];
 		auto& v = record.values[p->slot];
-		int col = static_cast<int>(i);
+		int col = firstColumn + static_cast<int>(i);
 		v.set = true;
 		switch (p->type) {
 		case PropType::Str:
@@ -50,50 +51,60 @@ std::vector<int> ContactsReader::contactIdsOfPerson(int personId)
 	return ids;
 }
 
-int ContactsReader::loadChildren(contacts_record_s& record, int ownerId, int owner)
-{
-	for (const PropertyInfo& p : record.view->props) {
-		if (p.type != PropType::Record)
-			continue;
-		const ViewInfo& child = *p.child;
-		CachedStatement st(m_conn.statement(child.selectChildrenSql));
-		st->bind(1, ownerId).bind(2, owner);
-		int rc;
-		while ((rc = st->step()) == SQLITE_ROW) {
-			auto* c = new contacts_record_s(child);
-			fillRecord(*c, *st, child.columns);
-			c->parent = &record;
-			record.childLists[p.slot].push_back(c);
-		}
-		if (rc != SQLITE_DONE)
-			return m_conn.failed(child.table, rc);
-	}
-	return CONTACTS_ERROR_NONE;
-}
-
 int ContactsReader::readRecord(const ViewInfo& view, int id, contacts_record_s** out)
 {
 	*out = nullptr;
 	WPRET_VM(!view.findByName("id") || !view.readSource, CONTACTS_ERROR_INVALID_PARAMETER,
 		"records of %s cannot be read by id", view.uri);
 	WPRET_VM(id < 0, CONTACTS_ERROR_INVALID_PARAMETER, "Invalid param : id %d", id);
-	db::ReadSnapshot snapshot(m_conn.database());
 	auto record = std::make_unique<contacts_record_s>(view);
-	{
-		CachedStatement st(m_conn.statement(view.selectByIdSql));
-		int rc = st->bind(1, id).step();
-		if (rc == SQLITE_DONE)
-			return CONTACTS_ERROR_NO_DATA;
-		if (rc != SQLITE_ROW)
-			return m_conn.failed(view.uri, rc);
-		fillRecord(*record, *st, view.columns);
-	}
-	bool isProfile = view.number == kMyProfileView;
-	int err = loadChildren(*record, id, isProfile ? 1 : 0);
-	if (err != CONTACTS_ERROR_NONE)
-		return err;
-	*out = record.release();
+	int err = view.selectWithChildrenSql.empty() ? __readRow(*record, id) : __readWithChildren(*record, id);
+	if (err == CONTACTS_ERROR_NONE)
+		*out = record.release();
+	return err;
+}
+
+int ContactsReader::__readRow(contacts_record_s& record, int id)
+{
+	const ViewInfo& view = *record.view;
+	CachedStatement st(m_conn.statement(view.selectByIdSql));
+	int rc = st->bind(1, id).step();
+	if (rc == SQLITE_DONE)
+		return CONTACTS_ERROR_NO_DATA;
+	if (rc != SQLITE_ROW)
+		return m_conn.failed(view.uri, rc);
+	fillRecord(record, *st, view.columns);
 	return CONTACTS_ERROR_NONE;
+}
+
+int ContactsReader::__readWithChildren(contacts_record_s& record, int id)
+{
+	const ViewInfo& view = *record.view;
+	std::vector<const PropertyInfo*> parts;
+	for (const PropertyInfo& p : view.props)
+		if (p.type == PropType::Record)
+			parts.push_back(&p);
+	// One statement reads one state of the file: no transaction is needed.
+	CachedStatement st(m_conn.statement(view.selectWithChildrenSql));
+	st->bind(1, id).bind(2, view.number == kMyProfileView ? 1 : 0);
+	bool found = false;
+	int rc;
+	while ((rc = st->step()) == SQLITE_ROW) {
+		size_t part = static_cast<size_t>(st->columnInt(ViewInfo::kPartColumn));
+		if (part == 0) {
+			fillRecord(record, *st, view.columns, ViewInfo::kFirstValueColumn);
+			found = true;
+		} else if (found && part <= parts.size()) {
+			const PropertyInfo& p = *parts[part - 1];
+			auto* c = new contacts_record_s(*p.child);
+			fillRecord(*c, *st, p.child->columns, ViewInfo::kFirstValueColumn);
+			c->parent = &record;
+			record.childLists[p.slot].push_back(c);
+		}
+	}
+	if (rc != SQLITE_DONE)
+		return m_conn.failed(view.uri, rc);
+	return found ? CONTACTS_ERROR_NONE : CONTACTS_ERROR_NO_DATA;
 }
 
 contacts_filter_s::IndexChoice ContactsReader::__indexChoiceForLimit(int limit)

@@ -1,6 +1,7 @@
 #include "ContactsConnection.h"
 
 #include "ContactsDebug.h"
+#include "ContactsSearchPlanner.h"
 #include "ContactsSim.h"
 #include "DataDir.h"
 #include "contacts_db.h"
@@ -65,6 +66,7 @@ int ContactsConnection::disconnect()
 ContactsConnection::~ContactsConnection()
 {
 	m_watcher.reset();
+	m_searchPlanner.reset();
 	m_db.close();
 }
 
@@ -139,6 +141,13 @@ db::Statement& ContactsConnection::statement(const std::string& sql)
 	if (!st.valid())
 		WERROR("prepare failed (%s): %s", m_db.errorMessage().c_str(), sql.c_str());
 	return st;
+}
+
+ContactsSearchPlanner& ContactsConnection::searchPlanner()
+{
+	if (!m_searchPlanner)
+		m_searchPlanner = std::make_unique<ContactsSearchPlanner>(*this);
+	return *m_searchPlanner;
 }
 
 int ContactsConnection::failed(const char* what, int sqliteResult)

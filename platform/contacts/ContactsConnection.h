@@ -28,6 +28,8 @@ struct WriteContext {
 	void touch(const ViewInfo& v) { touchedKeys.insert(ContactsSchema::changeKeyOf(v)); }
 };
 
+class ContactsSearchPlanner;
+
 // Maps an SQLite result to a CONTACTS_ERROR_* code.
 int contactsError(int sqliteResult);
 
@@ -57,6 +59,9 @@ public:
 	// The stored setting; a write reads it once (ContactsWriter caches it).
 	int nameDisplayOrder();
 
+	// Lives as long as the connection, with what it learnt of the store.
+	ContactsSearchPlanner& searchPlanner();
+
 	int addChangedCb(const char* uri, contacts_db_changed_cb cb, void* userData);
 	int removeChangedCb(const char* uri, contacts_db_changed_cb cb, void* userData);
 
@@ -78,6 +83,7 @@ private:
 	std::vector<Callback> m_callbacks;
 	std::map<std::string, int64_t> m_seenVersions;
 	std::unique_ptr<db::StoreChangeWatcher> m_watcher;
+	std::unique_ptr<ContactsSearchPlanner> m_searchPlanner;
 	bool m_dispatching = false;
 	bool m_closeAfterDispatch = false;
 };

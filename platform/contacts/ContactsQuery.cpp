@@ -78,6 +78,19 @@ bool usesTrigramIndex(const contacts_filter_s::Item& item, const ViewInfo& view)
 		&& g_utf8_strlen(item.value.text.c_str(), -1) >= 3 && item.value.text.size() <= kMaxIndexedSearchBytes;
 }
 
+void narrowContains(const ct::contacts::ContainsPlan& plan, const std::string& text, std::string& sql,
+	std::vector<SqlParam>& params)
+{
+	using Kind = ct::contacts::ContainsPlan::Kind;
+	if (plan.kind == Kind::Phrase) {
+		sql += "\"id\" IN (SELECT rowid FROM persons_fts WHERE persons_fts MATCH ?) AND ";
+		params.push_back(textParam(ct::contacts::ftsPhrase(text)));
+	} else if (plan.kind == Kind::Matches) {
+		sql += "\"id\" IN (SELECT value FROM json_each(?)) AND ";
+		params.push_back(textParam(plan.matchIds));
+	}
+}
+
 void stringCondition(const contacts_filter_s::Item& item, const ViewInfo& view, const std::string& col,
 	std::string& sql, std::vector<SqlParam>& params, const contacts_filter_s::IndexChoice& useIndex)
 {
@@ -92,10 +105,8 @@ void stringCondition(const contacts_filter_s::Item& item, const ViewInfo& view, 
 		params.push_back(textParam(v));
 		break;
 	case CONTACTS_MATCH_CONTAINS:
-		if (usesTrigramIndex(item, view) && (!useIndex || useIndex(v))) {
-			sql += "\"id\" IN (SELECT rowid FROM persons_fts WHERE persons_fts MATCH ?) AND ";
-			params.push_back(textParam(ct::contacts::ftsPhrase(v)));
-		}
+		if (usesTrigramIndex(item, view))
+			narrowContains(useIndex ? useIndex(v) : ct::contacts::ContainsPlan(), v, sql, params);
 		sql += "instr(lower(" + col + "), lower(?)) > 0";
 		params.push_back(textParam(v));
 		break;

@@ -2,8 +2,11 @@
 
 #include "ContactsDebug.h"
 #include "ContactsList.h"
+#include "ContactsSearchPlanner.h"
 #include "contacts_list.h"
+#include "contacts_views.h"
 
+#include <algorithm>
 #include <memory>
 
 namespace ct::contacts {
@@ -94,7 +97,7 @@ int ContactsReader::__readWithChildren(contacts_record_s& record, int id)
 		if (part == 0) {
 			fillRecord(record, *st, view.columns, ViewInfo::kFirstValueColumn);
 			found = true;
-		} else if (found && part <= parts.size()) {
+		} else if (part <= parts.size()) {
 			const PropertyInfo& p = *parts[part - 1];
 			auto* c = new contacts_record_s(*p.child);
 			fillRecord(*c, *st, p.child->columns, ViewInfo::kFirstValueColumn);
@@ -104,18 +107,28 @@ int ContactsReader::__readWithChildren(contacts_record_s& record, int id)
 	}
 	if (rc != SQLITE_DONE)
 		return m_conn.failed(view.uri, rc);
+	for (const PropertyInfo* p : parts) {
+		auto& list = record.childLists[p->slot];
+		std::stable_sort(list.begin(), list.end(), [](const contacts_record_s* a, const contacts_record_s* b) {
+			return a->getInt64("id") < b->getInt64("id");
+		});
+	}
 	return found ? CONTACTS_ERROR_NONE : CONTACTS_ERROR_NO_DATA;
 }
 
-contacts_filter_s::IndexChoice ContactsReader::__indexChoiceForLimit(int limit)
+contacts_filter_s::IndexChoice ContactsReader::__indexChoice(const contacts_query_s* query, int offset, int limit)
 {
 	if (limit <= 0)
 		return nullptr;
-	return [this](const std::string& text) {
-		const int kRareMatches = 500;
-		CachedStatement st(m_conn.statement("SELECT count(*) FROM (SELECT rowid FROM persons_fts WHERE persons_fts "
-			"MATCH ? LIMIT 501)"));
-		return st->bind(1, ftsPhrase(text)).step() == SQLITE_ROW && st->columnInt(0) < kRareMatches;
+	using Order = ContactsSearchPlanner::Order;
+	Order order = Order::Rowid;
+	if (query && !query->sort.empty()) {
+		bool byName = query->sort.front().first->id == _contacts_person.display_name;
+		order = !byName ? Order::Other : query->sort.front().second ? Order::NameAscending : Order::NameDescending;
+	}
+	ContactsSearchPlanner& planner = m_conn.searchPlanner();
+	return [&planner, order, wanted = offset + limit](const std::string& text) {
+		return planner.choose(text, wanted, order);
 	};
 }
 
@@ -148,7 +161,7 @@ int ContactsReader::readList(const ViewInfo& view, const contacts_query_s* query
 	std::string sql = std::string("SELECT ") + (query && query->distinct ? "DISTINCT " : "") + cols + " FROM "
 		+ view.readSource;
 	std::vector<SqlParam> params;
-	int err = __where(view, query, sql, params, __indexChoiceForLimit(limit));
+	int err = __where(view, query, sql, params, __indexChoice(query, offset, limit));
 	if (err != CONTACTS_ERROR_NONE)
 		return err;
 	if (query && !query->sort.empty()) {

@@ -28,10 +28,9 @@ private:
 	int __readWithChildren(contacts_record_s& record, int id);
 	int __where(const ViewInfo& view, const contacts_query_s* query, std::string& sql, std::vector<SqlParam>& params,
 		const contacts_filter_s::IndexChoice& useIndex = nullptr);
-	// For a limited read: the trigram index only pays when the text is rare;
-	// for a common one, walking the rows in sort order finds the first
-	// matches sooner.
-	contacts_filter_s::IndexChoice __indexChoiceForLimit(int limit);
+	// For a limited read, the search planner weighs the trigram index against
+	// walking the rows in the read's order; an unlimited one always narrows.
+	contacts_filter_s::IndexChoice __indexChoice(const contacts_query_s* query, int offset, int limit);
 
 	ContactsConnection& m_conn;
 };

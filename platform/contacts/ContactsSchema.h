@@ -48,9 +48,9 @@ struct ViewInfo {
 	std::string selectSql;                    // SELECT <columns> FROM readSource
 	std::string selectByIdSql;                // ... WHERE id = ? [AND baseWhere]
 	// For views with child records: the record (part 0) and its children
-	// (part i: the i-th record property) in one statement, rows ordered by part
-	// and id. Columns: part, then the part's columns padded with NULLs; ?1 is
-	// the id, ?2 the owner kind of the children.
+	// (part i: the i-th record property) in one statement, rows in no set
+	// order. Columns: part, id, then the part's columns padded with NULLs; ?1
+	// is the id, ?2 the owner kind of the children.
 	std::string selectWithChildrenSql;
 	static constexpr int kPartColumn = 0;
 	static constexpr int kFirstValueColumn = 2;

@@ -6,10 +6,11 @@ namespace ct::db {
 namespace {
 
 // A commit writes its last WAL frame a moment before it publishes the new
-// state, so a file event can come early; the version is checked again
-// shortly after, a few times, and never while nothing happens.
-constexpr double kRecheckSeconds[] = { 0.001, 0.004, 0.02 };
-constexpr int kRechecks = sizeof(kRecheckSeconds) / sizeof(kRecheckSeconds[0]);
+// state (and a busy machine can pause the writer in between), so a file
+// event can come early: the version is checked again after 0.5 ms, then at
+// doubling intervals up to 64 ms, and never while no file changes.
+constexpr double kFirstRecheckSeconds = 0.0005;
+constexpr int kRechecks = 8;
 
 std::string folderOf(const std::string& path)
 {
@@ -107,7 +108,7 @@ void StoreChangeWatcher::__scheduleRecheck()
 	m_rechecksLeft = kRechecks;
 	if (m_recheckTimer)
 		ecore_timer_del(m_recheckTimer);
-	m_recheckTimer = ecore_timer_add(kRecheckSeconds[0], __recheckCb, this);
+	m_recheckTimer = ecore_timer_add(kFirstRecheckSeconds, __recheckCb, this);
 }
 
 Eina_Bool StoreChangeWatcher::__recheckCb(void* data)
@@ -118,7 +119,7 @@ Eina_Bool StoreChangeWatcher::__recheckCb(void* data)
 		self->m_recheckTimer = nullptr;
 		return ECORE_CALLBACK_CANCEL;
 	}
-	ecore_timer_interval_set(self->m_recheckTimer, kRecheckSeconds[kRechecks - self->m_rechecksLeft]);
+	ecore_timer_interval_set(self->m_recheckTimer, kFirstRecheckSeconds * (1 << (kRechecks - self->m_rechecksLeft)));
 	return ECORE_CALLBACK_RENEW;
 }
 

@@ -1,40 +1,62 @@
 // Tells a store, on the EFL main loop, that its database may have changed:
 // after its own commits (notifyLocalChange) and when another connection or
-// process committed (polled through PRAGMA data_version).
+// process committed. Other commits are noticed through file events on the
+// database's folder (inotify under Ecore_File), confirmed by PRAGMA
+// data_version; nothing wakes the loop while no file changes. Only when the
+// folder cannot be watched does a slow poll take over.
 #pragma once
 
 #include "SqliteDatabase.h"
 
 #include <Ecore.h>
+#include <Ecore_File.h>
 
 #include <functional>
+#include <string>
 
 namespace ct::db {
 
+enum class ChangeDetection { FileEvents, PollOnly };
+
 class StoreChangeWatcher {
 public:
-	static constexpr double kDefaultPollSeconds = 0.1;
+	static constexpr double kFallbackPollSeconds = 0.5;
 
 	// `db` must outlive the watcher. `onChange` runs on the main loop, at most
 	// once per main-loop iteration however many commits came before it.
 	StoreChangeWatcher(Database& db, std::function<void()> onChange,
-		double pollSeconds = kDefaultPollSeconds);
+		ChangeDetection detection = ChangeDetection::FileEvents);
 	~StoreChangeWatcher();
 	StoreChangeWatcher(const StoreChangeWatcher&) = delete;
 	StoreChangeWatcher& operator=(const StoreChangeWatcher&) = delete;
 
 	// Call after this connection committed.
 	void notifyLocalChange();
+	// Whether other commits are noticed through file events (else by polling).
+	bool watchesFiles() const { return m_monitor != nullptr; }
 
 private:
+	static void __fileEventCb(void* data, Ecore_File_Monitor* monitor, Ecore_File_Event event, const char* path);
 	static Eina_Bool __pollCb(void* data);
+	static Eina_Bool __recheckCb(void* data);
 	static void __jobCb(void* data);
+	bool __watchFolder();
+	void __startPolling();
+	void __stopWatching();
+	bool __isDatabaseFile(const char* path) const;
+	// Queues a delivery when another connection committed since the last check.
+	bool __checkVersion();
+	void __scheduleRecheck();
 	void __deliver();
 
 	Database& m_db;
 	std::function<void()> m_onChange;
 	int64_t m_lastVersion;
-	Ecore_Timer* m_timer = nullptr;
+	std::string m_path;
+	Ecore_File_Monitor* m_monitor = nullptr;
+	Ecore_Timer* m_pollTimer = nullptr;
+	Ecore_Timer* m_recheckTimer = nullptr;
+	int m_rechecksLeft = 0;
 	Ecore_Job* m_job = nullptr;
 };
 

@@ -15,6 +15,16 @@ bool isBlankText(const std::string& text)
 	return true;
 }
 
+// The window's focused widget counts too: a window that no window manager
+// ever activated (headless) reports no widget as focused itself.
+bool hasFocus(Evas_Object* entry)
+{
+	if (elm_object_focus_get(entry))
+		return true;
+	Evas_Object* top = elm_object_top_widget_get(entry);
+	return top && elm_object_focused_object_get(top) == entry;
+}
+
 } // namespace
 
 CtPredictionListTrigger::CtPredictionListTrigger(Evas_Object* listParent, Evas_Object* inputList,
@@ -48,7 +58,7 @@ void CtPredictionListTrigger::onNameChanged(Evas_Object* entry, Elm_Object_Item*
 	const std::string& fullName)
 {
 	WPRET_M(!entry, "Invalid param : entry");
-	if (!elm_object_focus_get(entry)) {
+	if (!hasFocus(entry)) {
 		WERROR("entry doesn't have focus");
 		return;
 	}
@@ -70,7 +80,7 @@ void CtPredictionListTrigger::onNameChanged(Evas_Object* entry, Elm_Object_Item*
 bool CtPredictionListTrigger::__onTypingPaused()
 {
 	Evas_Object* entry = m_pendingEntry;
-	if (!entry || !elm_object_focus_get(entry)) {
+	if (!entry || !hasFocus(entry)) {
 		WERROR("entry doesn't have focus");
 		return false;
 	}

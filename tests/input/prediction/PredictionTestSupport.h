@@ -6,13 +6,39 @@
 
 #include "CtView.h"
 #include "ScreenHarness.h"
+#include "WView.h"
 
+#include <Ecore_Evas.h>
 #include <Elementary.h>
 
 #include <memory>
 #include <string>
 
 namespace ct::test {
+
+// A screen holding one name entry at its top, standing in for the edit form.
+class FormView : public app_assist::WView {
+public:
+	Evas_Object* form = nullptr;
+	Evas_Object* entry = nullptr;
+
+protected:
+	Evas_Object* onCreate(Evas_Object* parent, void*) override
+	{
+		form = elm_box_add(parent);
+		elm_box_align_set(form, 0.5, 0.0);
+		evas_object_size_hint_weight_set(form, EVAS_HINT_EXPAND, EVAS_HINT_EXPAND);
+		entry = elm_entry_add(form);
+		elm_entry_single_line_set(entry, EINA_TRUE);
+		elm_object_part_text_set(entry, "elm.guide", "Name");
+		evas_object_size_hint_weight_set(entry, EVAS_HINT_EXPAND, 0);
+		evas_object_size_hint_align_set(entry, EVAS_HINT_FILL, 0);
+		evas_object_size_hint_min_set(entry, 0, 80);
+		elm_box_pack_end(form, entry);
+		evas_object_show(entry);
+		return form;
+	}
+};
 
 class PredictionTest : public ::testing::Test {
 protected:
@@ -21,19 +47,10 @@ protected:
 		ASSERT_EQ(CONTACTS_ERROR_NONE, contacts_connect());
 		m_screen = std::make_unique<ScreenHarness>(360, 640);
 		CtView::changeLanguage("en_US.UTF-8");
-		m_form = elm_box_add(m_screen->win());
-		evas_object_size_hint_weight_set(m_form, EVAS_HINT_EXPAND, EVAS_HINT_EXPAND);
-		elm_win_resize_object_add(m_screen->win(), m_form);
-		evas_object_show(m_form);
-		m_entry = elm_entry_add(m_form);
-		elm_entry_single_line_set(m_entry, EINA_TRUE);
-		evas_object_size_hint_weight_set(m_entry, EVAS_HINT_EXPAND, 0);
-		evas_object_size_hint_align_set(m_entry, EVAS_HINT_FILL, 0);
-		evas_object_size_hint_min_set(m_entry, 0, 80);
-		elm_box_align_set(m_form, 0.5, 0.0);
-		elm_box_pack_end(m_form, m_entry);
-		evas_object_show(m_entry);
-		m_screen->pumpUntilIdle();
+		auto* view = new FormView;
+		ASSERT_TRUE(m_screen->push(view));
+		m_form = view->form;
+		m_entry = view->entry;
 	}
 	void TearDown() override
 	{

@@ -21,6 +21,7 @@ namespace {
 const char* const kRadioGroupKey = "radioGroup";
 const char* const kImageEdj = "contacts/image_layout.edj";
 const char* const kListEdj = "contacts/list.edj";
+const char* const kItemsEdj = "contacts/contacts.edj";
 const int kOneLineHeight = 56;
 const int kTwoLineHeight = 72;
 const int kMaxVisibleHeight = 5 * 72;
@@ -131,19 +132,28 @@ void CtAddressbookPopup::onSimChanged()
 
 Evas_Object* CtAddressbookPopup::__createContent(Evas_Object* parent)
 {
-	std::string edj;
-	if (ContactsCommon::getAppEdjePath(kListEdj, edj, true))
-		CtThemeMgr::getInstance()->addExtensionTheme(edj.c_str());
-	m_genlist = elm_genlist_add(parent);
-	WPRET_VM(!m_genlist, nullptr, "elm_genlist_add() failed");
+	for (const char* name : { kItemsEdj, kListEdj }) {
+		std::string edj;
+		if (ContactsCommon::getAppEdjePath(name, edj, true))
+			CtThemeMgr::getInstance()->addExtensionTheme(edj.c_str());
+	}
+	// The box gives the list its height: a popup sizes its content by the
+	// content's minimum, which a scrolling list does not have.
+	Evas_Object* box = elm_box_add(parent);
+	WPRET_VM(!box, nullptr, "elm_box_add() failed");
+	m_genlist = elm_genlist_add(box);
+	WPRET_VM(!m_genlist, box, "elm_genlist_add() failed");
+	CtThemeMgr::getInstance()->setObjectTheme(m_genlist);
 	elm_object_style_set(m_genlist, "popup");
 	elm_genlist_mode_set(m_genlist, ELM_LIST_SCROLL);
 	elm_genlist_homogeneous_set(m_genlist, EINA_TRUE);
 	evas_object_size_hint_weight_set(m_genlist, EVAS_HINT_EXPAND, EVAS_HINT_EXPAND);
 	evas_object_size_hint_align_set(m_genlist, EVAS_HINT_FILL, EVAS_HINT_FILL);
 	evas_object_show(m_genlist);
+	elm_box_pack_end(box, m_genlist);
+	evas_object_show(box);
 	__addPopupItems();
-	return m_genlist;
+	return box;
 }
 
 void CtAddressbookPopup::__updateGenlist()
@@ -251,7 +261,7 @@ void CtAddressbookPopup::__fitHeight()
 		height += itc && !strcmp(itc->item_style, "1line") ? kOneLineHeight : kTwoLineHeight;
 	}
 	height = std::min(height, kMaxVisibleHeight);
-	evas_object_size_hint_min_set(m_genlist, 0, static_cast<int>(height * ctCommonGetScale()));
+	evas_object_size_hint_min_set(elm_object_parent_widget_get(m_genlist), 0, static_cast<int>(height * ctCommonGetScale()));
 }
 
 char* CtAddressbookPopup::__textGetCb(void* data, Evas_Object*, const char* part)

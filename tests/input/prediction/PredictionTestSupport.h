@@ -36,6 +36,11 @@ protected:
 		evas_object_size_hint_min_set(entry, 0, 80);
 		elm_box_pack_end(form, entry);
 		evas_object_show(entry);
+		Evas_Object* rest = evas_object_rectangle_add(evas_object_evas_get(form));
+		evas_object_color_set(rest, 0, 0, 0, 0);
+		evas_object_size_hint_weight_set(rest, EVAS_HINT_EXPAND, EVAS_HINT_EXPAND);
+		elm_box_pack_end(form, rest);
+		evas_object_show(rest);
 		return form;
 	}
 };

@@ -313,4 +313,24 @@ TEST_F(CtPredictionListControlTest, ScreenshotShowsTheListUnderTheTypedName)
 }
 
 
+TEST_F(CtPredictionListControlTest, TapInTheFormCloses)
+{
+	addPerson("Anna One");
+	makeTrigger(true);
+	focusEntry();
+	type("Anna");
+	waitPastPause();
+	ASSERT_NE(nullptr, m_trigger->getPredictionList());
+	// A tap on the name field itself, which lies in the form.
+	Evas* canvas = evas_object_evas_get(m_form);
+	int x, y, w, h;
+	evas_object_geometry_get(m_entry, &x, &y, &w, &h);
+	evas_event_feed_mouse_in(canvas, 0, nullptr);
+	evas_event_feed_mouse_move(canvas, x + w / 2, y + h / 2, 0, nullptr);
+	evas_event_feed_mouse_down(canvas, 1, EVAS_BUTTON_NONE, 0, nullptr);
+	evas_event_feed_mouse_up(canvas, 1, EVAS_BUTTON_NONE, 0, nullptr);
+	m_screen->pumpFrames(2);
+	EXPECT_EQ(nullptr, m_trigger->getPredictionList());
+}
+
 } // namespace

@@ -23,6 +23,9 @@ const int kOneLineHeight = 96;
 const int kTwoLineHeight = 144;
 const int kBorderHeight = 4;
 const int kSideMargin = 32;
+// The sizes above are units of the 720-wide design grid; the theme draws the
+// prediction rows (48 and 72 pixels) at half of them on this 360-wide screen.
+const double kPixelsPerUnit = 0.5;
 
 bool isBlank(char c)
 {
@@ -187,7 +190,7 @@ void CtPredictionListControl::resize()
 	WPRET_M(!field || !getEvasObj(), "no name field to place the list under");
 	int x = 0, y = 0, w = 0, h = 0;
 	evas_object_geometry_get(field, &x, &y, &w, &h);
-	double scale = ctCommonGetScale();
+	double scale = ctCommonGetScale() * kPixelsPerUnit;
 	int margin = static_cast<int>(kSideMargin * scale);
 	int height = static_cast<int>((kOneLineHeight * m_oneLineCount + kTwoLineHeight * m_twoLineCount) * scale)
 		+ static_cast<int>(kBorderHeight * scale);

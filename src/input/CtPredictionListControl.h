@@ -33,7 +33,8 @@ public:
 	Evas_Object* getGenlist() const { return m_genlist; }
 	Evas_Object* getNameEntry() const { return m_nameEntry; }
 	// Units of height for the first three rows: 96 per one-line and 144 per
-	// two-line row, plus 4 for the border, before scaling.
+	// two-line row, plus 4 for the border, before scaling (a unit of the
+	// 720-wide design grid is half a pixel at scale 1).
 	int getUnscaledHeight() const;
 
 	// The name with the first word-start match of `search` coloured, as

@@ -110,7 +110,7 @@ TEST_F(CtPredictionListControlTest, FourOneLineRowsAreThreeRowsHighBelowTheField
 	int ex, ey, ew, eh, x, y, w, h;
 	evas_object_geometry_get(m_entry, &ex, &ey, &ew, &eh);
 	evas_object_geometry_get(m_list->getEvasObj(), &x, &y, &w, &h);
-	double scale = ctCommonGetScale();
+	double scale = ctCommonGetScale() * 0.5; // design units are half pixels
 	int margin = static_cast<int>(32 * scale);
 	EXPECT_EQ(ey + eh, y);
 	EXPECT_EQ(ex + margin, x);

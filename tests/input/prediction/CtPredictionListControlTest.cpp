@@ -107,6 +107,7 @@ TEST_F(CtPredictionListControlTest, FourOneLineRowsAreThreeRowsHighBelowTheField
 	focusEntry("Anna");
 	open("Anna");
 	EXPECT_EQ(3 * 96 + 4, m_list->getUnscaledHeight());
+	m_list->resize(); // with the scale the toolkit settled on
 	int ex, ey, ew, eh, x, y, w, h;
 	evas_object_geometry_get(m_entry, &ex, &ey, &ew, &eh);
 	evas_object_geometry_get(m_list->getEvasObj(), &x, &y, &w, &h);

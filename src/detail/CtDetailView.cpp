@@ -8,6 +8,7 @@
 #include "CtCommonUsageLog.h"
 #include "CtCommonWidgetUtil.h"
 #include "CtDetailData.h"
+#include "CtDetailImageView.h"
 #include "CtDetailViewAddressItem.h"
 #include "CtDetailViewCtxPopup.h"
 #include "CtDetailViewEmailItem.h"
@@ -885,9 +886,9 @@ void CtDetailView::onAddressSelected(contacts_record_h address)
 void CtDetailView::onImageSelected(int page)
 {
 	WHIT();
-	// The full-screen picture view comes with its own screen; until then the
-	// tap is only noted.
-	WDEBUG("picture page %d selected", page);
+	app_assist::WNaviframe* naviframe = getNaviframe();
+	WPRET_M(!naviframe || !m_detailData, "naviframe or data is nullptr");
+	naviframe->push(new CtDetailImageView(m_detailData.get(), false, page));
 }
 
 void CtDetailView::__powerSavingModeChangedCb(keynode_t* node, void* data)

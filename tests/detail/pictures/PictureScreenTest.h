@@ -4,6 +4,8 @@
 
 #include "../../data/myprofile/MyProfileTestStore.h"
 
+#include "CtLightTheme.h"
+#include "CtView.h"
 #include "ScreenHarness.h"
 
 #include <cstdlib>
@@ -19,11 +21,15 @@ protected:
 	void SetUp() override
 	{
 		ASSERT_EQ(CONTACTS_ERROR_NONE, contacts_connect());
+		CtView::changeLanguage("en_US.UTF-8");
+		// The look of the host application, so that screenshots show what a person sees.
+		CtLightTheme::apply();
 		m_screen = std::make_unique<ScreenHarness>(360, 640);
 	}
 	void TearDown() override
 	{
 		m_screen.reset();
+		CtLightTheme::remove();
 		contacts_disconnect();
 	}
 

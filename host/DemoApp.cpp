@@ -217,7 +217,13 @@ bool DemoApp::__pushScreen(const DemoScreen& screen, int personId)
 	}
 	if (!view || !m_naviframe || m_naviframeAlive.expired())
 		return false;
-	return m_naviframe->push(view);
+	if (!m_naviframe->push(view))
+		return false;
+	if (screen.reach) {
+		__settle();
+		screen.reach(m_window->getEvasObj());
+	}
+	return true;
 }
 
 void DemoApp::__hold(double seconds)

@@ -41,6 +41,18 @@ Evas_Object* createDefaultPicture(Evas_Object* parent)
 	return image ? image : ctCommonCreateImage(parent, kImageEdj, "contacts_caller_id_default_full.png");
 }
 
+// Reads the file's header only: the pixels are decoded when a page is drawn.
+bool isLoadablePicture(Evas_Object* parent, const std::string& path)
+{
+	Evas_Object* probe = evas_object_image_add(evas_object_evas_get(parent));
+	evas_object_image_file_set(probe, path.c_str(), nullptr);
+	bool loadable = evas_object_image_load_error_get(probe) == EVAS_LOAD_ERROR_NONE;
+	evas_object_del(probe);
+	if (!loadable)
+		WERROR("not a picture : %s", path.c_str());
+	return loadable;
+}
+
 } // namespace
 
 CtDetailImageView::CtDetailImageView(CtDetailDataBase* data, bool isMyProfile, int page)
@@ -75,12 +87,9 @@ Evas_Object* CtDetailImageView::onCreate(Evas_Object* parent, void*)
 
 	// A picture whose file is gone or is no picture does not count.
 	std::vector<std::pair<int, std::string>> loadable;
-	for (const auto& picture : m_pictures) {
-		Evas_Object* probe = ctCommonCreateImage(base, picture.second.c_str(), nullptr);
-		if (probe)
+	for (const auto& picture : m_pictures)
+		if (isLoadablePicture(base, picture.second))
 			loadable.push_back(picture);
-		evas_object_del(probe);
-	}
 	m_pictures = loadable;
 	m_content = m_pictures.size() < 2 ? __createSingle(base, m_pictures.empty() ? "" : m_pictures.front().second)
 									  : __createPager(base);
@@ -110,6 +119,9 @@ Evas_Object* CtDetailImageView::__createPager(Evas_Object* parent)
 {
 	Evas_Object* layout = ctCommonCreateLayout(parent, kDetailEdj, kMultiImageGroup);
 	WPRET_VM(!layout, nullptr, "ctCommonCreateLayout() is fail");
+	// Pages start at the screen's size, so the first frame already shows
+	// them laid out; the pager's own size corrects them when it differs.
+	evas_object_geometry_get(elm_object_parent_widget_get(parent), nullptr, nullptr, &m_pageWidth, &m_pageHeight);
 	m_scroller = elm_scroller_add(layout);
 	elm_object_style_set(m_scroller, "effect");
 	elm_scroller_loop_set(m_scroller, EINA_FALSE, EINA_FALSE);
@@ -127,10 +139,11 @@ Evas_Object* CtDetailImageView::__createPager(Evas_Object* parent)
 	elm_index_autohide_disabled_set(m_index, EINA_TRUE);
 	int page = 0;
 	for (const auto& [order, path] : m_pictures) {
-		Evas_Object* pageObj = __createPage(m_box, path);
+		Evas_Object* pageObj = __createPage(m_box);
 		if (!pageObj)
 			continue;
 		elm_box_pack_end(m_box, pageObj);
+		m_pages.emplace_back(pageObj, path);
 		elm_index_item_append(m_index, std::to_string(order).c_str(), nullptr, pageKey(page++));
 	}
 	elm_index_level_go(m_index, 0);
@@ -140,10 +153,13 @@ Evas_Object* CtDetailImageView::__createPager(Evas_Object* parent)
 	elm_object_part_content_set(layout, "controller", m_index);
 	if (m_page < 0 || m_page >= page)
 		m_page = 0;
+	// The first page shown gets its picture now, the others once it is drawn.
+	__fillPage(m_page);
+	m_pageFiller = app_assist::WUiTimer::addIdler([this](void*) { return __fillNextPage(); }, nullptr, this);
 	return layout;
 }
 
-Evas_Object* CtDetailImageView::__createPage(Evas_Object* box, const std::string& path)
+Evas_Object* CtDetailImageView::__createPage(Evas_Object* box)
 {
 	Evas_Object* page = ctCommonCreateLayout(box, kDetailEdj, kPageGroup);
 	if (!page) {
@@ -152,14 +168,30 @@ Evas_Object* CtDetailImageView::__createPage(Evas_Object* box, const std::string
 	}
 	Evas_Object* sizer = evas_object_rectangle_add(evas_object_evas_get(box));
 	evas_object_color_set(sizer, 0, 0, 0, 0);
+	evas_object_size_hint_min_set(sizer, m_pageWidth, m_pageHeight);
 	elm_object_part_content_set(page, "sizer", sizer);
-	Evas_Object* image = __createPicture(page, path);
-	if (!image) {
-		evas_object_del(page);
-		return nullptr;
-	}
-	elm_object_part_content_set(page, "elm.swallow.content", image);
 	return page;
+}
+
+void CtDetailImageView::__fillPage(int page)
+{
+	if (page < 0 || page >= static_cast<int>(m_pages.size()) || m_pages[page].second.empty())
+		return;
+	Evas_Object* pageObj = m_pages[page].first;
+	if (Evas_Object* image = __createPicture(pageObj, m_pages[page].second))
+		elm_object_part_content_set(pageObj, "elm.swallow.content", image);
+	m_pages[page].second.clear();
+}
+
+bool CtDetailImageView::__fillNextPage()
+{
+	for (size_t page = 0; page < m_pages.size(); ++page) {
+		if (!m_pages[page].second.empty()) {
+			__fillPage(static_cast<int>(page));
+			return true;
+		}
+	}
+	return false;
 }
 
 void CtDetailImageView::onPushed(Elm_Object_Item* naviItem)
@@ -209,6 +241,7 @@ void CtDetailImageView::__scrollCb(void* data, Evas_Object* scroller, void*)
 	int page = 0;
 	elm_scroller_current_page_get(scroller, &page, nullptr);
 	view->m_page = page;
+	view->__fillPage(page);
 	view->__selectIndexOfPage(page);
 }
 

@@ -2,6 +2,7 @@
 #define _CT_DETAIL_IMAGE_VIEW_H_
 
 #include "CtView.h"
+#include "WUiTimer.h"
 #include "WView.h"
 
 #include <string>
@@ -44,7 +45,10 @@ protected:
 private:
 	Evas_Object* __createSingle(Evas_Object* parent, const std::string& path);
 	Evas_Object* __createPager(Evas_Object* parent);
-	Evas_Object* __createPage(Evas_Object* box, const std::string& path);
+	Evas_Object* __createPage(Evas_Object* box);
+	// Puts the picture into the page unless it has it already.
+	void __fillPage(int page);
+	bool __fillNextPage();
 	Evas_Object* __createPicture(Evas_Object* parent, const std::string& path);
 	void __showBackButton();
 	void __showPage(int page);
@@ -62,7 +66,11 @@ private:
 	Evas_Object* m_scroller = nullptr;
 	Evas_Object* m_box = nullptr;
 	Evas_Object* m_index = nullptr;
-	bool m_pageShown = false;
+	// Each page and the path of the picture it still lacks (empty once filled).
+	std::vector<std::pair<Evas_Object*, std::string>> m_pages;
+	app_assist::WUiTimerHandle m_pageFiller;
+	Evas_Coord m_pageWidth = 0;
+	Evas_Coord m_pageHeight = 0;
 };
 
 #endif

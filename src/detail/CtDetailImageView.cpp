@@ -41,6 +41,14 @@ Evas_Object* createDefaultPicture(Evas_Object* parent)
 	return image ? image : ctCommonCreateImage(parent, kImageEdj, "contacts_caller_id_default_full.png");
 }
 
+// A style the theme lacks costs a failed theme search on every use: it is
+// looked for once.
+bool hasScrollerEffectStyle()
+{
+	static const bool found = elm_theme_group_path_find(nullptr, "elm/scroller/base/effect") != nullptr;
+	return found;
+}
+
 // Reads the file's header only: the pixels are decoded when a page is drawn.
 bool isLoadablePicture(Evas_Object* parent, const std::string& path)
 {
@@ -123,7 +131,8 @@ Evas_Object* CtDetailImageView::__createPager(Evas_Object* parent)
 	// them laid out; the pager's own size corrects them when it differs.
 	evas_object_geometry_get(elm_object_parent_widget_get(parent), nullptr, nullptr, &m_pageWidth, &m_pageHeight);
 	m_scroller = elm_scroller_add(layout);
-	elm_object_style_set(m_scroller, "effect");
+	if (hasScrollerEffectStyle())
+		elm_object_style_set(m_scroller, "effect");
 	elm_scroller_loop_set(m_scroller, EINA_FALSE, EINA_FALSE);
 	elm_scroller_policy_set(m_scroller, ELM_SCROLLER_POLICY_OFF, ELM_SCROLLER_POLICY_OFF);
 	elm_scroller_page_relative_set(m_scroller, 1.0, 1.0);

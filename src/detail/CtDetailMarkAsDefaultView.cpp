@@ -184,8 +184,11 @@ void CtDetailMarkAsDefaultView::__addTitleButtons(Elm_Object_Item* naviItem)
 	Evas_Object* parent = naviframe->getEvasObj();
 	Evas_Object* cancel = ctCommonCreateButton(parent, "naviframe/title_left", "IDS_TPLATFORM_ACBUTTON_CANCEL_ABB",
 		__cancelClickedCb, this);
+	// Cancel takes the place of the back button; themes without a left
+	// title slot get it where Back would be.
+	if (Evas_Object* back = elm_object_item_part_content_unset(naviItem, "elm.swallow.prev_btn"))
+		evas_object_del(back);
 	elm_object_item_part_content_set(naviItem, "title_left_btn", cancel);
-	// Themes without a left title slot still get Cancel, where Back would be.
 	if (elm_object_item_part_content_get(naviItem, "title_left_btn") != cancel)
 		elm_object_item_part_content_set(naviItem, "elm.swallow.prev_btn", cancel);
 	m_doneButton = ctCommonCreateButton(parent, "naviframe/title_right", "IDS_TPLATFORM_ACBUTTON_DONE_ABB",

@@ -80,7 +80,8 @@ bool usesTrigramIndex(const contacts_filter_s::Item& item, const ViewInfo& view)
 
 // LIKE folds ASCII case only, as lower() does, and tests a row about three
 // times faster than instr(lower(...)); texts too long for a LIKE pattern use
-// the latter.
+// the latter. The pattern is an expression, not a bare parameter: SQLite
+// prepares a statement again at every new value of a bare LIKE parameter.
 constexpr size_t kMaxLikeTextBytes = 1024;
 
 std::string likePattern(const std::string& text)
@@ -97,7 +98,7 @@ std::string likePattern(const std::string& text)
 void containsTest(const std::string& col, const std::string& text, std::string& sql, std::vector<SqlParam>& params)
 {
 	if (text.size() <= kMaxLikeTextBytes) {
-		sql += col + " LIKE ? ESCAPE '\\'";
+		sql += col + " LIKE (? || '') ESCAPE '\\'";
 		params.push_back(textParam(likePattern(text)));
 	} else {
 		sql += "instr(lower(" + col + "), lower(?)) > 0";

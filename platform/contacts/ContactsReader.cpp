@@ -8,6 +8,7 @@
 
 #include <algorithm>
 #include <memory>
+#include <optional>
 
 namespace ct::contacts {
 
@@ -161,7 +162,16 @@ int ContactsReader::readList(const ViewInfo& view, const contacts_query_s* query
 	std::string sql = std::string("SELECT ") + (query && query->distinct ? "DISTINCT " : "") + cols + " FROM "
 		+ view.readSource;
 	std::vector<SqlParam> params;
-	int err = __where(view, query, sql, params, __indexChoice(query, offset, limit));
+	// A planned read sees one state of the file from planning to reading,
+	// and takes the read lock once.
+	std::optional<db::ReadSnapshot> snapshot;
+	contacts_filter_s::IndexChoice plan = __indexChoice(query, offset, limit);
+	contacts_filter_s::IndexChoice choice = !plan ? plan : [&](const std::string& text) {
+		if (!snapshot)
+			snapshot.emplace(m_conn.database());
+		return plan(text);
+	};
+	int err = __where(view, query, sql, params, choice);
 	if (err != CONTACTS_ERROR_NONE)
 		return err;
 	if (query && !query->sort.empty()) {

@@ -179,6 +179,11 @@ void CtPredictionListControl::updatePredictionList(const std::string& searchName
 	resize();
 }
 
+bool CtPredictionListControl::hasPredictions() const
+{
+	return m_model && m_model->getCount() > 0;
+}
+
 int CtPredictionListControl::getUnscaledHeight() const
 {
 	return kOneLineHeight * m_oneLineCount + kTwoLineHeight * m_twoLineCount + kBorderHeight;

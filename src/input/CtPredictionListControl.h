@@ -30,6 +30,8 @@ public:
 	// Places the list under the name field, as high as its first three rows.
 	void resize();
 
+	// False once a reload found nothing (the rows still show the last offer).
+	bool hasPredictions() const;
 	Evas_Object* getGenlist() const { return m_genlist; }
 	Evas_Object* getNameEntry() const { return m_nameEntry; }
 	// Units of height for the first three rows: 96 per one-line and 144 per

@@ -85,9 +85,12 @@ bool CtPredictionListTrigger::__onTypingPaused()
 		return false;
 	}
 	++m_loadCount;
-	if (CtPredictionListControl* list = getPredictionList())
+	if (CtPredictionListControl* list = getPredictionList()) {
 		list->updatePredictionList(m_pendingText);
-	else
+		// Rows of an earlier text must not stay up as if they matched.
+		if (!list->hasPredictions())
+			destroyPredictionList();
+	} else
 		__showPredictionList(entry, m_pendingRow, m_pendingText);
 	return false;
 }

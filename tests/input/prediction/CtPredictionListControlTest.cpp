@@ -277,7 +277,9 @@ TEST_F(CtPredictionListControlTest, LaterTypingUpdatesInPlaceAndNoMatchCloses)
 	waitPastPause();
 	EXPECT_EQ(list, m_trigger->getPredictionList()) << "the same list, updated";
 	EXPECT_EQ(1u, ScreenHarness::genlistItems(list->getGenlist()).size());
-	m_trigger->destroyPredictionList();
+	m_trigger->onNameChanged(m_entry, nullptr, "Anna Tx");
+	waitPastPause();
+	EXPECT_EQ(nullptr, m_trigger->getPredictionList()) << "no earlier rows left up";
 	m_trigger->onNameChanged(m_entry, nullptr, "Qxz");
 	waitPastPause();
 	EXPECT_EQ(nullptr, m_trigger->getPredictionList());

@@ -14,7 +14,7 @@ const int kPageSize = CtPredictionListModel::kMaxPredictions;
 
 class ScopedQuery {
 public:
-	ScopedQuery(const char* uri)
+	explicit ScopedQuery(const char* uri)
 	{
 		int err = contacts_query_create(uri, &m_query);
 		if (err != CONTACTS_ERROR_NONE)

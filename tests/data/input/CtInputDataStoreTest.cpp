@@ -243,15 +243,15 @@ TEST_F(CtInputDataStoreTest, GoogleStorageJoinsItsDefaultGroupOnceAndGroupNamesS
 TEST_F(CtInputDataStoreTest, BaseStorageComesFromThePreferenceWithSimPowerChecksExceptForEmergencyContacts)
 {
 	int account = addAddressbook("work@example.com", 0, 7, "Exchange");
-	int sim1 = ctCommonGetAddressBookId("SIM1");
+	int sim1 = ctCommonGetAddressBookId(CONTACTS_SIM1_ADDRESS_BOOK_NAME);
 	ASSERT_GT(sim1, 0);
-	const std::pair<const char*, int> choices[] = {{"work@example.com", account}, {"SIM1", sim1},
-		{"SIM2", 0}, {"gone@example.com", 0}, {"", 0}};
+	const std::pair<const char*, int> choices[] = {{"work@example.com", account}, {CONTACTS_SIM1_ADDRESS_BOOK_NAME, sim1},
+		{CONTACTS_SIM2_ADDRESS_BOOK_NAME, 0}, {"gone@example.com", 0}, {"", 0}};
 	for (const auto& [preference, expected] : choices) {
 		preference_set_string("input_base_addressbook", preference);
 		EXPECT_EQ(CtInputData(nullptr).getAddressbookId(), expected) << preference;
 	}
-	preference_set_string("input_base_addressbook", "SIM1");
+	preference_set_string("input_base_addressbook", CONTACTS_SIM1_ADDRESS_BOOK_NAME);
 	vconf_set_int("db/telephony/sim_power_state1", 0);
 	EXPECT_EQ(CtInputData(nullptr).getAddressbookId(), 0) << "a SIM that is off";
 
@@ -270,8 +270,8 @@ TEST_F(CtInputDataStoreTest, BaseStorageComesFromThePreferenceWithSimPowerChecks
 TEST_F(CtInputDataStoreTest, SimContactKeepsTheSecondOfExactlyTwoNumbers)
 {
 	// A new contact goes to the SIM chosen last time.
-	preference_set_string("input_base_addressbook", "SIM1");
-	int sim1 = ctCommonGetAddressBookId("SIM1");
+	preference_set_string("input_base_addressbook", CONTACTS_SIM1_ADDRESS_BOOK_NAME);
+	int sim1 = ctCommonGetAddressBookId(CONTACTS_SIM1_ADDRESS_BOOK_NAME);
 	contacts_record_h two = newContact(sim1, "Two");
 	addNumber(two, "111", CONTACTS_NUMBER_TYPE_CELL);
 	addNumber(two, "222", CONTACTS_NUMBER_TYPE_CELL);
@@ -299,7 +299,7 @@ TEST_F(CtInputDataStoreTest, SimContactKeepsTheSecondOfExactlyTwoNumbers)
 TEST_F(CtInputDataStoreTest, SimSaveStoresTheWholeNameAndACleanNumber)
 {
 	CtInputData data(nullptr);
-	data.setAddressbookInfo(ctCommonGetAddressBookId("SIM1"));
+	data.setAddressbookInfo(ctCommonGetAddressBookId(CONTACTS_SIM1_ADDRESS_BOOK_NAME));
 	EXPECT_EQ(data.getSimNo(), 1);
 	EXPECT_EQ(data.getSimFieldTextMaxLen(CONTACTS_SIM_FIELD_NAME), 14);
 	EXPECT_TRUE(data.getSimFieldStatus(CONTACTS_SIM_FIELD_EMAIL));
@@ -324,7 +324,7 @@ TEST_F(CtInputDataStoreTest, SimThatIsOffOrFullRefusesTheSave)
 {
 	std::ofstream(m_dir.file("sim.conf")) << "[SIM1]\ncapacity=1\n";
 	reopenStore();
-	int sim1 = ctCommonGetAddressBookId("SIM1");
+	int sim1 = ctCommonGetAddressBookId(CONTACTS_SIM1_ADDRESS_BOOK_NAME);
 	ASSERT_GT(sim1, 0);
 	auto simContact = [&](const char* name) {
 		auto data = std::make_unique<CtInputData>(nullptr);
@@ -358,14 +358,14 @@ TEST_F(CtInputDataStoreTest, SimWithoutTextLimitsGetsTheDefaultLengthAndStoresNo
 	std::ofstream(m_dir.file("sim.conf")) << "[SIM1]\nname_max=0\nnumber_max=0\nemail_max=0\n";
 	reopenStore();
 	CtInputData data(nullptr);
-	data.setAddressbookInfo(ctCommonGetAddressBookId("SIM1"));
+	data.setAddressbookInfo(ctCommonGetAddressBookId(CONTACTS_SIM1_ADDRESS_BOOK_NAME));
 	EXPECT_EQ(data.getSimFieldTextMaxLen(CONTACTS_SIM_FIELD_NAME), 20);
 	EXPECT_EQ(data.getSimFieldTextMaxLen(CONTACTS_SIM_FIELD_NUMBER), 20);
 	EXPECT_EQ(data.getSimFieldTextMaxLen(CONTACTS_SIM_FIELD_EMAIL), 0);
 
 	std::ofstream(m_dir.file("sim.conf")) << "[SIM1]\nemail_max=0\n";
 	reopenStore();
-	data.setAddressbookInfo(ctCommonGetAddressBookId("SIM1"));
+	data.setAddressbookInfo(ctCommonGetAddressBookId(CONTACTS_SIM1_ADDRESS_BOOK_NAME));
 	data.setFullName("Mail Less");
 	data.addNumber("12");
 	data.addEmail("dropped@x");

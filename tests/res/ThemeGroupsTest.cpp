@@ -239,7 +239,9 @@ TEST(ThemeGroups, EveryWidgetStyleTheCodeNamesExists)
 		{"wheel", {"elm/progressbar/horizontal/wheel"}},
 		{"tabbar_with_title", {"elm/toolbar/base/tabbar_with_title", "elm/toolbar/item/tabbar_with_title"}},
 		{"tabbar", {"elm/naviframe/item/tabbar/default"}}, {"basic", {"elm/naviframe/item/basic/default"}},
-		{"datetime", {"elm/uiclock/base/default"}}};
+		{"datetime", {"elm/uiclock/base/default"}},
+		// The indicator looks the picture viewer switches between.
+		{"indicator", {"elm/layout/indicator/headerbg", "elm/layout/indicator/image/viewer"}}};
 	const std::set<std::string> asked = scanWidgetStyles();
 	ASSERT_GE(asked.size(), 5u) << "the scan no longer finds the widget styles";
 	for (const std::string& style : asked)

@@ -401,6 +401,8 @@ bool ContactsVcardReader::__readTyped(const VcardProperty& p)
 		empty = empty && part.empty();
 	if (empty)
 		return true;
+	if (kind == Kind::Number && strncasecmp(parts[0].c_str(), "tel:", 4) == 0)
+		parts[0].erase(0, 4);
 	int type = 0;
 	bool pref = !p.param("PREF").empty();
 	std::string label;

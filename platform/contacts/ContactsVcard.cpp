@@ -257,7 +257,8 @@ void addCompanies(Card& card, const contacts_record_s& s)
 		// Several companies: each one's lines share a group so they stay together.
 		std::string group = companies.size() > 1 ? "item" + std::to_string(++card.items) + "." : "";
 		if (hasText(c->getStr("name")) || hasText(c->getStr("department")))
-			addLine(card, group + "ORG:" + V::escape(c->getStr("name")) + ";" + V::escape(c->getStr("department")));
+			addLine(card, group + "ORG:" + V::escape(c->getStr("name"))
+				+ (hasText(c->getStr("department")) ? ";" + V::escape(c->getStr("department")) : ""));
 		for (const auto& [prop, name] : { std::pair{ "job_title", "TITLE" }, { "role", "ROLE" },
 				 { "assistant_name", "X-ASSISTANT" }, { "phonetic_name", "X-PHONETIC-ORG" },
 				 { "location", "X-COMPANY-LOCATION" }, { "description", "X-COMPANY-DESCRIPTION" } })
@@ -455,6 +456,14 @@ int contacts_vcard_make_from_person(contacts_record_h person, char** vcard_strea
 	}
 	if (contacts.empty())
 		return CONTACTS_ERROR_NO_DATA;
+	// One preferred number and e-mail: the person's defaults, not each contact's.
+	for (auto [prop, kind] : { std::pair{ "number", CONTACTS_PERSON_PROPERTY_NUMBER }, { "email", CONTACTS_PERSON_PROPERTY_EMAIL } }) {
+		int defaultId = 0;
+		contacts_person_get_default_property(kind, person->getInt("id"), &defaultId);
+		for (const auto& c : contacts)
+			for (contacts_record_s* child : *c->children(prop))
+				child->setInt("is_default", child->getInt("id") == defaultId ? 1 : 0);
+	}
 	// The name contact first, so that N comes from it.
 	int nameContact = person->getInt("display_contact_id");
 	std::vector<const contacts_record_s*> sources;

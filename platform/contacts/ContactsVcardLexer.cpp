@@ -97,6 +97,14 @@ bool parseProperty(std::string_view line, VcardProperty& p)
 
 bool endsWithSoftBreak(const std::string& value) { return !value.empty() && value.back() == '='; }
 
+// A line whose parameters say quoted-printable and that ends in '='.
+bool isSoftBreak(const std::string& line)
+{
+	size_t colon = findUnquoted(line, ':');
+	return endsWithSoftBreak(line) && colon != std::string::npos
+		&& upper(std::string_view(line).substr(0, colon)).find("QUOTED-PRINTABLE") != std::string::npos;
+}
+
 } // namespace
 
 std::string VcardProperty::param(const char* wanted) const
@@ -172,7 +180,13 @@ std::string ContactsVcardLexer::__logicalLine(const std::string& version)
 	size_t drop = version == "2.1" ? 0 : 1;
 	for (std::string_view next; __peekLine(&next) && isFolded(next);) {
 		__physicalLine(&next);
-		line.append(next.substr(drop));
+		// A quoted-printable soft break keeps the next line whole.
+		if (isSoftBreak(line)) {
+			line.pop_back();
+			line.append(next);
+		} else {
+			line.append(next.substr(drop));
+		}
 	}
 	return line;
 }

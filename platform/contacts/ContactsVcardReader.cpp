@@ -126,6 +126,22 @@ bool decodedValue(const VcardProperty& p, const std::string& version, std::strin
 	return true;
 }
 
+// Line breaks inside values (quoted-printable =0D=0A) stored as "\n".
+void normaliseLineBreaks(std::string& text)
+{
+	size_t to = 0;
+	for (size_t i = 0; i < text.size(); ++i) {
+		if (text[i] == '\r') {
+			text[to++] = '\n';
+			if (i + 1 < text.size() && text[i + 1] == '\n')
+				++i;
+		} else {
+			text[to++] = text[i];
+		}
+	}
+	text.resize(to);
+}
+
 // Backslash escapes undone; an unknown escape keeps its backslash.
 std::string unescaped(const std::string& in, size_t from, size_t to)
 {
@@ -252,6 +268,7 @@ bool ContactsVcardReader::__text(const VcardProperty& p, std::string* out)
 	std::string decoded, error;
 	if (!decodedValue(p, m_card.version, &decoded, &error))
 		return __refuse(p, error);
+	normaliseLineBreaks(decoded);
 	*out = unescaped(decoded, 0, decoded.size());
 	return true;
 }
@@ -261,6 +278,7 @@ bool ContactsVcardReader::__components(const VcardProperty& p, std::vector<std::
 	std::string decoded, error;
 	if (!decodedValue(p, m_card.version, &decoded, &error))
 		return __refuse(p, error);
+	normaliseLineBreaks(decoded);
 	out->clear();
 	size_t start = 0;
 	for (size_t i = 0; i <= decoded.size(); ++i) {

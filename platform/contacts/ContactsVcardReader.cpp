@@ -282,8 +282,8 @@ bool ContactsVcardReader::__components(const VcardProperty& p, std::vector<std::
 	out->clear();
 	size_t start = 0;
 	for (size_t i = 0; i <= decoded.size(); ++i) {
-		if (i < decoded.size() && decoded[i] == '\\') {
-			++i;
+		if (i + 1 < decoded.size() && decoded[i] == '\\') {
+			++i; // an escaped character never separates
 			continue;
 		}
 		if (i == decoded.size() || decoded[i] == separator) {
@@ -632,7 +632,6 @@ bool ContactsVcardReader::__readList(const VcardProperty& p)
 		if (item.empty())
 			continue;
 		if (p.name == "CATEGORIES") {
-			m_hasData = true;
 			if (std::find(m_entry.groups.begin(), m_entry.groups.end(), item) == m_entry.groups.end())
 				m_entry.groups.push_back(item);
 		} else if (!__setStr(__child(_contacts_contact.nickname, _contacts_nickname._uri), _contacts_nickname.name, item)) {

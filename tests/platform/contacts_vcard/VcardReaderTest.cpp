@@ -177,3 +177,10 @@ TEST(VcardReader, ACardWithoutEndDoesNotSwallowTheNextOne)
 	EXPECT_EQ("refused: no END:VCARD before the next card", cards[0]);
 	expectHas(cards[1], { "first=Second\n" });
 }
+
+TEST(VcardReader, ABackslashAtTheEndOfAValueIsKeptAsText)
+{
+	std::vector<std::string> cards = readAll(card("3.0", "ORG:Acme\\\r\nN:Smith\\\r\nNICKNAME:A\\\r\n"));
+	ASSERT_EQ(1u, cards.size());
+	expectHas(cards[0], { "name=Acme\\\n", "last=Smith\\\n", "name=A\\\n" });
+}

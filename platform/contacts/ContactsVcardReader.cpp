@@ -417,10 +417,10 @@ bool ContactsVcardReader::__readTyped(const VcardProperty& p)
 	bool empty = true;
 	for (const std::string& part : parts)
 		empty = empty && part.empty();
-	if (empty)
-		return true;
 	if (kind == Kind::Number && strncasecmp(parts[0].c_str(), "tel:", 4) == 0)
 		parts[0].erase(0, 4);
+	if (empty || (kind != Kind::Address && parts[0].empty()))
+		return true;
 	int type = 0;
 	bool pref = !p.param("PREF").empty();
 	std::string label;
@@ -570,6 +570,8 @@ bool ContactsVcardReader::__readMessenger(const VcardProperty& p)
 		m = !service.empty() ? ContactsVcardTypes::messengerOfService(service) : ContactsVcardTypes::messengerOfScheme(scheme);
 		if (!m && !service.empty())
 			label = service;
+		if (value.empty())
+			return true;
 	} else {
 		m = ContactsVcardTypes::messengerOfProperty(p.name);
 	}

@@ -184,3 +184,11 @@ TEST(VcardReader, ABackslashAtTheEndOfAValueIsKeptAsText)
 	ASSERT_EQ(1u, cards.size());
 	expectHas(cards[0], { "name=Acme\\\n", "last=Smith\\\n", "name=A\\\n" });
 }
+
+TEST(VcardReader, ValuesThatAreOnlyASchemeMakeNoField)
+{
+	std::vector<std::string> cards = readAll(card("4.0", "FN:A\r\nTEL;VALUE=uri:tel:\r\nIMPP;X-SERVICE-TYPE=Skype:skype:\r\n"));
+	ASSERT_EQ(1u, cards.size());
+	EXPECT_EQ(std::string::npos, cards[0].find("number")) << cards[0];
+	EXPECT_EQ(std::string::npos, cards[0].find("messenger")) << cards[0];
+}

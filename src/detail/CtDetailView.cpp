@@ -589,7 +589,8 @@ void CtDetailView::__updateFavoriteBtn()
 {
 	Elm_Object_Item* naviItem = getNaviItem();
 	WPRET_M(!naviItem, "naviItem is nullptr");
-	WPRET_M(m_isSimContact, "__isSimContact == true");
+	if (m_isSimContact)
+		return;   // SIM cards keep no favourites
 	if (elm_object_item_part_content_get(naviItem, "title_right_btn"))
 		return;
 	std::string edj;

@@ -414,69 +414,81 @@ bool ContactsVcardReader::__readTyped(const VcardProperty& p)
 	if (!__components(p, &parts, kind == Kind::Address ? ';' : '\0'))
 		return false;
 	parts.resize(7);
-	bool empty = true;
-	for (const std::string& part : parts)
-		empty = empty && part.empty();
 	if (kind == Kind::Number && strncasecmp(parts[0].c_str(), "tel:", 4) == 0)
 		parts[0].erase(0, 4);
+	bool empty = std::all_of(parts.begin(), parts.end(), [](const std::string& part) { return part.empty(); });
 	if (empty || (kind != Kind::Address && parts[0].empty()))
 		return true;
-	int type = 0;
-	bool pref = !p.param("PREF").empty();
-	std::string label;
+	TypedValue typed = __typedValue(p, kind);
+	switch (kind) {
+	case Kind::Number: return __addNumber(parts[0], typed);
+	case Kind::Email: return __addEmail(parts[0], typed);
+	case Kind::Address: return __addAddress(parts, typed);
+	case Kind::Url: return __addUrl(parts[0], typed);
+	}
+	return true;
+}
+
+// TYPE values (PREF, known names, X-names as labels) and the label of the
+// property's group.
+ContactsVcardReader::TypedValue ContactsVcardReader::__typedValue(const VcardProperty& p, Kind kind) const
+{
+	TypedValue typed;
+	typed.pref = !p.param("PREF").empty();
+	auto addBit = [&](int bit) { typed.type = kind == Kind::Url ? bit : typed.type | bit; };
 	for (const std::string& t : p.types()) {
 		int bit = ContactsVcardTypes::typeBit(kind, t);
 		if (t == "PREF")
-			pref = true;
+			typed.pref = true;
 		else if (bit)
-			type = kind == Kind::Url ? bit : type | bit;
-		else if (t.size() > 2 && t.compare(0, 2, "X-") == 0 && label.empty())
-			label = t.substr(2);
+			addBit(bit);
+		else if (t.size() > 2 && t.compare(0, 2, "X-") == 0 && typed.label.empty())
+			typed.label = t.substr(2);
 	}
 	std::string groupLabel = bareLabel(__groupLabel(p.group));
 	if (int bit = groupLabel.empty() ? 0 : ContactsVcardTypes::typeBit(kind, groupLabel))
-		type = kind == Kind::Url ? bit : type | bit;
+		addBit(bit);
 	else if (!groupLabel.empty() && !same(groupLabel, "Other"))
-		label = groupLabel;
-	if (!label.empty())
-		type = kind == Kind::Url ? CONTACTS_URL_TYPE_CUSTOM : type | 1;
-	contacts_record_h r = nullptr;
-	unsigned labelProp = 0;
-	bool ok = true;
-	switch (kind) {
-	case Kind::Number:
-		r = __child(_contacts_contact.number, _contacts_number._uri);
-		ok = __setStr(r, _contacts_number.number, parts[0]);
-		contacts_record_set_int(r, _contacts_number.type, type);
-		contacts_record_set_bool(r, _contacts_number.is_default, pref);
-		labelProp = _contacts_number.label;
-		break;
-	case Kind::Email:
-		r = __child(_contacts_contact.email, _contacts_email._uri);
-		ok = __setStr(r, _contacts_email.email, parts[0]);
-		contacts_record_set_int(r, _contacts_email.type, type);
-		contacts_record_set_bool(r, _contacts_email.is_default, pref);
-		labelProp = _contacts_email.label;
-		break;
-	case Kind::Address: {
-		r = __child(_contacts_contact.address, _contacts_address._uri);
-		const unsigned props[] = { _contacts_address.postbox, _contacts_address.extended, _contacts_address.street,
-			_contacts_address.locality, _contacts_address.region, _contacts_address.postal_code, _contacts_address.country };
-		for (size_t i = 0; i < 7 && ok; ++i)
-			ok = __setStr(r, props[i], parts[i]);
-		contacts_record_set_int(r, _contacts_address.type, type);
-		contacts_record_set_bool(r, _contacts_address.is_default, pref);
-		labelProp = _contacts_address.label;
-		break;
-	}
-	case Kind::Url:
-		r = __child(_contacts_contact.url, _contacts_url._uri);
-		ok = __setStr(r, _contacts_url.url, parts[0]);
-		contacts_record_set_int(r, _contacts_url.type, type);
-		labelProp = _contacts_url.label;
-		break;
-	}
-	return ok && __setStr(r, labelProp, label);
+		typed.label = groupLabel;
+	if (!typed.label.empty())
+		typed.type = kind == Kind::Url ? CONTACTS_URL_TYPE_CUSTOM : typed.type | 1;
+	return typed;
+}
+
+bool ContactsVcardReader::__addNumber(const std::string& number, const TypedValue& typed)
+{
+	contacts_record_h r = __child(_contacts_contact.number, _contacts_number._uri);
+	contacts_record_set_int(r, _contacts_number.type, typed.type);
+	contacts_record_set_bool(r, _contacts_number.is_default, typed.pref);
+	return __setStr(r, _contacts_number.number, number) && __setStr(r, _contacts_number.label, typed.label);
+}
+
+bool ContactsVcardReader::__addEmail(const std::string& email, const TypedValue& typed)
+{
+	contacts_record_h r = __child(_contacts_contact.email, _contacts_email._uri);
+	contacts_record_set_int(r, _contacts_email.type, typed.type);
+	contacts_record_set_bool(r, _contacts_email.is_default, typed.pref);
+	return __setStr(r, _contacts_email.email, email) && __setStr(r, _contacts_email.label, typed.label);
+}
+
+bool ContactsVcardReader::__addAddress(const std::vector<std::string>& parts, const TypedValue& typed)
+{
+	contacts_record_h r = __child(_contacts_contact.address, _contacts_address._uri);
+	contacts_record_set_int(r, _contacts_address.type, typed.type);
+	contacts_record_set_bool(r, _contacts_address.is_default, typed.pref);
+	const unsigned props[] = { _contacts_address.postbox, _contacts_address.extended, _contacts_address.street,
+		_contacts_address.locality, _contacts_address.region, _contacts_address.postal_code, _contacts_address.country };
+	for (size_t i = 0; i < 7; ++i)
+		if (!__setStr(r, props[i], parts[i]))
+			return false;
+	return __setStr(r, _contacts_address.label, typed.label);
+}
+
+bool ContactsVcardReader::__addUrl(const std::string& url, const TypedValue& typed)
+{
+	contacts_record_h r = __child(_contacts_contact.url, _contacts_url._uri);
+	contacts_record_set_int(r, _contacts_url.type, typed.type);
+	return __setStr(r, _contacts_url.url, url) && __setStr(r, _contacts_url.label, typed.label);
 }
 
 bool ContactsVcardReader::__readCompany(const VcardProperty& p)

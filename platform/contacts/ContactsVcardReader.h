@@ -3,6 +3,7 @@
 #pragma once
 
 #include "ContactsVcardLexer.h"
+#include "ContactsVcardTypes.h"
 #include "contacts_types.h"
 
 #include <map>
@@ -59,6 +60,16 @@ private:
 	std::string __groupLabel(const std::string& group) const;
 	bool __readName(const VcardProperty& p);
 	bool __readTyped(const VcardProperty& p);
+	struct TypedValue {
+		int type = 0;
+		bool pref = false;
+		std::string label;
+	};
+	TypedValue __typedValue(const VcardProperty& p, ContactsVcardTypes::Kind kind) const;
+	bool __addNumber(const std::string& number, const TypedValue& typed);
+	bool __addEmail(const std::string& email, const TypedValue& typed);
+	bool __addAddress(const std::vector<std::string>& parts, const TypedValue& typed);
+	bool __addUrl(const std::string& url, const TypedValue& typed);
 	bool __readCompany(const VcardProperty& p);
 	bool __readEvent(const VcardProperty& p);
 	bool __readMessenger(const VcardProperty& p);

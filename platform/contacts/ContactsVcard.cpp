@@ -226,6 +226,12 @@ std::string eventDate(int date, std::string* params)
 	return buf;
 }
 
+const char* eventLabel(const contacts_record_s& event)
+{
+	bool custom = event.getInt("type") == CONTACTS_EVENT_TYPE_CUSTOM && hasText(event.getStr("label"));
+	return custom ? event.getStr("label") : ContactsVcardTypes::otherLabel();
+}
+
 void addEvents(Card& card, const contacts_record_s& s)
 {
 	for (const contacts_record_s* c : childrenOf(s, "event")) {
@@ -244,9 +250,7 @@ void addEvents(Card& card, const contacts_record_s& s)
 		else if (type == CONTACTS_EVENT_TYPE_ANNIVERSARY)
 			addLine(card, "X-ANNIVERSARY" + params + ":" + value);
 		else
-			addLabelled(card, "X-ABDATE" + params, value,
-				type == CONTACTS_EVENT_TYPE_CUSTOM && hasText(c->getStr("label")) ? c->getStr("label")
-																				   : ContactsVcardTypes::otherLabel());
+			addLabelled(card, "X-ABDATE" + params, value, eventLabel(*c));
 	}
 }
 

@@ -58,6 +58,16 @@ int contactsErrorOfErrno(int err)
 										  : CONTACTS_ERROR_SYSTEM;
 }
 
+std::string writeFailure(int err)
+{
+	switch (err) {
+	case CONTACTS_ERROR_FILE_NO_SPACE: return "the disk is full";
+	case CONTACTS_ERROR_DB_LOCKED: return "another program holds the contacts database";
+	case CONTACTS_ERROR_PERMISSION_DENIED: return "the contacts database or the picture folder cannot be written";
+	default: return "the contacts database refused the write (" + std::to_string(err) + ")";
+	}
+}
+
 VcardImportReport failedReport(int error, const std::string& text)
 {
 	VcardImportReport report;
@@ -116,8 +126,7 @@ VcardImportReport ContactsVcardImport::importText(std::string_view text, int add
 	if (err != CONTACTS_ERROR_NONE) {
 		WFAILED("import", err);
 		import.__removeSavedPictures();
-		VcardImportReport failed = failedReport(err, "nothing was stored: the contacts database refused the write ("
-			+ std::to_string(err) + ")");
+		VcardImportReport failed = failedReport(err, "nothing was stored: " + writeFailure(err));
 		failed.cards = report.cards;
 		return failed;
 	}

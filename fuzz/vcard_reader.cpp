@@ -33,7 +33,7 @@ const char* const kLines[] = { "N:", "N;CHARSET=ISO-8859-1;ENCODING=QUOTED-PRINT
 	"item3.X-ABDATE;X-CALSCALE=LUNAR:", "IMPP;X-SERVICE-TYPE=Skype:", "X-AIM:", "NOTE;ENCODING=QUOTED-PRINTABLE:",
 	"PHOTO;ENCODING=b;TYPE=PNG:iVBORw0KGgo", "LOGO;ENCODING=BASE64:", "CATEGORIES:", "NICKNAME:", "URL;TYPE=HOME:",
 	"RELATED;TYPE=spouse:", "VERSION:2.1", "VERSION:4.0", "BEGIN:VCARD", "END:VCARD", "AGENT:", " ", "=",
-	"X-PHONETIC-FIRST-NAME:", "UID:", "\\", ";", "," };
+	"X-PHONETIC-FIRST-NAME:", "UID:", "X-SOCIALPROFILE;X-USER=a;TYPE=", "\\", ";", "," };
 constexpr size_t kLineCount = sizeof(kLines) / sizeof(kLines[0]);
 
 std::string cardOf(const uint8_t* data, size_t size)

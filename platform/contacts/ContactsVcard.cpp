@@ -285,6 +285,24 @@ void addPictures(Card& card, const contacts_record_s& s)
 		addPicture(card, "PHOTO", c->getStr("path"));
 }
 
+// Social-network profiles: the service as TYPE (what address books show),
+// the rest of the launch data in extension parameters.
+void addSocialProfiles(Card& card, const contacts_record_s& s)
+{
+	static const std::pair<const char*, const char*> params[] = { { "label", "TYPE" }, { "uid", "X-USER" },
+		{ "text", "X-TEXT" }, { "app_id", "X-APP-ID" }, { "service_operation", "X-OPERATION" }, { "mime", "X-MIME" },
+		{ "category", "X-CATEGORY" }, { "extra_data", "X-EXTRA" } };
+	for (const contacts_record_s* c : childrenOf(s, "profile")) {
+		std::string line = "X-SOCIALPROFILE";
+		if (c->getInt("type"))
+			line += ";X-PROFILE-TYPE=" + std::to_string(c->getInt("type"));
+		for (const auto& [prop, param] : params)
+			if (hasText(c->getStr(prop)))
+				line += std::string(";") + param + "=" + paramValue(c->getStr(prop));
+		addLine(card, line + ":" + V::escape(c->getStr("uri")));
+	}
+}
+
 void addSimpleLines(Card& card, const contacts_record_s& s)
 {
 	for (const contacts_record_s* c : childrenOf(s, "nickname"))
@@ -389,6 +407,7 @@ std::string ContactsVcard::make(const std::vector<const contacts_record_s*>& sou
 		addMessengers(card, *s);
 		addRelationships(card, *s);
 		addEvents(card, *s);
+		addSocialProfiles(card, *s);
 	}
 	addCategories(card, sources);
 	addUid(card, sources);

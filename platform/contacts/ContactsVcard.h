@@ -19,7 +19,8 @@ public:
 	// from the first name found. Every stored field is written: numbers,
 	// e-mails, addresses, web sites with their types and custom labels,
 	// messengers, relationships, events, notes, nicknames, companies,
-	// pictures (embedded), groups (CATEGORIES) and the profile status.
+	// social-network profiles, pictures (embedded), groups (CATEGORIES) and
+	// the profile status.
 	// CRLF line ends, lines folded at 75 bytes, values escaped.
 	static std::string make(const std::vector<const contacts_record_s*>& sources, const std::string& displayName);
 	// The text escaped for a vCard 3.0 value.

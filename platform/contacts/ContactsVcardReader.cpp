@@ -379,6 +379,8 @@ bool ContactsVcardReader::__readProperty(const VcardProperty& p)
 		return __readMessenger(p);
 	if (n == "X-ABRELATEDNAMES" || n == "RELATED")
 		return __readRelationship(p);
+	if (n == "X-SOCIALPROFILE")
+		return __readSocialProfile(p);
 	if (n == "PHOTO") {
 		VcardPicture picture;
 		if (!__readPicture(p, &picture))
@@ -608,6 +610,28 @@ bool ContactsVcardReader::__readRelationship(const VcardProperty& p)
 	contacts_record_set_int(relation, _contacts_relationship.type, type);
 	return __setStr(relation, _contacts_relationship.name, value)
 		&& (type != CONTACTS_RELATIONSHIP_TYPE_CUSTOM || __setStr(relation, _contacts_relationship.label, label));
+}
+
+bool ContactsVcardReader::__readSocialProfile(const VcardProperty& p)
+{
+	static const std::pair<const char*, unsigned> params[] = { { "TYPE", _contacts_profile.label },
+		{ "X-USER", _contacts_profile.uid }, { "X-TEXT", _contacts_profile.text },
+		{ "X-APP-ID", _contacts_profile.app_id }, { "X-OPERATION", _contacts_profile.service_operation },
+		{ "X-MIME", _contacts_profile.mime }, { "X-CATEGORY", _contacts_profile.category },
+		{ "X-EXTRA", _contacts_profile.extra_data } };
+	std::string uri;
+	if (!__text(p, &uri))
+		return false;
+	contacts_record_h profile = __child(_contacts_contact.profile, _contacts_profile._uri);
+	contacts_record_set_int(profile, _contacts_profile.type, atoi(p.param("X-PROFILE-TYPE").c_str()));
+	for (const auto& [param, prop] : params) {
+		std::string value = p.param(param);
+		if (!g_utf8_validate(value.c_str(), static_cast<gssize>(value.size()), nullptr))
+			return __refuse(p, "parameter " + std::string(param) + " is not UTF-8");
+		if (!__setStr(profile, prop, value))
+			return false;
+	}
+	return __setStr(profile, _contacts_profile.uri, uri);
 }
 
 bool ContactsVcardReader::__readPicture(const VcardProperty& p, VcardPicture* picture)

@@ -74,6 +74,7 @@ private:
 	bool __readEvent(const VcardProperty& p);
 	bool __readMessenger(const VcardProperty& p);
 	bool __readRelationship(const VcardProperty& p);
+	bool __readSocialProfile(const VcardProperty& p);
 	bool __readPicture(const VcardProperty& p, VcardPicture* picture);
 	bool __readList(const VcardProperty& p);
 	bool __finish();

@@ -210,6 +210,11 @@ TEST(VcardMaker, AnIndependentParserReadsEveryFieldOfARichPerson)
 		row("X-ABDATE", "", "X-CALSCALE=LUNAR X-LEAP-MONTH=TRUE", "2012-06-30", "Graduation"),
 		row("CATEGORIES", "", "", "Family,Work, Team"),
 		row("UID", "", "", "uid-123@example"),
+		row("X-SOCIALPROFILE", "FRIENDBOOK",
+			"X-APP-ID=com.example.friendbook X-CATEGORY=social X-EXTRA=aWQ=:MTIz,bmFtZQ==:QW5uYQ== X-MIME=vnd.example/profile "
+			"X-OPERATION=http://example.org/appcontrol/operation/social/view X-PROFILE-TYPE=1 X-TEXT=Anna on Friendbook "
+			"X-USER=anna.oneil",
+			"https://friendbook.example/anna;p=1"),
 		row("PHOTO", "PNG", "", "sha1:" + sha1(fileBytes(rich.picture1))),
 		row("PHOTO", "JPEG", "", "sha1:" + sha1(fileBytes(rich.picture2))),
 		"END",

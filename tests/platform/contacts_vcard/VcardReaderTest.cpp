@@ -106,7 +106,7 @@ TEST(VcardReader, ReadsAddressBookLabelsFoldsAndGroupsOfVersionThree)
 		"email=anna@other.example\n", "type=1\n  label=Golf club\n  email=anna@club.example\n",
 		"type=3\n  date=20010506\n", "type=2\n  date=304\n", "type=14\n  name=Bob\n",
 		"type=10\n  im_id=anna.s\n", "note=한국어\n", "group=Friends\n", "group=Golf, club\n", "picture=PNG" });
-	EXPECT_EQ(std::string::npos, cards[0].find("twitter"));
+	expectHas(cards[0], { "profile:\n  label=twitter\n  uri=https://twitter.example/anna\n" });
 }
 
 TEST(VcardReader, ReadsVersionFourValues)

@@ -190,6 +190,17 @@ inline RichContact fillRich(contacts_record_h c, const TempDataDir& dir)
 	setStr(addChild(c, images, _contacts_image._uri), _contacts_image.path, rich.picture2.c_str());
 	if (isContact) {
 		contacts_record_set_str(c, _contacts_contact.uid, "uid-123@example");
+		contacts_record_h social = addChild(c, _contacts_contact.profile, _contacts_profile._uri);
+		contacts_record_set_int(social, _contacts_profile.type, 1);
+		setStr(social, _contacts_profile.label, "Friendbook");
+		setStr(social, _contacts_profile.uid, "anna.oneil");
+		setStr(social, _contacts_profile.text, "Anna on Friendbook");
+		setStr(social, _contacts_profile.app_id, "com.example.friendbook");
+		setStr(social, _contacts_profile.service_operation, "http://example.org/appcontrol/operation/social/view");
+		setStr(social, _contacts_profile.mime, "vnd.example/profile");
+		setStr(social, _contacts_profile.category, "social");
+		setStr(social, _contacts_profile.extra_data, "aWQ=:MTIz,bmFtZQ==:QW5uYQ==");
+		setStr(social, _contacts_profile.uri, "https://friendbook.example/anna;p=1");
 		for (const char* group : { "Family", "Work, Team" }) {
 			rich.groupIds.push_back(addGroup(group));
 			contacts_record_set_int(addChild(c, _contacts_contact.group_relation, _contacts_group_relation._uri),

@@ -78,6 +78,11 @@ Eina_Bool holdEndCb(void* ended)
 	return ECORE_CALLBACK_CANCEL;
 }
 
+void transitionFinishedCb(void* pushing, Evas_Object*, void*)
+{
+	*static_cast<bool*>(pushing) = false;
+}
+
 void winDeleteRequestCb(void*, Evas_Object*, void*)
 {
 	elm_exit();
@@ -148,6 +153,7 @@ bool DemoApp::__start()
 	if (!m_naviframe->create(m_window->getBaseLayoutEvasObj(), nullptr))
 		return false;
 	m_naviframeAlive = m_naviframe->getWeakPtr();
+	evas_object_smart_callback_add(m_naviframe->getEvasObj(), "transition,finished", transitionFinishedCb, &m_pushing);
 	m_window->setContent(m_naviframe->getEvasObj());
 	m_naviframe->setOnLastViewBack([](bool* popOut) {
 		*popOut = false;
@@ -217,13 +223,20 @@ bool DemoApp::__pushScreen(const DemoScreen& screen, int personId)
 	}
 	if (!view || !m_naviframe || m_naviframeAlive.expired())
 		return false;
-	return m_naviframe->push(view);
+	// A screen pushed over another one slides in; pictures wait for the end.
+	m_pushing = m_naviframe->getViewCount() > 0;
+	bool pushed = m_naviframe->push(view);
+	if (!pushed)
+		m_pushing = false;
+	return pushed;
 }
 
 void DemoApp::__hold(double seconds)
 {
-	// Scripts driving the host from outside wait for the first line and read
-	// the second to learn what the changes made of the screen.
+	// Scripts driving the host from outside wait for the first line, printed
+	// once the screen is up and listening, and read the second to learn what
+	// the changes made of the screen.
+	__settle();
 	printf("holding %s for %g s\n", __topScreenName(), seconds);
 	fflush(stdout);
 	bool ended = false;
@@ -321,7 +334,7 @@ bool DemoApp::__settle(double maxSeconds)
 			seen = renders;
 			quietSince = ecore_time_get();
 		}
-		settled = ecore_time_get() - quietSince >= kQuietFramesForIdle * kFrame;
+		settled = !m_pushing && ecore_time_get() - quietSince >= kQuietFramesForIdle * kFrame;
 	}
 	ecore_timer_del(wake);
 	evas_event_callback_del_full(canvas, EVAS_CALLBACK_RENDER_POST, renderPostCb, &renders);

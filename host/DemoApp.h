@@ -61,6 +61,7 @@ private:
 	std::unique_ptr<app_assist::WWindow> m_window;
 	app_assist::WNaviframe* m_naviframe = nullptr;
 	std::weak_ptr<app_assist::WControl> m_naviframeAlive;
+	bool m_pushing = false;
 	std::weak_ptr<app_assist::WControl> m_listAlive;
 };
 

@@ -1,6 +1,7 @@
 #include "DemoScreens.h"
 
 #include "ContactsDebug.h"
+#include "ShareFieldsRequest.h"
 
 #include <contacts.h>
 
@@ -63,6 +64,12 @@ const std::vector<DemoScreen>& demoScreens()
 			}},
 		{"wizard", false, "the profile set-up wizard",
 			[](DemoScreenContext& c) { return make<CreateProfileWizardViewFn>(c.library, "createCtProfileWizardView"); }},
+		{"share-fields", true, "chosen fields of a person, returned as text the host prints",
+			[](DemoScreenContext& c) {
+				auto request = std::make_shared<ShareFieldsRequest>();
+				c.keepAlive.push_back(request);
+				return make<CreateShareContactViewFn>(c.library, "createCtShareContactView", c.personId, request->get());
+			}},
 	};
 	return screens;
 }

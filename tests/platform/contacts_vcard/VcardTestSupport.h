@@ -58,15 +58,140 @@ inline int addGroup(const char* name, int book = 0)
 	return insertRecord(group.get());
 }
 
-inline contacts_record_h typed(contacts_record_h parent, unsigned list, const char* uri, unsigned typeProp, int type)
+inline void setAll(contacts_record_h r, std::initializer_list<std::pair<unsigned, const char*>> values)
 {
-	contacts_record_h child = addChild(parent, list, uri);
-	contacts_record_set_int(child, typeProp, type);
-	return child;
+	for (const auto& [prop, value] : values)
+		setStr(r, prop, value);
+}
+
+// A contact or profile record being filled: the child list of either view.
+struct RichTarget {
+	contacts_record_h record;
+	bool isContact;
+	contacts_record_h add(unsigned contactList, unsigned profileList, const char* uri, unsigned typeProp = 0, int type = 0) const
+	{
+		contacts_record_h child = addChild(record, isContact ? contactList : profileList, uri);
+		if (typeProp)
+			contacts_record_set_int(child, typeProp, type);
+		return child;
+	}
+};
+
+inline void fillNameNumbersAndEmails(const RichTarget& t)
+{
+	setAll(t.add(_contacts_contact.name, _contacts_my_profile.name, _contacts_name._uri),
+		{ { _contacts_name.first, "Ánna" }, { _contacts_name.last, "O'Neil; Jr" }, { _contacts_name.addition, "Maria" },
+			{ _contacts_name.prefix, "Dr." }, { _contacts_name.suffix, "PhD" }, { _contacts_name.phonetic_first, "Ana" },
+			{ _contacts_name.phonetic_middle, "Mari" }, { _contacts_name.phonetic_last, "Oneel" } });
+	struct { int type; const char* label; const char* number; } numbers[] = {
+		{ CONTACTS_NUMBER_TYPE_CELL, nullptr, "+1 555 0100" },
+		{ CONTACTS_NUMBER_TYPE_HOME | CONTACTS_NUMBER_TYPE_VOICE, nullptr, "+1 555 0101" },
+		{ CONTACTS_NUMBER_TYPE_WORK | CONTACTS_NUMBER_TYPE_FAX, nullptr, "+1 555 0102" },
+		{ CONTACTS_NUMBER_TYPE_CUSTOM, "Boat; deck", "+1 555 0103" },
+		{ CONTACTS_NUMBER_TYPE_ASSISTANT, nullptr, "+1 555 0104" },
+		{ CONTACTS_NUMBER_TYPE_COMPANY_MAIN, nullptr, "+1 555 0105" }, { CONTACTS_NUMBER_TYPE_OTHER, nullptr, "*31#" } };
+	for (const auto& n : numbers) {
+		contacts_record_h r = t.add(_contacts_contact.number, _contacts_my_profile.number, _contacts_number._uri,
+			_contacts_number.type, n.type);
+		setAll(r, { { _contacts_number.number, n.number }, { _contacts_number.label, n.label } });
+		contacts_record_set_bool(r, _contacts_number.is_default, n.type == CONTACTS_NUMBER_TYPE_CELL);
+	}
+	struct { int type; const char* label; const char* email; } emails[] = {
+		{ CONTACTS_EMAIL_TYPE_HOME, nullptr, "anna@home.example" }, { CONTACTS_EMAIL_TYPE_CUSTOM, "Club", "anna@club.example" },
+		{ CONTACTS_EMAIL_TYPE_MOBILE, nullptr, "anna@mobile.example" }, { CONTACTS_EMAIL_TYPE_WORK, nullptr, "anna@work.example" } };
+	for (const auto& m : emails) {
+		contacts_record_h r = t.add(_contacts_contact.email, _contacts_my_profile.email, _contacts_email._uri,
+			_contacts_email.type, m.type);
+		setAll(r, { { _contacts_email.email, m.email }, { _contacts_email.label, m.label } });
+		contacts_record_set_bool(r, _contacts_email.is_default, m.type == CONTACTS_EMAIL_TYPE_HOME);
+	}
+}
+
+inline void fillAddressesAndOnlineIds(const RichTarget& t)
+{
+	contacts_record_h home = t.add(_contacts_contact.address, _contacts_my_profile.address, _contacts_address._uri,
+		_contacts_address.type, CONTACTS_ADDRESS_TYPE_HOME);
+	setAll(home, { { _contacts_address.postbox, "PO 7" }, { _contacts_address.extended, "Flat 2" },
+		{ _contacts_address.street, "1 Main St, Rear\nBuilding B" }, { _contacts_address.locality, "Springfield" },
+		{ _contacts_address.region, "IL" }, { _contacts_address.postal_code, "62701" }, { _contacts_address.country, "USA" } });
+	contacts_record_set_bool(home, _contacts_address.is_default, true);
+	setAll(t.add(_contacts_contact.address, _contacts_my_profile.address, _contacts_address._uri, _contacts_address.type,
+			   CONTACTS_ADDRESS_TYPE_CUSTOM),
+		{ { _contacts_address.label, "Cabin" }, { _contacts_address.locality, "Lakeside" } });
+	for (int type = CONTACTS_MESSENGER_TYPE_OTHER; type <= CONTACTS_MESSENGER_TYPE_IRC; ++type)
+		setAll(t.add(_contacts_contact.messenger, _contacts_my_profile.messenger, _contacts_messenger._uri,
+				   _contacts_messenger.type, type),
+			{ { _contacts_messenger.im_id, ("anna" + std::to_string(type) + "@im.example").c_str() },
+				{ _contacts_messenger.label, type == CONTACTS_MESSENGER_TYPE_CUSTOM ? "Signal" : nullptr } });
+	for (int type = CONTACTS_URL_TYPE_OTHER; type <= CONTACTS_URL_TYPE_WORK; ++type)
+		setAll(t.add(_contacts_contact.url, _contacts_my_profile.url, _contacts_url._uri, _contacts_url.type, type),
+			{ { _contacts_url.url, ("https://example.org/" + std::to_string(type) + "?a=1,b=2").c_str() },
+				{ _contacts_url.label, type == CONTACTS_URL_TYPE_CUSTOM ? "Blog" : nullptr } });
+	for (int type = CONTACTS_RELATIONSHIP_TYPE_OTHER; type <= CONTACTS_RELATIONSHIP_TYPE_CUSTOM; ++type)
+		setAll(t.add(_contacts_contact.relationship, _contacts_my_profile.relationship, _contacts_relationship._uri,
+				   _contacts_relationship.type, type),
+			{ { _contacts_relationship.name, ("Person " + std::to_string(type)).c_str() },
+				{ _contacts_relationship.label, type == CONTACTS_RELATIONSHIP_TYPE_CUSTOM ? "Godmother" : nullptr } });
+}
+
+inline void fillEventsAndTexts(const RichTarget& t)
+{
+	struct { int type; int date; const char* label; } events[] = { { CONTACTS_EVENT_TYPE_BIRTH, 19900102, nullptr },
+		{ CONTACTS_EVENT_TYPE_ANNIVERSARY, 615, nullptr }, { CONTACTS_EVENT_TYPE_OTHER, 20200101, nullptr },
+		{ CONTACTS_EVENT_TYPE_CUSTOM, 20120630, "Graduation" } };
+	for (const auto& e : events) {
+		contacts_record_h r = t.add(_contacts_contact.event, _contacts_my_profile.event, _contacts_event._uri,
+			_contacts_event.type, e.type);
+		contacts_record_set_int(r, _contacts_event.date, e.date);
+		if (e.label) { // a lunar date in a leap month
+			setStr(r, _contacts_event.label, e.label);
+			contacts_record_set_int(r, _contacts_event.calendar_type, CONTACTS_EVENT_CALENDAR_TYPE_LUNAR);
+			contacts_record_set_bool(r, _contacts_event.is_leap_month, true);
+		}
+	}
+	for (const char* text : { "Line one; with, specials \\ and\nanother line", "Second note: ünïcödé 한국어" })
+		setStr(t.add(_contacts_contact.note, _contacts_my_profile.note, _contacts_note._uri), _contacts_note.note, text);
+	for (const char* text : { "Annie", "A, the great" })
+		setStr(t.add(_contacts_contact.nickname, _contacts_my_profile.nickname, _contacts_nickname._uri),
+			_contacts_nickname.name, text);
+}
+
+inline void fillCompaniesAndPictures(const RichTarget& t, const RichContact& rich)
+{
+	setAll(t.add(_contacts_contact.company, _contacts_my_profile.company, _contacts_company._uri),
+		{ { _contacts_company.name, "ACME; Inc." }, { _contacts_company.department, "R&D" },
+			{ _contacts_company.job_title, "Chief, Rockets" }, { _contacts_company.role, "Engineer" },
+			{ _contacts_company.assistant_name, "Bob" }, { _contacts_company.phonetic_name, "Akmee" },
+			{ _contacts_company.location, "Building 3" }, { _contacts_company.description, "Makes everything" },
+			{ _contacts_company.logo, rich.logo.c_str() } });
+	setAll(t.add(_contacts_contact.company, _contacts_my_profile.company, _contacts_company._uri),
+		{ { _contacts_company.name, "Other Co" }, { _contacts_company.job_title, "Advisor" } });
+	for (const std::string* picture : { &rich.picture1, &rich.picture2 })
+		setStr(t.add(_contacts_contact.image, _contacts_my_profile.image, _contacts_image._uri), _contacts_image.path,
+			picture->c_str());
+}
+
+// What only contacts keep: a uid, a social-network profile and groups.
+inline void fillContactOnly(contacts_record_h c, RichContact& rich)
+{
+	contacts_record_set_str(c, _contacts_contact.uid, "uid-123@example");
+	contacts_record_h social = addChild(c, _contacts_contact.profile, _contacts_profile._uri);
+	contacts_record_set_int(social, _contacts_profile.type, 1);
+	setAll(social, { { _contacts_profile.label, "Friendbook" }, { _contacts_profile.uid, "anna.oneil" },
+		{ _contacts_profile.text, "Anna on Friendbook" }, { _contacts_profile.app_id, "com.example.friendbook" },
+		{ _contacts_profile.service_operation, "http://example.org/appcontrol/operation/social/view" },
+		{ _contacts_profile.mime, "vnd.example/profile" }, { _contacts_profile.category, "social" },
+		{ _contacts_profile.extra_data, "aWQ=:MTIz,bmFtZQ==:QW5uYQ==" },
+		{ _contacts_profile.uri, "https://friendbook.example/anna;p=1" } });
+	for (const char* group : { "Family", "Work, Team" }) {
+		rich.groupIds.push_back(addGroup(group));
+		contacts_record_set_int(addChild(c, _contacts_contact.group_relation, _contacts_group_relation._uri),
+			_contacts_group_relation.group_id, rich.groupIds.back());
+	}
 }
 
 // Fills a contact or profile record with every field kind; a contact also
-// gets a uid and two groups of address book 0.
+// gets a uid, a social-network profile and two groups of address book 0.
 inline RichContact fillRich(contacts_record_h c, const TempDataDir& dir)
 {
 	RichContact rich;
@@ -75,138 +200,13 @@ inline RichContact fillRich(contacts_record_h c, const TempDataDir& dir)
 	rich.logo = writePicture(dir, "logo.jpg", kJpeg, 700);
 	const char* uri = nullptr;
 	contacts_record_get_uri_p(c, &uri);
-	bool isContact = strcmp(uri, _contacts_contact._uri) == 0;
-	auto prop = [&](unsigned contactProp, unsigned profileProp) { return isContact ? contactProp : profileProp; };
-	contacts_record_h name = addChild(c, prop(_contacts_contact.name, _contacts_my_profile.name), _contacts_name._uri);
-	setStr(name, _contacts_name.first, "Ánna");
-	setStr(name, _contacts_name.last, "O'Neil; Jr");
-	setStr(name, _contacts_name.addition, "Maria");
-	setStr(name, _contacts_name.prefix, "Dr.");
-	setStr(name, _contacts_name.suffix, "PhD");
-	setStr(name, _contacts_name.phonetic_first, "Ana");
-	setStr(name, _contacts_name.phonetic_middle, "Mari");
-	setStr(name, _contacts_name.phonetic_last, "Oneel");
-
-	unsigned numbers = prop(_contacts_contact.number, _contacts_my_profile.number);
-	struct { int type; const char* label; const char* number; bool pref; } nums[] = {
-		{ CONTACTS_NUMBER_TYPE_CELL, nullptr, "+1 555 0100", true },
-		{ CONTACTS_NUMBER_TYPE_HOME | CONTACTS_NUMBER_TYPE_VOICE, nullptr, "+1 555 0101", false },
-		{ CONTACTS_NUMBER_TYPE_WORK | CONTACTS_NUMBER_TYPE_FAX, nullptr, "+1 555 0102", false },
-		{ CONTACTS_NUMBER_TYPE_CUSTOM, "Boat; deck", "+1 555 0103", false },
-		{ CONTACTS_NUMBER_TYPE_ASSISTANT, nullptr, "+1 555 0104", false },
-		{ CONTACTS_NUMBER_TYPE_COMPANY_MAIN, nullptr, "+1 555 0105", false },
-		{ CONTACTS_NUMBER_TYPE_OTHER, nullptr, "*31#", false } };
-	for (const auto& n : nums) {
-		contacts_record_h r = typed(c, numbers, _contacts_number._uri, _contacts_number.type, n.type);
-		setStr(r, _contacts_number.number, n.number);
-		if (n.label)
-			setStr(r, _contacts_number.label, n.label);
-		contacts_record_set_bool(r, _contacts_number.is_default, n.pref);
-	}
-	unsigned emails = prop(_contacts_contact.email, _contacts_my_profile.email);
-	struct { int type; const char* label; const char* email; } mails[] = {
-		{ CONTACTS_EMAIL_TYPE_HOME, nullptr, "anna@home.example" }, { CONTACTS_EMAIL_TYPE_CUSTOM, "Club", "anna@club.example" },
-		{ CONTACTS_EMAIL_TYPE_MOBILE, nullptr, "anna@mobile.example" }, { CONTACTS_EMAIL_TYPE_WORK, nullptr, "anna@work.example" } };
-	for (const auto& m : mails) {
-		contacts_record_h r = typed(c, emails, _contacts_email._uri, _contacts_email.type, m.type);
-		setStr(r, _contacts_email.email, m.email);
-		if (m.label)
-			setStr(r, _contacts_email.label, m.label);
-		contacts_record_set_bool(r, _contacts_email.is_default, m.type == CONTACTS_EMAIL_TYPE_HOME);
-	}
-	unsigned addresses = prop(_contacts_contact.address, _contacts_my_profile.address);
-	contacts_record_h home = typed(c, addresses, _contacts_address._uri, _contacts_address.type, CONTACTS_ADDRESS_TYPE_HOME);
-	setStr(home, _contacts_address.postbox, "PO 7");
-	setStr(home, _contacts_address.extended, "Flat 2");
-	setStr(home, _contacts_address.street, "1 Main St, Rear\nBuilding B");
-	setStr(home, _contacts_address.locality, "Springfield");
-	setStr(home, _contacts_address.region, "IL");
-	setStr(home, _contacts_address.postal_code, "62701");
-	setStr(home, _contacts_address.country, "USA");
-	contacts_record_set_bool(home, _contacts_address.is_default, true);
-	contacts_record_h cabin = typed(c, addresses, _contacts_address._uri, _contacts_address.type, CONTACTS_ADDRESS_TYPE_CUSTOM);
-	setStr(cabin, _contacts_address.label, "Cabin");
-	setStr(cabin, _contacts_address.locality, "Lakeside");
-
-	unsigned messengers = prop(_contacts_contact.messenger, _contacts_my_profile.messenger);
-	for (int type = CONTACTS_MESSENGER_TYPE_OTHER; type <= CONTACTS_MESSENGER_TYPE_IRC; ++type) {
-		contacts_record_h r = typed(c, messengers, _contacts_messenger._uri, _contacts_messenger.type, type);
-		setStr(r, _contacts_messenger.im_id, ("anna" + std::to_string(type) + "@im.example").c_str());
-		if (type == CONTACTS_MESSENGER_TYPE_CUSTOM)
-			setStr(r, _contacts_messenger.label, "Signal");
-	}
-	unsigned urls = prop(_contacts_contact.url, _contacts_my_profile.url);
-	for (int type = CONTACTS_URL_TYPE_OTHER; type <= CONTACTS_URL_TYPE_WORK; ++type) {
-		contacts_record_h r = typed(c, urls, _contacts_url._uri, _contacts_url.type, type);
-		setStr(r, _contacts_url.url, ("https://example.org/" + std::to_string(type) + "?a=1,b=2").c_str());
-		if (type == CONTACTS_URL_TYPE_CUSTOM)
-			setStr(r, _contacts_url.label, "Blog");
-	}
-	unsigned relations = prop(_contacts_contact.relationship, _contacts_my_profile.relationship);
-	for (int type = CONTACTS_RELATIONSHIP_TYPE_OTHER; type <= CONTACTS_RELATIONSHIP_TYPE_CUSTOM; ++type) {
-		contacts_record_h r = typed(c, relations, _contacts_relationship._uri, _contacts_relationship.type, type);
-		setStr(r, _contacts_relationship.name, ("Person " + std::to_string(type)).c_str());
-		if (type == CONTACTS_RELATIONSHIP_TYPE_CUSTOM)
-			setStr(r, _contacts_relationship.label, "Godmother");
-	}
-	unsigned events = prop(_contacts_contact.event, _contacts_my_profile.event);
-	struct { int type; int date; const char* label; bool lunar; } evs[] = {
-		{ CONTACTS_EVENT_TYPE_BIRTH, 19900102, nullptr, false },
-		{ CONTACTS_EVENT_TYPE_ANNIVERSARY, 615, nullptr, false },
-		{ CONTACTS_EVENT_TYPE_OTHER, 20200101, nullptr, false },
-		{ CONTACTS_EVENT_TYPE_CUSTOM, 20120630, "Graduation", true } };
-	for (const auto& e : evs) {
-		contacts_record_h r = typed(c, events, _contacts_event._uri, _contacts_event.type, e.type);
-		contacts_record_set_int(r, _contacts_event.date, e.date);
-		if (e.label)
-			setStr(r, _contacts_event.label, e.label);
-		if (e.lunar) {
-			contacts_record_set_int(r, _contacts_event.calendar_type, CONTACTS_EVENT_CALENDAR_TYPE_LUNAR);
-			contacts_record_set_bool(r, _contacts_event.is_leap_month, true);
-		}
-	}
-	unsigned notes = prop(_contacts_contact.note, _contacts_my_profile.note);
-	for (const char* text : { "Line one; with, specials \\ and\nanother line", "Second note: ünïcödé 한국어" })
-		setStr(addChild(c, notes, _contacts_note._uri), _contacts_note.note, text);
-	unsigned nicknames = prop(_contacts_contact.nickname, _contacts_my_profile.nickname);
-	for (const char* text : { "Annie", "A, the great" })
-		setStr(addChild(c, nicknames, _contacts_nickname._uri), _contacts_nickname.name, text);
-	unsigned companies = prop(_contacts_contact.company, _contacts_my_profile.company);
-	contacts_record_h acme = typed(c, companies, _contacts_company._uri, _contacts_company.type, CONTACTS_COMPANY_TYPE_OTHER);
-	setStr(acme, _contacts_company.name, "ACME; Inc.");
-	setStr(acme, _contacts_company.department, "R&D");
-	setStr(acme, _contacts_company.job_title, "Chief, Rockets");
-	setStr(acme, _contacts_company.role, "Engineer");
-	setStr(acme, _contacts_company.assistant_name, "Bob");
-	setStr(acme, _contacts_company.phonetic_name, "Akmee");
-	setStr(acme, _contacts_company.location, "Building 3");
-	setStr(acme, _contacts_company.description, "Makes everything");
-	setStr(acme, _contacts_company.logo, rich.logo.c_str());
-	contacts_record_h other = typed(c, companies, _contacts_company._uri, _contacts_company.type, CONTACTS_COMPANY_TYPE_OTHER);
-	setStr(other, _contacts_company.name, "Other Co");
-	setStr(other, _contacts_company.job_title, "Advisor");
-	unsigned images = prop(_contacts_contact.image, _contacts_my_profile.image);
-	setStr(addChild(c, images, _contacts_image._uri), _contacts_image.path, rich.picture1.c_str());
-	setStr(addChild(c, images, _contacts_image._uri), _contacts_image.path, rich.picture2.c_str());
-	if (isContact) {
-		contacts_record_set_str(c, _contacts_contact.uid, "uid-123@example");
-		contacts_record_h social = addChild(c, _contacts_contact.profile, _contacts_profile._uri);
-		contacts_record_set_int(social, _contacts_profile.type, 1);
-		setStr(social, _contacts_profile.label, "Friendbook");
-		setStr(social, _contacts_profile.uid, "anna.oneil");
-		setStr(social, _contacts_profile.text, "Anna on Friendbook");
-		setStr(social, _contacts_profile.app_id, "com.example.friendbook");
-		setStr(social, _contacts_profile.service_operation, "http://example.org/appcontrol/operation/social/view");
-		setStr(social, _contacts_profile.mime, "vnd.example/profile");
-		setStr(social, _contacts_profile.category, "social");
-		setStr(social, _contacts_profile.extra_data, "aWQ=:MTIz,bmFtZQ==:QW5uYQ==");
-		setStr(social, _contacts_profile.uri, "https://friendbook.example/anna;p=1");
-		for (const char* group : { "Family", "Work, Team" }) {
-			rich.groupIds.push_back(addGroup(group));
-			contacts_record_set_int(addChild(c, _contacts_contact.group_relation, _contacts_group_relation._uri),
-				_contacts_group_relation.group_id, rich.groupIds.back());
-		}
-	}
+	RichTarget target{ c, strcmp(uri, _contacts_contact._uri) == 0 };
+	fillNameNumbersAndEmails(target);
+	fillAddressesAndOnlineIds(target);
+	fillEventsAndTexts(target);
+	fillCompaniesAndPictures(target, rich);
+	if (target.isContact)
+		fillContactOnly(c, rich);
 	return rich;
 }
 

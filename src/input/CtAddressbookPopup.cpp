@@ -54,11 +54,11 @@ std::string readText(const char* key)
 
 Storage storageOf(int addressbookId, const char* providerName)
 {
-	if (!strcmp(providerName, CONTACTS_SIM1_ADDRESS_BOOK_NAME))
+	if (!strcmp(providerName, CONTACTS_SIM1_PROVIDER_NAME))
 		return Storage::Sim1;
-	if (!strcmp(providerName, CONTACTS_SIM2_ADDRESS_BOOK_NAME))
+	if (!strcmp(providerName, CONTACTS_SIM2_PROVIDER_NAME))
 		return Storage::Sim2;
-	if (!strcmp(providerName, SIM_ADDRESSBOOK_NAME))
+	if (!strcmp(providerName, CONTACTS_SIM_PROVIDER_NAME))
 		return Storage::Sim;
 	// The phone's own book is book 0 whatever its provider is called.
 	if (addressbookId == 0 || !strcmp(providerName, ContactsCommon::translate("IDS_PB_OPT_DEVICE")))

@@ -36,7 +36,7 @@ TEST_F(CtPredictionListModelTest, TwentyFiveMatchesGiveTen)
 
 TEST_F(CtPredictionListModelTest, SimPersonsAreLeftOut)
 {
-	int sim = addAddressbook("SIM2", 0, 0, "SIM2");
+	int sim = addAddressbook(CONTACTS_SIM2_ADDRESS_BOOK_NAME, 0, 0, CONTACTS_SIM2_PROVIDER_NAME);
 	for (int i = 0; i < 12; ++i)
 		addPerson(("Sim Anna " + std::to_string(i)).c_str(), nullptr, sim);
 	addPerson("Phone Anna");

@@ -39,10 +39,10 @@ protected:
 		setVconf(0, 0, 0);
 		vconf_set_str(VCONFKEY_SETAPPL_SIM1_NAME, "");
 		vconf_set_str(VCONFKEY_SETAPPL_SIM2_NAME, "");
-		m_sim1 = bookId("SIM1");
+		m_sim1 = bookId(CONTACTS_SIM1_ADDRESS_BOOK_NAME);
 		if (m_sim1 < 0)
-			m_sim1 = addAddressbook("SIM1", 0, 0, "SIM1");
-		m_sim2 = addAddressbook("SIM2", 0, 0, "SIM2");
+			m_sim1 = addAddressbook(CONTACTS_SIM1_ADDRESS_BOOK_NAME, 0, 0, CONTACTS_SIM1_PROVIDER_NAME);
+		m_sim2 = addAddressbook(CONTACTS_SIM2_ADDRESS_BOOK_NAME, 0, 0, CONTACTS_SIM2_PROVIDER_NAME);
 		m_account = addAddressbook("mail", 0, 7, "Mail");
 		m_readOnly = addAddressbook("news", 1, 8, "News");
 	}
@@ -165,7 +165,7 @@ TEST_F(CtAddressbookPopupTest, OnlySecondSimWhenFirstIsOffWithItsName)
 TEST_F(CtAddressbookPopupTest, FirstSimComesFirstWhateverTheBookOrder)
 {
 	ASSERT_EQ(CONTACTS_ERROR_NONE, contacts_db_delete_record(_contacts_address_book._uri, m_sim1));
-	m_sim1 = addAddressbook("SIM1", 0, 0, "SIM1");
+	m_sim1 = addAddressbook(CONTACTS_SIM1_ADDRESS_BOOK_NAME, 0, 0, CONTACTS_SIM1_PROVIDER_NAME);
 	ASSERT_GT(m_sim1, m_sim2);
 	setVconf(1, 1, 0);
 	vconf_set_str(VCONFKEY_SETAPPL_SIM1_NAME, "First");

@@ -23,6 +23,9 @@
 #include <vconf.h>
 
 #include <cstdio>
+#include <filesystem>
+#include <fstream>
+#include <iterator>
 
 using namespace ct::test;
 
@@ -444,6 +447,41 @@ TEST_F(CtDetailViewTest, AnAllocationFailureWhileLoadingThePersonLeavesNoSetting
 	CtDetailView* view = show(personId);
 	EXPECT_EQ("Spare", ScreenHarness::naviText(view));
 	EXPECT_EQ(listeners + 1, CtRegistryMgr::getInstance()->getVconfListenerCount(VCONFKEY_SETAPPL_PSMODE));
+}
+
+// The PNG of the screen of a person with just a name, saved for review.
+std::string shotOfPersonNamed(ScreenHarness& screen, CtDetailView* view, const std::string& file)
+{
+	const char* bin = getenv("CONTACTS_TEST_BIN_DIR");
+	std::string dir = std::string(bin ? bin : "/tmp") + "/test-output/detail";
+	std::filesystem::create_directories(dir);
+	std::string path = dir + "/" + file;
+	EXPECT_TRUE(screen.savePng(path));
+	view->popOut();
+	screen.pumpUntil([&screen] { return screen.viewCount() == 0; });
+	std::ifstream in(path, std::ios::binary);
+	return std::string((std::istreambuf_iterator<char>(in)), std::istreambuf_iterator<char>());
+}
+
+TEST_F(CtDetailViewTest, ChineseAndKoreanNamesAreDrawnInTheirOwnLetters)
+{
+	// The title in the host's dark text colour (the toolkit's own is white).
+	edje_color_class_set("/fg/normal/naviframe/text/title", 31, 35, 40, 255, 0, 0, 0, 0, 0, 0, 0, 0);
+	// Names of as many letters: drawn as boxes (no font has the letters),
+	// two names give the same picture.
+	const std::pair<const char*, const char*> pairs[] = {{"王芳", "李娜"}, {"김민준", "이서연"}};
+	int shot = 0;
+	for (const auto& [first, second] : pairs) {
+		SCOPED_TRACE(first);
+		CtDetailView* view = show(addSimplePerson(first));
+		ASSERT_EQ(first, ScreenHarness::naviText(view));
+		std::string firstShot = shotOfPersonNamed(*m_screen, view, "script-name-" + std::to_string(++shot) + ".png");
+		view = show(addSimplePerson(second));
+		std::string secondShot = shotOfPersonNamed(*m_screen, view, "script-name-" + std::to_string(++shot) + ".png");
+		ASSERT_FALSE(firstShot.empty());
+		EXPECT_TRUE(firstShot != secondShot) << "the same picture for " << first << " and " << second;
+	}
+	edje_color_class_del("/fg/normal/naviframe/text/title");
 }
 
 TEST_F(CtDetailViewTest, PowerSavingDisablesVideoCallEmailAndAddressRowsWhileOn)

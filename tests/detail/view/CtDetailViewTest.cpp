@@ -31,6 +31,15 @@ using namespace ct::test;
 
 namespace {
 
+// Where the screen tests leave pictures for review.
+std::string shotPath(const std::string& file)
+{
+	const char* bin = getenv("CONTACTS_TEST_BIN_DIR");
+	std::string dir = std::string(bin ? bin : "/tmp") + "/test-output/detail";
+	std::filesystem::create_directories(dir);
+	return dir + "/" + file;
+}
+
 // A screen pushed above the detail screen.
 class CoverView : public app_assist::WView {
 public:
@@ -127,6 +136,11 @@ protected:
 		std::string path = m_dir.file(name);
 		Evas_Object* image = evas_object_image_filled_add(evas_object_evas_get(m_screen->win()));
 		evas_object_image_size_set(image, 320, 320);
+		// Two colour bands, so a picture shown can be told from none.
+		auto* pixels = static_cast<uint32_t*>(evas_object_image_data_get(image, EINA_TRUE));
+		for (int i = 0; pixels && i < 320 * 320; ++i)
+			pixels[i] = i < 320 * 160 ? 0xFF3C78B4 : 0xFFE8A33C;
+		evas_object_image_data_set(image, pixels);
 		evas_object_image_save(image, path.c_str(), nullptr, nullptr);
 		evas_object_del(image);
 		return path;
@@ -395,9 +409,18 @@ std::string shownPicture(CtDetailViewGenlistItem* row)
 TEST_F(CtDetailViewTest, ADirectoryEntryShowsItsPictureAndNoStar)
 {
 	std::string picture = writePicture("gal.png");
-	CtGalSearchData gal = {nullptr, picture.c_str(), "Gal Person", "0201234567", nullptr, nullptr, nullptr, "Corp"};
+	CtGalSearchData gal = {nullptr, picture.c_str(), "Gal Person", "0201234567", nullptr, "02 555 0188",
+		"gal@example.com", "Corp"};
 	auto* view = static_cast<CtDetailView*>(createCtDetailViewForGalSearch(&gal));
+	// At the phone's size, in English and with the host's title colour, saved for review.
+	m_screen = std::make_unique<ScreenHarness>(360, 640);
+	CtView::changeLanguage("en_US.UTF-8");
+	for (const char* text : {"/fg/normal/naviframe/text/title", "/fg/normal/naviframe/text/subtitle"})
+		edje_color_class_set(text, 31, 35, 40, 255, 0, 0, 0, 0, 0, 0, 0, 0);
 	ASSERT_TRUE(m_screen->push(view));
+	EXPECT_TRUE(m_screen->savePng(shotPath("directory-entry.png")));
+	for (const char* text : {"/fg/normal/naviframe/text/title", "/fg/normal/naviframe/text/subtitle"})
+		edje_color_class_del(text);
 	auto pictures = rowsOfKind(view, DETAIL_ITEM_MULTI_IMAGE);
 	ASSERT_EQ(1u, pictures.size());
 	EXPECT_EQ(picture, shownPicture(pictures[0]));
@@ -452,10 +475,7 @@ TEST_F(CtDetailViewTest, AnAllocationFailureWhileLoadingThePersonLeavesNoSetting
 // The PNG of the screen of a person with just a name, saved for review.
 std::string shotOfPersonNamed(ScreenHarness& screen, CtDetailView* view, const std::string& file)
 {
-	const char* bin = getenv("CONTACTS_TEST_BIN_DIR");
-	std::string dir = std::string(bin ? bin : "/tmp") + "/test-output/detail";
-	std::filesystem::create_directories(dir);
-	std::string path = dir + "/" + file;
+	std::string path = shotPath(file);
 	EXPECT_TRUE(screen.savePng(path));
 	view->popOut();
 	screen.pumpUntil([&screen] { return screen.viewCount() == 0; });

@@ -606,7 +606,8 @@ void CtDetailView::__updateFavoriteBtn()
 {
 	Elm_Object_Item* naviItem = getNaviItem();
 	WPRET_M(!naviItem, "naviItem is nullptr");
-	WPRET_M(m_isSimContact, "__isSimContact == true");
+	if (m_isSimContact)
+		return;   // SIM cards keep no favourites
 	if (m_galData)
 		return;
 	if (Evas_Object* shown = elm_object_item_part_content_get(naviItem, "title_right_btn")) {

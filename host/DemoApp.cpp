@@ -226,9 +226,17 @@ bool DemoApp::__pushScreen(const DemoScreen& screen, int personId)
 	// A screen pushed over another one slides in; pictures wait for the end.
 	m_pushing = m_naviframe->getViewCount() > 0;
 	bool pushed = m_naviframe->push(view);
-	if (!pushed)
+	if (!pushed) {
 		m_pushing = false;
-	return pushed;
+		return false;
+	}
+	if (screen.reach) {
+		__settle();
+		int below = m_naviframe->getViewCount();
+		screen.reach(m_window->getEvasObj());
+		m_pushing = m_naviframe->getViewCount() > below;
+	}
+	return true;
 }
 
 void DemoApp::__hold(double seconds)

@@ -3,6 +3,7 @@
 #include "ContactsDebug.h"
 #include "ShareFieldsRequest.h"
 
+#include <Ecore.h>
 #include <contacts.h>
 
 namespace ct::demo {
@@ -31,6 +32,24 @@ contacts_record_h firstContactOf(int personId, std::vector<std::shared_ptr<void>
 	if (contact)
 		keepAlive.emplace_back(contact, [](void* record) { contacts_record_destroy(static_cast<contacts_record_h>(record), true); });
 	return contact;
+}
+
+// A finger tap at (x, y) of the window, as the device would feed it.
+void tapAt(Evas_Object* win, int x, int y)
+{
+	Evas* canvas = evas_object_evas_get(win);
+	unsigned int stamp = static_cast<unsigned int>(ecore_time_get() * 1000);
+	evas_event_feed_mouse_move(canvas, x, y, stamp, nullptr);
+	evas_event_feed_mouse_down(canvas, 1, EVAS_BUTTON_NONE, stamp + 1, nullptr);
+	evas_event_feed_mouse_up(canvas, 1, EVAS_BUTTON_NONE, stamp + 2, nullptr);
+}
+
+void pressKey(Evas_Object* win, const char* key)
+{
+	Evas* canvas = evas_object_evas_get(win);
+	unsigned int stamp = static_cast<unsigned int>(ecore_time_get() * 1000);
+	evas_event_feed_key_down(canvas, key, key, nullptr, nullptr, stamp, nullptr);
+	evas_event_feed_key_up(canvas, key, key, nullptr, nullptr, stamp + 1, nullptr);
 }
 
 template <typename Fn, typename... Args>
@@ -62,6 +81,16 @@ const std::vector<DemoScreen>& demoScreens()
 			[](DemoScreenContext& c) {
 				return make<CreateMyProfileInputViewFn>(c.library, "createCtMyProfileInputView", contacts_record_h(nullptr), nullptr);
 			}},
+		{"pictures", true, "a person's pictures full screen (the detail screen's picture tapped)",
+			[](DemoScreenContext& c) { return make<CreateDetailViewFn>(c.library, "createCtDetailView", c.personId, nullptr); },
+			[](Evas_Object* win) {
+				Evas_Coord w = 0;
+				evas_object_geometry_get(win, nullptr, nullptr, &w, nullptr);
+				tapAt(win, w / 2, 160);
+			}},
+		{"mark-as-default", true, "the choice of a linked person's name and picture (the detail screen's more key)",
+			[](DemoScreenContext& c) { return make<CreateDetailViewFn>(c.library, "createCtDetailView", c.personId, nullptr); },
+			[](Evas_Object* win) { pressKey(win, "Menu"); }},
 		{"wizard", false, "the profile set-up wizard",
 			[](DemoScreenContext& c) { return make<CreateProfileWizardViewFn>(c.library, "createCtProfileWizardView"); }},
 		{"share-fields", true, "chosen fields of a person, returned as text the host prints",

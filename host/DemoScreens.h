@@ -4,6 +4,8 @@
 
 #include "DetailsLibrary.h"
 
+#include <Evas.h>
+
 #include <functional>
 #include <memory>
 #include <string>
@@ -28,6 +30,9 @@ struct DemoScreen {
 	const char* description;
 	// The new view, or null when this build's library lacks its export.
 	std::function<app_assist::WView*(DemoScreenContext&)> make;
+	// Screens reached from another one: what a person does on the pushed
+	// screen (a tap, a key) on the window `win` to get there; may be empty.
+	std::function<void(Evas_Object* win)> reach = nullptr;
 };
 
 // Every screen, in the order the usage text lists them.

@@ -98,6 +98,21 @@ TEST(DemoCommandLineTest, ScreensByNameOpenThroughTheLibraryOrSayTheyAreMissing)
 	EXPECT_NE(std::string::npos, run.output.find("the wizard screen is not part of this build")) << run.output;
 }
 
+TEST(DemoCommandLineTest, PictureAndMarkAsDefaultScreensAreReachedFromTheDetailScreen)
+{
+	TempDataDir data;
+	// Person 1 has a picture; person 15 is made of three linked contacts.
+	const std::pair<const char*, const char*> cases[] = {
+		{"--screen pictures --person 1", "after holding: CtDetailImageView"},
+		{"--screen mark-as-default --person 15", "after holding: CtDetailMarkAsDefaultView"},
+	};
+	for (const auto& [args, expected] : cases) {
+		DemoRun run = runDemo(data.path(), std::string(args) + " --hold 0.2");
+		EXPECT_EQ(0, run.exitCode) << run.output;
+		EXPECT_NE(std::string::npos, run.output.find(expected)) << run.output;
+	}
+}
+
 TEST(DemoCommandLineTest, BadArgumentsGiveAClearMessageAndExitCodeTwo)
 {
 	TempDataDir data;

@@ -1,15 +1,19 @@
 // Tells a store, on the EFL main loop, that its database may have changed:
 // after its own commits (notifyLocalChange) and when another connection or
-// process committed. Other commits are noticed through file events on the
-// database's folder (inotify under Ecore_File), confirmed by PRAGMA
+// process committed. Other commits are noticed through inotify events on the
+// database's folder, read by a main-loop fd handler and confirmed by PRAGMA
 // data_version; nothing wakes the loop while no file changes. Only when the
-// folder cannot be watched does a slow poll take over.
+// folder cannot be watched (or goes away) does a slow poll take over.
+//
+// Why not Ecore_File's or Eio's monitor: the first frees its monitor by
+// itself when the folder is deleted (our handle then dangles), the second
+// starts watching only after an asynchronous stat, missing the commits made
+// right after a callback was registered.
 #pragma once
 
 #include "SqliteDatabase.h"
 
 #include <Ecore.h>
-#include <Ecore_File.h>
 
 #include <functional>
 #include <string>
@@ -33,17 +37,19 @@ public:
 	// Call after this connection committed.
 	void notifyLocalChange();
 	// Whether other commits are noticed through file events (else by polling).
-	bool watchesFiles() const { return m_monitor != nullptr; }
+	bool watchesFiles() const { return m_fdHandler != nullptr; }
 
 private:
-	static void __fileEventCb(void* data, Ecore_File_Monitor* monitor, Ecore_File_Event event, const char* path);
+	static Eina_Bool __fileEventsCb(void* data, Ecore_Fd_Handler* handler);
 	static Eina_Bool __pollCb(void* data);
 	static Eina_Bool __recheckCb(void* data);
 	static void __jobCb(void* data);
 	bool __watchFolder();
 	void __startPolling();
 	void __stopWatching();
-	bool __isDatabaseFile(const char* path) const;
+	// Reads the pending events; false when the folder is no longer watched.
+	bool __readEvents(bool* touched);
+	bool __isDatabaseFile(const char* name) const;
 	// Queues a delivery when another connection committed since the last check.
 	bool __checkVersion();
 	void __scheduleRecheck();
@@ -53,7 +59,8 @@ private:
 	std::function<void()> m_onChange;
 	int64_t m_lastVersion;
 	std::string m_path;
-	Ecore_File_Monitor* m_monitor = nullptr;
+	int m_inotify = -1;
+	Ecore_Fd_Handler* m_fdHandler = nullptr;
 	Ecore_Timer* m_pollTimer = nullptr;
 	Ecore_Timer* m_recheckTimer = nullptr;
 	int m_rechecksLeft = 0;

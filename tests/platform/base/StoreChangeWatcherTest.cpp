@@ -115,3 +115,19 @@ TEST(StoreChangeWatcher, AnotherProcessCommitArrivesThroughFileEventsOrThroughTh
 		EXPECT_EQ(0, calls) << static_cast<int>(detection);
 	}
 }
+
+TEST(StoreChangeWatcher, AFolderThatGoesAwayLeavesTheWatcherPollingAndSafeToDelete)
+{
+	EcoreScope ecore;
+	auto dir = std::make_unique<TempDataDir>();
+	Database mine;
+	ASSERT_EQ(SQLITE_OK, mine.open(dir->file("w.db")));
+	ASSERT_EQ(SQLITE_OK, mine.exec("CREATE TABLE t(v INTEGER)"));
+	auto watcher = std::make_unique<StoreChangeWatcher>(mine, [] {});
+	ASSERT_TRUE(watcher->watchesFiles());
+	mine.close();
+	dir.reset();
+	EXPECT_TRUE(pumpUntil([&] { return !watcher->watchesFiles(); }, 3.0));
+	watcher.reset();
+	pumpFor(0.1);
+}

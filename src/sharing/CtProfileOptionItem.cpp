@@ -70,7 +70,7 @@ void CtProfileOptionItem::__toggle()
 	} else if (CtContactsAgentMgr::getInstance()->setProfileProperty(m_property, !m_shared)) {
 		m_shared = !m_shared;
 	} else {
-		WERROR("* Critical * setProfileProperty() failed");
+		WERROR("setProfileProperty() failed");
 	}
 	if (Evas_Object* check = getCheck())
 		ctCommonChecktStateSet(check, m_shared, 1);
@@ -83,6 +83,6 @@ void CtProfileOptionItem::__checkButtonChangedCb(void* data, Evas_Object*, void*
 {
 	WHIT();
 	auto* row = static_cast<CtProfileOptionItem*>(data);
-	WPRET_M(!row, "* Critical * data is NULL");
+	WPRET_M(!row, "data is NULL");
 	row->__toggle();
 }

@@ -6,7 +6,7 @@
 int CtProfileOptionSelectControl::append(Evas_Object* genlist)
 {
 	WENTER();
-	WPRET_VM(!genlist, 0, "* Critical * Invalid param : genlist");
+	WPRET_VM(!genlist, 0, "Invalid param : genlist");
 	int count = 0;
 	auto* group = new CtProfileSharingRow("group_index");
 	group->setTextId("elm.text", "IDS_PB_HEADER_ADDITIONAL_INFO_TO_SHARE_ABB");

@@ -53,16 +53,16 @@ void CtProfileSharingRow::setSelectHandler(SelectHandler handler)
 
 CtProfileSharingRow* CtProfileSharingRow::append(Evas_Object* genlist, CtProfileSharingRow* row)
 {
-	WPRET_VM(!row, nullptr, "* Critical * Invalid param : row");
+	WPRET_VM(!row, nullptr, "Invalid param : row");
 	if (!genlist) {
-		WERROR("* Critical * Invalid param : genlist");
+		WERROR("Invalid param : genlist");
 		delete row;
 		return nullptr;
 	}
 	Elm_Object_Item* item = elm_genlist_item_append(genlist, row->getItemClass(), row, nullptr,
 		ELM_GENLIST_ITEM_NONE, row->getSelectCb(), nullptr);
 	if (!item) {
-		WERROR("* Critical * elm_genlist_item_append() failed");
+		WERROR("elm_genlist_item_append() failed");
 		delete row;
 		return nullptr;
 	}
@@ -75,7 +75,7 @@ CtProfileSharingRow* CtProfileSharingRow::append(Evas_Object* genlist, CtProfile
 Evas_Object* CtProfileSharingRow::createSwitch(Evas_Object* parent, bool on, Evas_Smart_Cb changedCb, void* data)
 {
 	Evas_Object* layout = ctCommonCreateLayout(parent, kListEdj, "list/C/type.3");
-	WPRET_VM(!layout, nullptr, "* Critical * ctCommonCreateLayout() is fail");
+	WPRET_VM(!layout, nullptr, "ctCommonCreateLayout() is fail");
 	Evas_Object* check = elm_check_add(layout);
 	elm_object_style_set(check, "on&off");
 	elm_check_state_set(check, on ? EINA_TRUE : EINA_FALSE);
@@ -90,7 +90,7 @@ Evas_Object* CtProfileSharingRow::createSwitch(Evas_Object* parent, bool on, Eva
 Evas_Object* CtProfileSharingRow::createRadio(Evas_Object* parent, Evas_Object* group, int state)
 {
 	Evas_Object* layout = ctCommonCreateLayout(parent, kListEdj, "list/B/type.4");
-	WPRET_VM(!layout, nullptr, "* Critical * ctCommonCreateLayout() is fail");
+	WPRET_VM(!layout, nullptr, "ctCommonCreateLayout() is fail");
 	Evas_Object* radio = elm_radio_add(layout);
 	elm_object_style_set(radio, "default");
 	elm_radio_state_value_set(radio, state);

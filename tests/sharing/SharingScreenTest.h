@@ -14,6 +14,7 @@
 #include "CtThemeMgr.h"
 #include "CtView.h"
 #include "ScreenHarness.h"
+#include "TempDataDir.h"
 #include "UsageLog.h"
 #include "WView.h"
 
@@ -59,6 +60,7 @@ protected:
 		CtView::changeLanguage("en_US.UTF-8");
 		CtLightTheme::apply();
 		preference_remove_all();
+		removeProfiles();
 		setNetwork(true);
 		setSimInserted(true);
 		ScreenHarness::clearNotices();
@@ -72,6 +74,41 @@ protected:
 		m_screen.reset();
 		CtLightTheme::remove();
 		contacts_disconnect();
+	}
+
+	static void removeProfiles()
+	{
+		contacts_list_h list = nullptr;
+		if (contacts_db_get_all_records(_contacts_my_profile._uri, 0, 0, &list) != CONTACTS_ERROR_NONE)
+			return;
+		std::vector<int> ids;
+		contacts_record_h record = nullptr;
+		while (contacts_list_get_current_record_p(list, &record) == CONTACTS_ERROR_NONE && record) {
+			int id = 0;
+			contacts_record_get_int(record, _contacts_my_profile.id, &id);
+			ids.push_back(id);
+			if (contacts_list_next(list) != CONTACTS_ERROR_NONE)
+				break;
+		}
+		contacts_list_destroy(list, true);
+		for (int id : ids)
+			contacts_db_delete_record(_contacts_my_profile._uri, id);
+	}
+
+	// A PNG of one colour, `size` pixels square.
+	std::string writePicture(const char* name, int r, int g, int b, int size = 200)
+	{
+		std::string path = m_dir.file(name);
+		Evas_Object* image = evas_object_image_filled_add(evas_object_evas_get(m_screen->win()));
+		evas_object_image_size_set(image, size, size);
+		evas_object_image_alpha_set(image, EINA_FALSE);
+		auto* pixels = static_cast<uint32_t*>(evas_object_image_data_get(image, EINA_TRUE));
+		for (int i = 0; i < size * size; ++i)
+			pixels[i] = 0xff000000u | (r << 16) | (g << 8) | b;
+		evas_object_image_data_set(image, pixels);
+		evas_object_image_save(image, path.c_str(), nullptr, nullptr);
+		evas_object_del(image);
+		return path;
 	}
 
 	static void setNetwork(bool up) { vconf_set_int(CT_NETWORK_STATUS_KEY, up ? 1 : 0); }
@@ -127,6 +164,7 @@ protected:
 		EXPECT_TRUE(m_screen->savePng(folder + "/" + name + ".png"));
 	}
 
+	TempDataDir m_dir;
 	std::unique_ptr<ScreenHarness> m_screen;
 	appcontrol::Registration m_registration;
 };

@@ -56,9 +56,20 @@ CtProfileSharingPreviewItem::CtProfileSharingPreviewItem()
 		return text;
 	});
 	setContent("elm.icon", [this](Evas_Object* parent) { return __createPicture(parent); });
+	m_data->attachListener(this);
 }
 
-CtProfileSharingPreviewItem::~CtProfileSharingPreviewItem() = default;
+CtProfileSharingPreviewItem::~CtProfileSharingPreviewItem()
+{
+	m_data->detachListener();
+}
+
+void CtProfileSharingPreviewItem::onDbChanged(const char*)
+{
+	WHIT();
+	if (Elm_Object_Item* item = getElmObjectItem())
+		elm_genlist_item_update(item);
+}
 
 std::string CtProfileSharingPreviewItem::getName() const
 {

@@ -2,6 +2,7 @@
 #define _CT_PROFILE_SHARING_PREVIEW_ITEM_H_
 
 #include "CtProfileSharingRow.h"
+#include "ICtChangeListener.h"
 
 #include <memory>
 #include <string>
@@ -11,8 +12,9 @@ class CtMyProfileDetailData;
 
 // "What others will see": the profile card as a contact receives it, the
 // name, status and picture, and only the fields chosen for sharing. It reads
-// the stored profile when made and the choices whenever it is drawn.
-class CtProfileSharingPreviewItem : public CtProfileSharingRow {
+// the stored profile (again when it changes) and the choices whenever it is
+// drawn.
+class CtProfileSharingPreviewItem : public CtProfileSharingRow, public ICtChangeListener {
 public:
 	CtProfileSharingPreviewItem();
 	~CtProfileSharingPreviewItem() override;
@@ -20,6 +22,11 @@ public:
 	std::string getName() const;
 	// The status, then one line per shared field that has a value.
 	std::vector<std::string> getLines() const;
+
+public: // ICtChangeListener
+	void onDbChanged(const char* viewUri) override;
+	void onCompleteGetContacts() override {}
+	void onConditionChagned() override {}
 
 private:
 	std::string __fieldText(int property) const;

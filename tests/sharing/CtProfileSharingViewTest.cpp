@@ -303,3 +303,19 @@ TEST_F(CtProfileSharingViewTest, PreviewShowsOnlyTheFieldsChosenAndFollowsTheSwi
 	elm_genlist_item_bring_in(preview->getElmObjectItem(), ELM_GENLIST_ITEM_SCROLLTO_TOP);
 	shot("sharing-preview");
 }
+
+TEST_F(CtProfileSharingViewTest, PreviewFollowsAProfileEditedElsewhere)
+{
+	int id = storeProfile(newProfile("Robin"));
+	storeSharing(true);
+	CtProfileSharingView* view = show();
+	CtProfileSharingPreviewItem* preview = view->getPreviewRow();
+	EXPECT_TRUE(preview->getLines().empty());
+	contacts_record_h profile = nullptr;
+	ASSERT_EQ(CONTACTS_ERROR_NONE, contacts_db_get_record(_contacts_my_profile._uri, id, &profile));
+	contacts_record_set_str(profile, _contacts_my_profile_ex.status, "Back soon");
+	ASSERT_EQ(CONTACTS_ERROR_NONE, contacts_db_update_record(profile));
+	contacts_record_destroy(profile, true);
+	EXPECT_TRUE(m_screen->pumpUntil([preview] { return !preview->getLines().empty(); }));
+	EXPECT_EQ((std::vector<std::string>{"Back soon"}), preview->getLines());
+}

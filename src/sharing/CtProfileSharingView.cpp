@@ -58,10 +58,19 @@ CtProfileSharingView::CtProfileSharingView()
 CtProfileSharingView::~CtProfileSharingView()
 {
 	WENTER();
+	__stopListening();
+}
+
+// Signals may come while the widgets are already gone: both listeners end
+// with the widgets, and again (harmlessly) with the object.
+void CtProfileSharingView::__stopListening()
+{
 	if (m_registryListenerId)
 		CtRegistryMgr::getInstance()->removeChangeListener(m_registryListenerId);
+	m_registryListenerId = 0;
 	if (m_networkListening)
 		CtRegistryMgr::getInstance()->unRegisterVconfChangedCb(CT_NETWORK_STATUS_KEY, __networkChangedCb, this);
+	m_networkListening = false;
 }
 
 Evas_Object* CtProfileSharingView::onCreate(Evas_Object* parent, void*)
@@ -118,6 +127,10 @@ void CtProfileSharingView::onPushed(Elm_Object_Item* naviItem)
 void CtProfileSharingView::onDestroy()
 {
 	WENTER();
+	__stopListening();
+	m_genlist = nullptr;
+	m_modeRow = m_myProfileRow = m_bizProfileRow = nullptr;
+	m_previewRow = nullptr;
 }
 
 void CtProfileSharingView::onLanguageChanged()

@@ -55,6 +55,7 @@ private:
 	void __refreshPreview();
 	void __onRegistryChanged(int key, int value);
 	void __pushShareWith();
+	void __stopListening();
 	static void __checkButtonChangedCb(void* data, Evas_Object* obj, void* eventInfo);
 	static void __profileShareWithButtonClickedCb(void* data, Evas_Object* obj, void* eventInfo);
 	static void __networkChangedCb(keynode_t* node, void* data);

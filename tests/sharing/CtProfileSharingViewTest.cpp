@@ -319,3 +319,16 @@ TEST_F(CtProfileSharingViewTest, PreviewFollowsAProfileEditedElsewhere)
 	EXPECT_TRUE(m_screen->pumpUntil([preview] { return !preview->getLines().empty(); }));
 	EXPECT_EQ((std::vector<std::string>{"Back soon"}), preview->getLines());
 }
+
+TEST_F(CtProfileSharingViewTest, ConfirmationAfterTheScreenClosedIsIgnored)
+{
+	CtProfileSharingView* view = show();
+	touchSwitch(view);
+	view->popOut();
+	m_screen->pumpUntilIdle();
+	EXPECT_EQ(0, m_screen->viewCount());
+	CtRegistryMgr::getInstance()->raiseChangeSignal(CT_REGISTRY_KEY_PROFILE_SHARING_STATE, 0);
+	setNetwork(false);
+	m_screen->pumpUntilIdle();
+	EXPECT_TRUE(CtEsuAgentMgr::getInstance()->getProfileSharingStatus());
+}

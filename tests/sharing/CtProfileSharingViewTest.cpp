@@ -259,7 +259,8 @@ TEST_F(CtProfileSharingViewTest, ShareWithButtonSwitchesBusinessToPersonalBefore
 	EXPECT_NE(nullptr, dynamic_cast<CtProfileShareWithView*>(m_screen->topView()));
 	EXPECT_EQ(2, m_screen->viewCount());
 	m_screen->topView()->popOut();
-	m_screen->pumpUntilIdle();
+	// The rows are drawn again once the screen is back on top.
+	EXPECT_TRUE(m_screen->pumpUntil([view] { return checkedProfileType(view) != -1; }));
 	EXPECT_EQ(0, checkedProfileType(view));
 }
 

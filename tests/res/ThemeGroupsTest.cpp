@@ -59,6 +59,7 @@ void collect(const std::string& text, const char* pattern, std::set<std::string>
 AskedNames scanSources()
 {
 	const char* style = R"(getItemStyle\(\) override \{ return ([^;]+);)";
+	const char* styleDefinition = R"(::getItemStyle\(\)(?: const)?\s*\{([^}]*)\})";
 	const char* layout = R"((?:createIconLayout|ctCommonCreateLayout)\([^;{\n]*?("[^"]+")\))";
 	const char* image = R"(("[A-Za-z0-9_]+\.png"))";
 	const char* part = R"(("(?:elm|touch|copy|main|sub|image|favor)\.[a-z0-9._]+"))";
@@ -71,6 +72,7 @@ AskedNames scanSources()
 			read << std::ifstream(entry.path()).rdbuf();
 			const std::string text = read.str();
 			collect(text, style, names.styles);
+			collect(text, styleDefinition, names.styles);
 			collect(text, layout, names.layouts);
 			collect(text, image, names.images);
 			for (const std::string& file : captures(text, R"re("contacts/([a-z_]+\.edj)")re"))
@@ -153,11 +155,14 @@ TEST(ThemeGroups, EveryStyleGroupImageAndPartTheCodeNamesExists)
 		if (layout)
 			loaded.push_back(layout);
 	}
-	// Title-bar parts belong to the naviframe item of the light theme.
-	Evas_Object* titleBar = canvas.load("light.edj", "elm/naviframe/item/basic/default");
-	EXPECT_NE(titleBar, nullptr);
-	if (titleBar)
-		loaded.push_back(titleBar);
+	// Title-bar parts belong to the naviframe item of the light theme, the
+	// indicator area to the window's base layout.
+	for (const char* group : {"elm/naviframe/item/basic/default", "elm/layout/application/default"}) {
+		Evas_Object* obj = canvas.load("light.edj", group);
+		EXPECT_NE(obj, nullptr) << group;
+		if (obj)
+			loaded.push_back(obj);
+	}
 	for (const std::string& part : asked.parts) {
 		bool found = false;
 		for (Evas_Object* obj : loaded) // "sub.name" names the numbered parts sub.name1...
@@ -241,7 +246,8 @@ TEST(ThemeGroups, EveryWidgetStyleTheCodeNamesExists)
 		{"tabbar", {"elm/naviframe/item/tabbar/default"}}, {"basic", {"elm/naviframe/item/basic/default"}},
 		{"datetime", {"elm/uiclock/base/default"}},
 		// The indicator looks the picture viewer switches between.
-		{"indicator", {"elm/layout/indicator/headerbg", "elm/layout/indicator/image/viewer"}}};
+		{"indicator", {"elm/layout/indicator/headerbg", "elm/layout/indicator/image/viewer"}},
+		{"default", {"elm/radio/base/default", "elm/check/base/default", "elm/button/base/default"}}};
 	const std::set<std::string> asked = scanWidgetStyles();
 	ASSERT_GE(asked.size(), 5u) << "the scan no longer finds the widget styles";
 	for (const std::string& style : asked)

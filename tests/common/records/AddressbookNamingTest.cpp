@@ -80,7 +80,7 @@ TEST_F(AddressbookNamingTest, StoresOfTheOldNamingAreRenamedWhenOpened)
 		"UPDATE address_books SET name = 'Phone' WHERE id = 0;"
 		"UPDATE address_books SET name = provider_name WHERE provider_name IN ('SIM1', 'SIM2');"
 		"INSERT INTO address_books(account_id, name, provider_name) VALUES (4, 'Phone', 'Other');"
-		"UPDATE meta SET value = 'contacts-service/2' WHERE key = 'schema';",
+		"UPDATE meta SET value = 'contacts-service/3' WHERE key = 'schema';",
 		nullptr, nullptr, nullptr), SQLITE_OK);
 	sqlite3_close(db);
 	ASSERT_EQ(contacts_connect(), CONTACTS_ERROR_NONE);

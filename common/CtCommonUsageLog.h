@@ -5,5 +5,8 @@
 // and, when not null, "extra". The result is ignored, as nothing a screen
 // does depends on it.
 void ctCommonInsertUsageLog(const char* feature, const char* extra);
+// The same with a "value" instead of an "extra" (state records such as a
+// switch turned on or off).
+void ctCommonInsertUsageLogValue(const char* feature, const char* value);
 
 #endif

@@ -104,3 +104,22 @@ TEST_F(ContactsCtl, ListsUsageRecordsAndFeatures)
 	EXPECT_TRUE(contains(out, "88=false\t(hide address row)"));
 	EXPECT_TRUE(contains(out, "13=true\t(easy sign-up)"));
 }
+
+TEST_F(ContactsCtl, SharingSetsNetworkAndSimsFromOutsideAndShowsTheSettings)
+{
+	preference_set_boolean("profile_sharing_status", true);
+	preference_set_boolean("profile_sharing_property_1", true);
+	preference_close_store();
+	run("sharing network down");
+	run("sharing sim 1 out");
+	run("sharing sim 2 in");
+	EXPECT_EQ("sharing=on network=down sim1=out sim2=in type=personal privacy=1 fields=organisation\n", run("sharing"));
+	vconf_close_store();
+	int value = -1;
+	vconf_get_int("memory/network/status", &value);
+	EXPECT_EQ(0, value);
+	run("sharing network up");
+	EXPECT_TRUE(contains(run("sharing show"), "network=up"));
+	for (const char* args : {"sharing network sideways", "sharing sim 3 in", "sharing sim 1", "sharing show more"})
+		run(args, 2);
+}

@@ -1,5 +1,7 @@
 #include "InputRowTestSupport.h"
 
+#include "CtCommonTextUtil.h"
+
 #include <ui_extension.h>
 
 namespace ct::test {
@@ -98,14 +100,14 @@ Evas_Object* InputRowTest::entryOf(Elm_Object_Item* item, const char* part)
 
 void InputRowTest::type(Evas_Object* entry, const char* text)
 {
-	elm_entry_entry_insert(entry, text);
+	elm_entry_entry_insert(entry, ctCommonUtf8ToMarkup(text).c_str());
 	m_screen->pumpUntilIdle();
 }
 
 void InputRowTest::replaceText(Evas_Object* entry, const char* text)
 {
 	elm_entry_select_all(entry);
-	elm_entry_entry_insert(entry, text);
+	elm_entry_entry_insert(entry, ctCommonUtf8ToMarkup(text).c_str());
 	m_screen->pumpUntilIdle();
 }
 

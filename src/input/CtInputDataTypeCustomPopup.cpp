@@ -59,8 +59,7 @@ Evas_Object* CtInputDataTypeCustomPopup::__createContent(Evas_Object* parent)
 	m_entry = uxt_edit_field_layout_get_entry(field);
 	elm_object_domain_translatable_part_text_set(m_entry, "elm.guide", "contacts", "IDS_PB_NPBODY_CUSTOM_TYPE_ABB");
 	elm_entry_input_panel_imdata_set(m_entry, "action=disable_emoticons", strlen("action=disable_emoticons"));
-	static Elm_Entry_Filter_Limit_Size limit = {kMaxChars, 0};
-	elm_entry_markup_filter_append(m_entry, elm_entry_filter_limit_size, &limit);
+	CtInputViewGenlistItem::addLengthLimit(m_entry, kMaxChars);
 	elm_entry_cnp_mode_set(m_entry, ELM_CNP_MODE_PLAINTEXT);
 	elm_entry_autocapital_type_set(m_entry, ELM_AUTOCAPITAL_TYPE_WORD);
 	elm_entry_input_panel_return_key_type_set(m_entry, ELM_INPUT_PANEL_RETURN_KEY_TYPE_DONE);

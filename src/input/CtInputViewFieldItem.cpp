@@ -8,6 +8,13 @@
 
 #include <cstring>
 
+namespace {
+
+// The list settles its own focus when it realizes a row; the entry takes it after that.
+const double kFocusDelay = 0.1;
+
+} // namespace
+
 CtInputViewFieldItem::CtInputViewFieldItem(std::shared_ptr<CtData> data, contacts_record_h record, int addKind,
 		CtInputViewItemCallbacks callbacks, const char* initialText)
 	: CtInputViewGenlistItem(initialText), m_data(std::move(data)), m_record(record), m_addKind(addKind),
@@ -82,8 +89,13 @@ Evas_Object* CtInputViewFieldItem::__createEntry(Evas_Object* genlist)
 	if (spec.passesReturnKey)
 		evas_object_smart_callback_add(entry, "activated", __entryActivatedCb, this);
 	evas_object_smart_callback_add(entry, "focused", __entryFocusedCb, this);
-	if (spec.focusAddKind && m_addKind == spec.focusAddKind && !m_focusedOnShow)
-		evas_object_event_callback_add(entry, EVAS_CALLBACK_SHOW, __entryShowCb, this);
+	if (spec.focusAddKind && m_addKind == spec.focusAddKind && !m_focusedOnShow) {
+		// The field is shown as soon as it is made: focus it once the row is on screen.
+		app_assist::WUiTimer::addTimer(kFocusDelay, [this, entry](void*) {
+			__focusOnFirstShow(entry);
+			return false;
+		}, nullptr, entry);
+	}
 	if (m_entry)
 		evas_object_event_callback_del_full(m_entry, EVAS_CALLBACK_DEL, __entryDelCb, this);
 	m_entry = entry;
@@ -197,14 +209,14 @@ void CtInputViewFieldItem::__entryFocusedCb(void* data, Evas_Object* obj, void*)
 		self->m_callbacks.focus(true);
 }
 
-void CtInputViewFieldItem::__entryShowCb(void* data, Evas*, Evas_Object* obj, void*)
+void CtInputViewFieldItem::__focusOnFirstShow(Evas_Object* entry)
 {
-	auto* self = static_cast<CtInputViewFieldItem*>(data);
-	evas_object_event_callback_del_full(obj, EVAS_CALLBACK_SHOW, __entryShowCb, data);
-	self->m_focusedOnShow = true;
-	if (self->m_callbacks.focus)
-		self->m_callbacks.focus(false);
-	elm_object_focus_set(obj, EINA_TRUE);
+	if (m_focusedOnShow)
+		return;
+	m_focusedOnShow = true;
+	if (m_callbacks.focus)
+		m_callbacks.focus(false);
+	elm_object_focus_set(entry, EINA_TRUE);
 }
 
 void CtInputViewFieldItem::__entryDelCb(void* data, Evas*, Evas_Object* obj, void*)

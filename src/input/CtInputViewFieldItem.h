@@ -93,7 +93,7 @@ private:
 	static void __entryChangedCb(void* data, Evas_Object* obj, void* eventInfo);
 	static void __entryActivatedCb(void* data, Evas_Object* obj, void* eventInfo);
 	static void __entryFocusedCb(void* data, Evas_Object* obj, void* eventInfo);
-	static void __entryShowCb(void* data, Evas* e, Evas_Object* obj, void* eventInfo);
+	void __focusOnFirstShow(Evas_Object* entry);
 	static void __entryDelCb(void* data, Evas* e, Evas_Object* obj, void* eventInfo);
 	static void __hoverselDelCb(void* data, Evas* e, Evas_Object* obj, void* eventInfo);
 	static void __deleteClickedCb(void* data, Evas_Object* obj, void* eventInfo);

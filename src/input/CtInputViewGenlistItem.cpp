@@ -27,6 +27,30 @@ Elm_Entry_Filter_Limit_Size* limitOf(Evas_Object* entry)
 	return static_cast<Elm_Entry_Filter_Limit_Size*>(evas_object_data_get(entry, kLimitKey));
 }
 
+// The toolkit's size filter trims an over-long insert one character at a
+// time (seconds for a pasted 100 KB); cut it to the limit first, on a whole
+// character, so that filter only fine-tunes.
+void capInsertCb(void* data, Evas_Object* entry, char** text)
+{
+	auto* limit = static_cast<Elm_Entry_Filter_Limit_Size*>(data);
+	if (!text || !*text || limit->max_char_count <= 0 || strlen(*text) <= static_cast<size_t>(limit->max_char_count))
+		return;
+	char* plain = elm_entry_markup_to_utf8(*text);
+	if (!plain)
+		return;
+	size_t pos = 0;
+	for (int chars = 0; plain[pos] && chars < limit->max_char_count; ++chars)
+		pos += ctCommonCheckUtf8(plain[pos]);
+	if (plain[pos]) {
+		plain[pos] = '\0';
+		char* markup = elm_entry_utf8_to_markup(plain);
+		free(*text);
+		*text = markup;
+		evas_object_smart_callback_call(entry, "maxlength,reached", nullptr);
+	}
+	free(plain);
+}
+
 } // namespace
 
 CtInputViewGenlistItem::CtInputViewGenlistItem(const char* initialText)
@@ -77,16 +101,23 @@ Evas_Object* CtInputViewGenlistItem::createEditField(Evas_Object* parent, const 
 	else
 		elm_entry_input_panel_return_key_type_set(entry, ELM_INPUT_PANEL_RETURN_KEY_TYPE_NEXT);
 
-	auto* limit = new Elm_Entry_Filter_Limit_Size{maxChars, 0};
-	evas_object_data_set(entry, kLimitKey, limit);
-	evas_object_event_callback_add(entry, EVAS_CALLBACK_DEL, freeLimitCb, limit);
-	elm_entry_markup_filter_append(entry, elm_entry_filter_limit_size, limit);
+	addLengthLimit(entry, maxChars);
 
 	elm_entry_cnp_mode_set(entry, ELM_CNP_MODE_PLAINTEXT);
 	elm_entry_input_panel_layout_set(entry, ELM_INPUT_PANEL_LAYOUT_NORMAL);
 	evas_object_smart_callback_add(entry, "maxlength,reached", __editfieldTextMaxReachedCb, this);
 	elm_entry_autocapital_type_set(entry, ELM_AUTOCAPITAL_TYPE_WORD);
 	return layout;
+}
+
+void CtInputViewGenlistItem::addLengthLimit(Evas_Object* entry, int maxChars)
+{
+	WPRET_M(!entry || limitOf(entry), "entry is NULL or limited already");
+	auto* limit = new Elm_Entry_Filter_Limit_Size{maxChars, 0};
+	evas_object_data_set(entry, kLimitKey, limit);
+	evas_object_event_callback_add(entry, EVAS_CALLBACK_DEL, freeLimitCb, limit);
+	elm_entry_markup_filter_append(entry, capInsertCb, limit);
+	elm_entry_markup_filter_append(entry, elm_entry_filter_limit_size, limit);
 }
 
 void CtInputViewGenlistItem::setEntryText(Evas_Object* entry, const char* text)
@@ -96,12 +127,16 @@ void CtInputViewGenlistItem::setEntryText(Evas_Object* entry, const char* text)
 	std::string markup = ctCommonUtf8ToMarkup(text);
 	// The limit is for typing: a stored text must not be cut (and then saved cut).
 	Elm_Entry_Filter_Limit_Size* limit = limitOf(entry);
-	if (limit)
+	if (limit) {
+		elm_entry_markup_filter_remove(entry, capInsertCb, limit);
 		elm_entry_markup_filter_remove(entry, elm_entry_filter_limit_size, limit);
+	}
 	elm_entry_entry_set(entry, "");
 	elm_entry_entry_insert(entry, markup.c_str());
-	if (limit)
+	if (limit) {
+		elm_entry_markup_filter_append(entry, capInsertCb, limit);
 		elm_entry_markup_filter_append(entry, elm_entry_filter_limit_size, limit);
+	}
 }
 
 void CtInputViewGenlistItem::updateChangedState(const char* text)

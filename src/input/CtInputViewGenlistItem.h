@@ -28,6 +28,9 @@ public:
 	// `maxChars` characters and posts the character-limit notice (at most
 	// once per 3.5 s). `guideTextId` may be null.
 	Evas_Object* createEditField(Evas_Object* parent, const char* guideTextId, bool multiline, int maxChars);
+	// Makes `entry` refuse more than `maxChars` characters (a longer insert
+	// is cut on a whole character and "maxlength,reached" is raised).
+	static void addLengthLimit(Evas_Object* entry, int maxChars);
 	// Shows the UTF-8 `text` in `entry` with the cursor after it. A stored
 	// text longer than the entry's limit is shown whole (the limit only
 	// stops further typing).

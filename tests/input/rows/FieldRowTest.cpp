@@ -168,3 +168,103 @@ TEST_F(FieldRowTest, FocusingAnEntryRaisesTheKeypadAndTheHarnessCanLowerAndRaise
 	EXPECT_FALSE(m_screen->isKeypadShown());
 	EXPECT_EQ(2, m_view->keypadOff);
 }
+
+TEST_F(FieldRowTest, EntriesStopAtTheirLimitWithOneNoticeAndAPasteOf100KbIsCutOnACharacter)
+{
+	auto data = editNew();
+	auto* note = new CtInputViewNoteItem(data, data->addNote(""), 0, m_calls.callbacks(), nullptr);
+	auto* website = new CtInputViewWebsiteItem(data, data->addWebsite(""), 0, m_calls.callbacks(), nullptr);
+	Evas_Object* noteEntry = entryOf(show(note));
+	Evas_Object* websiteEntry = entryOf(show(website));
+	ASSERT_TRUE(noteEntry && websiteEntry);
+	ScreenHarness::clearNotices();
+
+	type(noteEntry, std::string(999, 'n').c_str());
+	type(noteEntry, "\xe2\x82\xac"); // the 1000th character, three bytes
+	type(noteEntry, "x");
+	type(noteEntry, "y");
+	type(websiteEntry, std::string(1001, 'w').c_str());
+	EXPECT_EQ(std::string(999, 'n') + "\xe2\x82\xac", std::string(data->getNote(note->getRecord())));
+	EXPECT_EQ(std::string(1000, 'w'), std::string(data->getWebsiteWebsite(website->getRecord())));
+	// Each row tells once within 3.5 s.
+	EXPECT_EQ(2u, ScreenHarness::notices().size());
+
+	// 100 KB of two-byte characters pasted over the text: 1000 whole characters stay.
+	std::string paste;
+	while (paste.size() < 100 * 1024)
+		paste += "\xc3\xa9";
+	replaceText(websiteEntry, paste.c_str());
+	std::string stored = data->getWebsiteWebsite(website->getRecord());
+	EXPECT_EQ(2000u, stored.size());
+	EXPECT_EQ(paste.substr(0, 2000), stored);
+}
+
+TEST_F(FieldRowTest, StatusStopsAtSixtyCharacters)
+{
+	auto data = editNew();
+	auto* status = new CtInputViewStatusItem(data, nullptr, 0, m_calls.callbacks(), nullptr);
+	Evas_Object* entry = entryOf(show(status));
+	ASSERT_NE(nullptr, entry);
+	type(entry, std::string(70, 's').c_str());
+	EXPECT_EQ(std::string(60, 's'), CtInputViewGenlistItem::getEntryUtf8(entry));
+}
+
+TEST_F(FieldRowTest, MarkupAndOverlongStoredTextsAreShownAndKeptAsStored)
+{
+	contacts_record_h contact = newContact(0, "Ada");
+	addNumber(contact, "<b>0101&amp;", CONTACTS_NUMBER_TYPE_CELL);
+	std::string longNote(3000, 'L');
+	addText(contact, _contacts_contact.note, _contacts_note._uri, _contacts_note.note, longNote.c_str());
+	int contactId = store(contact);
+	auto data = edit(contactId);
+	contacts_record_h number = nth(data->getNumberList());
+	contacts_record_h note = nth(data->getNoteList());
+	auto* numberRow = new CtInputViewNumberItem(data, number, 0, m_calls.callbacks(), data->getNumberNumber(number));
+	auto* noteRow = new CtInputViewNoteItem(data, note, 0, m_calls.callbacks(), data->getNote(note));
+	Evas_Object* numberEntry = entryOf(show(numberRow));
+	Evas_Object* noteEntry = entryOf(show(noteRow));
+
+	EXPECT_EQ("<b>0101&amp;", CtInputViewGenlistItem::getEntryUtf8(numberEntry));
+	EXPECT_EQ(longNote, CtInputViewGenlistItem::getEntryUtf8(noteEntry));
+	EXPECT_EQ(0, m_calls.changed);
+	EXPECT_FALSE(numberRow->getIsChanged() || noteRow->getIsChanged());
+
+	// A letter typed at the end of the markup-like number keeps it as typed.
+	elm_entry_cursor_end_set(numberEntry);
+	type(numberEntry, "<");
+	ASSERT_EQ(CONTACTS_ERROR_NONE, data->updateContact());
+	reopenStore();
+	contacts_record_h saved = readContact(contactId);
+	EXPECT_EQ("<b>0101&amp;<", textOf(childAt(saved, _contacts_contact.number, 0), _contacts_number.number));
+	EXPECT_EQ(longNote, textOf(childAt(saved, _contacts_contact.note, 0), _contacts_note.note));
+	contacts_record_destroy(saved, true);
+}
+
+TEST_F(FieldRowTest, ProfileSharingStorageShowsTheNumberDisabledWithoutDeleteButton)
+{
+	int book = addAddressbook("sharing", 0, 1, ContactsCommon::translate("IDS_PB_MBODY_PROFILE_SHARING"));
+	contacts_record_h contact = newContact(book, "Ada");
+	addNumber(contact, "0101", CONTACTS_NUMBER_TYPE_CELL);
+	auto data = edit(store(contact));
+	contacts_record_h number = nth(data->getNumberList());
+	auto* row = new CtInputViewNumberItem(data, number, 0, m_calls.callbacks(), "0101");
+	Elm_Object_Item* item = show(row);
+	ASSERT_TRUE(row->isProfileSharingStorage());
+	EXPECT_TRUE(ScreenHarness::isDisabled(entryOf(item)));
+	EXPECT_TRUE(ScreenHarness::isDisabled(row->getHoverselObj()));
+	EXPECT_EQ(nullptr, content(item, "elm.icon.2"));
+}
+
+TEST_F(FieldRowTest, AddedRowTakesTheFocusWhenFirstShownAndReturnKeyGoesToTheOwner)
+{
+	auto data = editNew();
+	auto* row = new CtInputViewEmailItem(data, data->addEmail(""), CtInputViewEmailItem::kAddKind, m_calls.callbacks(),
+			nullptr);
+	Evas_Object* entry = entryOf(show(row));
+	ASSERT_NE(nullptr, entry);
+	EXPECT_TRUE(m_screen->pumpUntil([this] { return m_screen->isKeypadShown(); }, 1.0));
+	EXPECT_EQ(entry, app_assist::WVirtualKeypad::findInputPanelEntry(evas_focus_get(evas_object_evas_get(entry))));
+	EXPECT_EQ((std::vector<bool>{false, true}), m_calls.focus);
+	evas_object_smart_callback_call(entry, "activated", nullptr);
+	EXPECT_EQ((std::vector<Evas_Object*>{entry}), m_calls.activated);
+}

@@ -3,13 +3,12 @@
 #include "ContactsDebug.h"
 #include "CtCommonUsageLog.h"
 #include "CtCommonWidgetUtil.h"
+#include "CtInputViewCallerIdPicture.h"
 #include "CtEsuAgentMgr.h"
 
 #include <app_preference.h>
 #include <ui_extension.h>
-#include <vconf.h>
 
-#include <cstdlib>
 #include <cstring>
 
 namespace {
@@ -38,8 +37,6 @@ const FieldInfo kFields[] = {
 	{"IDS_PB_BODY_JOB_TITLE_ABB", 1000, false},
 };
 
-const char* const kDefaultImageKey = "db/deco-contact-image-editor/contact_default_image_path";
-const int kPictureSize = 96;
 
 std::string text(const char* value)
 {
@@ -318,27 +315,8 @@ Evas_Object* CtInputViewBasicInfoItem::__createFieldButton(Evas_Object* parent, 
 
 Evas_Object* CtInputViewBasicInfoItem::__createPicture(Evas_Object* genlist)
 {
-	Evas_Object* layout = ctCommonCreateLayout(genlist, "contacts/contacts.edj", "layout/basicInfo/callerId");
-	WPRET_VM(!layout, nullptr, "layout is NULL");
-	const char* path = m_data->getImagePath();
-	Evas_Object* image = nullptr;
-	if (path && *path) {
-		image = ctCommonCreateMaskImageForCallerId(layout, path, kPictureSize);
-	} else {
-		char* custom = vconf_get_str(kDefaultImageKey);
-		if (custom && *custom)
-			image = ctCommonCreateImage(layout, custom, nullptr);
-		free(custom);
-		if (!image)
-			image = ctCommonCreateImage(layout, "contacts/image_layout.edj", "contacts_caller_id_default_05.png");
-	}
-	if (image)
-		elm_object_part_content_set(layout, "elm.swallow.content", image);
 	bool touchable = m_launchType != kCallerIdLaunchType && !isEasySignUpStorage();
-	elm_object_signal_emit(layout, touchable ? "enable" : "disable", "touch_area");
-	if (touchable)
-		elm_object_signal_callback_add(layout, "mouse,clicked,*", "touch_area", __defaultImageClickedCb, this);
-	return layout;
+	return CtInputViewCallerIdPicture::create(genlist, m_data->getImagePath(), touchable, __defaultImageClickedCb, this);
 }
 
 void CtInputViewBasicInfoItem::__entryTextChanged(Field field, Evas_Object* entry)

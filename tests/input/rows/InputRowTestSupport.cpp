@@ -4,6 +4,8 @@
 
 #include <ui_extension.h>
 
+#include <clocale>
+
 namespace ct::test {
 
 Elm_Object_Item* InputRowHostView::append(CtInputViewGenlistItem* row)
@@ -17,6 +19,7 @@ Elm_Object_Item* InputRowHostView::append(CtInputViewGenlistItem* row)
 
 Evas_Object* InputRowHostView::onCreate(Evas_Object* parent, void*)
 {
+	ContactsCommon::bindTextDomain();
 	for (const char* edj : {"contacts/contacts.edj", "contacts/detail_layout.edj"}) {
 		std::string path;
 		ContactsCommon::getAppEdjePath(edj, path, true);
@@ -25,7 +28,6 @@ Evas_Object* InputRowHostView::onCreate(Evas_Object* parent, void*)
 	genlist = elm_genlist_add(parent);
 	CtThemeMgr::getInstance()->setObjectTheme(genlist);
 	elm_genlist_mode_set(genlist, ELM_LIST_COMPRESS);
-	elm_genlist_select_mode_set(genlist, ELM_OBJECT_SELECT_MODE_NONE);
 	evas_object_size_hint_weight_set(genlist, EVAS_HINT_EXPAND, EVAS_HINT_EXPAND);
 	evas_object_size_hint_align_set(genlist, EVAS_HINT_FILL, EVAS_HINT_FILL);
 	return genlist;
@@ -63,6 +65,9 @@ CtInputViewItemCallbacks RowCalls::callbacks()
 void InputRowTest::SetUp()
 {
 	InputStoreTest::SetUp();
+	// Texts as a person reads them, so that a missing translation shows.
+	m_previousLocale = setlocale(LC_ALL, nullptr);
+	setlocale(LC_ALL, "en_US.UTF-8");
 	m_screen = std::make_unique<ScreenHarness>(360, 640);
 	m_view = new InputRowHostView();
 	ASSERT_TRUE(m_screen->push(m_view));
@@ -72,6 +77,7 @@ void InputRowTest::TearDown()
 {
 	m_screen.reset();
 	m_data.clear();
+	setlocale(LC_ALL, m_previousLocale.c_str());
 	InputStoreTest::TearDown();
 }
 

@@ -81,6 +81,7 @@ protected:
 	InputRowHostView* m_view = nullptr;
 	RowCalls m_calls;
 	std::vector<std::shared_ptr<CtInputData>> m_data;
+	std::string m_previousLocale;
 };
 
 } // namespace ct::test

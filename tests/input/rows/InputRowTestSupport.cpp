@@ -1,6 +1,7 @@
 #include "InputRowTestSupport.h"
 
 #include "CtCommonTextUtil.h"
+#include "CtInputViewTypeSelector.h"
 
 #include <ui_extension.h>
 
@@ -94,6 +95,12 @@ std::shared_ptr<CtInputData> InputRowTest::editNew()
 Elm_Object_Item* InputRowTest::show(CtInputViewGenlistItem* row)
 {
 	Elm_Object_Item* item = m_view->append(row);
+	m_screen->pumpUntil([this, item] {
+		Eina_List* realized = elm_genlist_realized_items_get(m_view->genlist);
+		bool found = eina_list_data_find(realized, item) != nullptr;
+		eina_list_free(realized);
+		return found;
+	});
 	m_screen->pumpUntilIdle();
 	return item;
 }
@@ -120,14 +127,13 @@ void InputRowTest::replaceText(Evas_Object* entry, const char* text)
 std::vector<std::string> InputRowTest::menuLabels(Evas_Object* hoversel)
 {
 	std::vector<std::string> labels;
+	// Filled as the first tap would, without opening the menu.
 	if (!elm_hoversel_items_get(hoversel))
-		ScreenHarness::click(hoversel);
+		CtInputViewTypeSelector::fill(hoversel);
 	const Eina_List* node;
 	void* item;
 	EINA_LIST_FOREACH(elm_hoversel_items_get(hoversel), node, item)
 		labels.push_back(elm_object_item_text_get(static_cast<Elm_Object_Item*>(item)));
-	elm_hoversel_hover_end(hoversel);
-	m_screen->pumpUntilIdle();
 	return labels;
 }
 

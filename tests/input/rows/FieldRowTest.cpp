@@ -268,3 +268,20 @@ TEST_F(FieldRowTest, AddedRowTakesTheFocusWhenFirstShownAndReturnKeyGoesToTheOwn
 	evas_object_smart_callback_call(entry, "activated", nullptr);
 	EXPECT_EQ((std::vector<Evas_Object*>{entry}), m_calls.activated);
 }
+
+TEST_F(FieldRowTest, BackKeyFirstClearsASelectionInAnEntry)
+{
+	auto data = edit(storeAda());
+	contacts_record_h email = nth(data->getEmailList());
+	Evas_Object* entry = entryOf(show(new CtInputViewEmailItem(data, email, 0, m_calls.callbacks(), "ada@example.com")));
+	ASSERT_NE(nullptr, entry);
+	elm_object_focus_set(entry, EINA_TRUE);
+	elm_entry_select_all(entry);
+	m_screen->pumpUntilIdle();
+	ASSERT_NE(nullptr, elm_entry_selection_get(entry));
+	int views = m_screen->viewCount();
+	m_screen->sendBackKey();
+	EXPECT_EQ(nullptr, elm_entry_selection_get(entry));
+	EXPECT_EQ(views, m_screen->viewCount());
+	EXPECT_EQ("ada@example.com", std::string(data->getEmailEmail(email)));
+}

@@ -12,6 +12,8 @@
 #include "CtInputViewImportantSubItem.h"
 #include "CtInputViewMessengerItem.h"
 #include "CtInputViewMsisdnItem.h"
+#include "CtInputViewMultiImageItem.h"
+#include "CtMyProfileInputData.h"
 #include "CtInputViewNoteItem.h"
 #include "CtInputViewNumberItem.h"
 #include "CtInputViewRelationItem.h"
@@ -91,7 +93,7 @@ TEST_F(FormRowsShotTest, EveryRowKindOfTheFormInOnePicture)
 {
 	vconf_set_str(VCONFKEY_REGIONFORMAT, "en_US.UTF-8");
 	// One tall window of the phone's width, so that every row is drawn.
-	m_screen = std::make_unique<ScreenHarness>(360, 1480);
+	m_screen = std::make_unique<ScreenHarness>(360, 1780);
 	m_view = new InputRowHostView();
 	ASSERT_TRUE(m_screen->push(m_view));
 	int groupId = addGroup(0, "Friends");
@@ -116,6 +118,7 @@ TEST_F(FormRowsShotTest, EveryRowKindOfTheFormInOnePicture)
 	add<CtInputViewMsisdnItem>(data, first(data->getNumberList()));
 	add<CtPrimaryInputViewNameItem>(data, CtPrimaryInputViewNameItem::Callbacks{}, 0);
 	add<CtPrimaryInputViewNumberItem>(data, data->addNumber("112"), calls, "112");
+	add<CtInputViewMultiImageItem>(std::make_shared<CtMyProfileInputData>(nullptr), nullptr, nullptr);
 	m_screen->pumpUntilIdle();
 
 	EXPECT_EQ("Over the horizon", text(ringtone, "elm.text.main.left.bottom"));

@@ -30,6 +30,14 @@ CtInputViewImportantFieldsItem::CtInputViewImportantFieldsItem(std::array<std::f
 		m_slots[i] = {this, static_cast<Button>(i)};
 }
 
+CtInputViewImportantFieldsItem::~CtInputViewImportantFieldsItem()
+{
+	// The list deletes a row before its contents.
+	for (int i = 0; i < BUTTON_COUNT; ++i)
+		if (m_buttons[i])
+			evas_object_event_callback_del_full(m_buttons[i], EVAS_CALLBACK_DEL, __buttonDelCb, &m_slots[i]);
+}
+
 Elm_Genlist_Item_Class* CtInputViewImportantFieldsItem::getItemClassStatic()
 {
 	static Elm_Genlist_Item_Class* itc = createItemClass("input.4icon");

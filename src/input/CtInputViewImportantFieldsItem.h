@@ -14,6 +14,7 @@ public:
 
 	// `pressed[i]` runs when button i is pressed.
 	explicit CtInputViewImportantFieldsItem(std::array<std::function<void()>, BUTTON_COUNT> pressed);
+	~CtInputViewImportantFieldsItem() override;
 
 	void setButtonDisabled(Button button, bool disabled);
 	bool isButtonDisabled(Button button) const { return m_disabled[button]; }

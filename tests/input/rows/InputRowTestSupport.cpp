@@ -36,9 +36,19 @@ Evas_Object* InputRowHostView::onCreate(Evas_Object* parent, void*)
 
 void InputRowHostView::onPushed(Elm_Object_Item*)
 {
-	Evas_Object* conformant = getWindow()->getConformantEvasObj();
-	evas_object_smart_callback_add(conformant, "virtualkeypad,state,on", __keypadOnCb, this);
-	evas_object_smart_callback_add(conformant, "virtualkeypad,state,off", __keypadOffCb, this);
+	m_conformant = getWindow()->getConformantEvasObj();
+	evas_object_smart_callback_add(m_conformant, "virtualkeypad,state,on", __keypadOnCb, this);
+	evas_object_smart_callback_add(m_conformant, "virtualkeypad,state,off", __keypadOffCb, this);
+}
+
+void InputRowHostView::onDestroy()
+{
+	// The window outlives the view.
+	if (m_conformant) {
+		evas_object_smart_callback_del_full(m_conformant, "virtualkeypad,state,on", __keypadOnCb, this);
+		evas_object_smart_callback_del_full(m_conformant, "virtualkeypad,state,off", __keypadOffCb, this);
+	}
+	WView::onDestroy();
 }
 
 void InputRowHostView::__keypadOnCb(void* data, Evas_Object*, void*)

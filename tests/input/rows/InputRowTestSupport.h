@@ -29,10 +29,13 @@ public:
 protected:
 	Evas_Object* onCreate(Evas_Object* parent, void* param) override;
 	void onPushed(Elm_Object_Item* naviItem) override;
+	void onDestroy() override;
 
 private:
 	static void __keypadOnCb(void* data, Evas_Object* obj, void* eventInfo);
 	static void __keypadOffCb(void* data, Evas_Object* obj, void* eventInfo);
+
+	Evas_Object* m_conformant = nullptr;
 };
 
 // What the rows told their owner.

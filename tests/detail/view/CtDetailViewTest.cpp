@@ -206,7 +206,7 @@ TEST_F(CtDetailViewTest, RowsFollowTheKindOrderSixInTheFirstFrameThenOnePerFrame
 
 TEST_F(CtDetailViewTest, SimContactAndPersonWithoutNumbersGetFewerRows)
 {
-	int sim = addAddressbook(CONTACTS_SIM1_ADDRESS_BOOK_NAME, 0, 0, CONTACTS_SIM1_ADDRESS_BOOK_NAME);
+	int sim = addAddressbook(CONTACTS_SIM1_ADDRESS_BOOK_NAME, 0, 0, CONTACTS_SIM1_PROVIDER_NAME);
 	contacts_record_h simContact = newContact(sim, "Taxi");
 	addNumber(simContact, "+44 20 7946 0000", CONTACTS_NUMBER_TYPE_CELL);
 	contacts_record_set_str(simContact, _contacts_contact.ringtone_path, "/opt/ringtones/Bell.ogg");

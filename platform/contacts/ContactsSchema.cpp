@@ -3,6 +3,7 @@
 #include "contacts_types.h"
 #include "contacts_views.h"
 
+#include <algorithm>
 #include <cstring>
 #include <map>
 #include <memory>
@@ -87,6 +88,34 @@ struct Registry {
 
 bool accessIsReadOnly(const char* access) { return strcmp(access, "RO") == 0; }
 
+std::string columnList(const ViewInfo& view, size_t width)
+{
+	std::string cols;
+	for (const PropertyInfo* p : view.columns)
+		cols += ", \"" + std::string(p->name) + "\"";
+	for (size_t i = view.columns.size(); i < width; ++i)
+		cols += ", NULL";
+	return cols;
+}
+
+// See ViewInfo::selectWithChildrenSql. The id is repeated as column 1. An
+// ORDER BY would sort every part in a temporary tree; the reader orders the
+// few rows itself.
+std::string selectWithChildren(const ViewInfo& view, const std::vector<const ViewInfo*>& children)
+{
+	size_t width = view.columns.size();
+	for (const ViewInfo* child : children)
+		width = std::max(width, child->columns.size());
+	std::string sql = "SELECT 0, id" + columnList(view, width) + " FROM " + view.readSource + " WHERE id = ?1";
+	if (view.baseWhere)
+		sql += std::string(" AND ") + view.baseWhere;
+	for (size_t i = 0; i < children.size(); ++i) {
+		sql += " UNION ALL SELECT " + std::to_string(i + 1) + ", id" + columnList(*children[i], width) + " FROM "
+			+ children[i]->readSource + " WHERE contact_id = ?1 AND owner = ?2";
+	}
+	return sql;
+}
+
 Registry::Registry()
 {
 	std::map<std::string, const char*> uriOfViewName;
@@ -115,13 +144,17 @@ Registry::Registry()
 		view->selectByIdSql = view->selectSql + " WHERE id = ?";
 		if (view->baseWhere)
 			view->selectByIdSql += std::string(" AND ") + view->baseWhere;
-		view->selectChildrenSql = view->selectSql + " WHERE contact_id = ? AND owner = ? ORDER BY id";
 		for (PropertyInfo& p : view->props) {
 			if (p.type != PropType::Record)
 				continue;
 			p.child = byUri[uriOfViewName[p.childViewName]];
 			children[view.get()].push_back(p.child);
 		}
+	}
+	for (auto& [number, view] : byNumber) {
+		auto kids = children.find(view.get());
+		if (kids != children.end())
+			view->selectWithChildrenSql = selectWithChildren(*view, kids->second);
 	}
 }
 
@@ -169,6 +202,37 @@ const std::vector<const ViewInfo*>& ContactsSchema::childViews(const ViewInfo& p
 	const auto& r = registry();
 	auto it = r.children.find(&parent);
 	return it == r.children.end() ? none : it->second;
+}
+
+namespace {
+
+const char* kContactFamilyKey = "contacts.view.contact+children";
+
+bool isContactFamily(const ViewInfo& view)
+{
+	if (view.number == kPersonView || view.number == kSimpleContactView || view.number == kContactView)
+		return true;
+	const auto& kids = ContactsSchema::childViews(*ContactsSchema::view("contacts.view.contact"));
+	return std::find(kids.begin(), kids.end(), &view) != kids.end();
+}
+
+} // namespace
+
+std::string ContactsSchema::changeKeyOf(const ViewInfo& view)
+{
+	return isContactFamily(view) ? kContactFamilyKey : view.uri;
+}
+
+std::vector<std::string> ContactsSchema::urisOfChangeKey(const std::string& key)
+{
+	if (key != kContactFamilyKey) {
+		const ViewInfo* v = view(key.c_str());
+		return v ? std::vector<std::string>{ v->uri } : std::vector<std::string>{};
+	}
+	std::vector<std::string> uris = { "contacts.view.person", "contacts.view.simple_contact", "contacts.view.contact" };
+	for (const ViewInfo* child : childViews(*view("contacts.view.contact")))
+		uris.push_back(child->uri);
+	return uris;
 }
 
 const char* ContactsSchema::schemaTag() { return "contacts-service/4"; }

@@ -23,6 +23,7 @@ WWindow::WWindow(const char* name, int width, int height)
 	evas_object_size_hint_weight_set(m_conformant, EVAS_HINT_EXPAND, EVAS_HINT_EXPAND);
 	elm_win_resize_object_add(m_win, m_conformant);
 	evas_object_show(m_conformant);
+	m_keypad = std::make_unique<WVirtualKeypad>(m_conformant);
 
 	m_baseLayout = elm_layout_add(m_conformant);
 	__setBaseTheme(m_baseLayout);
@@ -37,6 +38,7 @@ WWindow::WWindow(const char* name, int width, int height)
 
 WWindow::~WWindow()
 {
+	m_keypad.reset();
 	if (m_win) {
 		evas_object_event_callback_del_full(m_win, EVAS_CALLBACK_DEL, __winDelCb, this);
 		evas_object_del(m_win);

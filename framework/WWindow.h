@@ -3,6 +3,9 @@
 #pragma once
 
 #include "IWWindow.h"
+#include "WVirtualKeypad.h"
+
+#include <memory>
 
 namespace app_assist {
 
@@ -20,6 +23,8 @@ public:
 
 	// Puts `content` into the base layout (the previous content is deleted).
 	void setContent(Evas_Object* content);
+	// The keypad stand-in that raises the conformant's keypad signals.
+	WVirtualKeypad* getVirtualKeypad() const { return m_keypad.get(); }
 
 private:
 	static void __setBaseTheme(Evas_Object* layout);
@@ -28,6 +33,7 @@ private:
 	Evas_Object* m_win = nullptr;
 	Evas_Object* m_conformant = nullptr;
 	Evas_Object* m_baseLayout = nullptr;
+	std::unique_ptr<WVirtualKeypad> m_keypad;
 };
 
 } // namespace app_assist

@@ -27,7 +27,10 @@ void updateClearButton(Evas_Object* layout)
 	if (!entry || !clear)
 		return;
 	bool enabled = evas_object_data_get(layout, kClearEnabledKey) != nullptr;
-	bool show = enabled && !elm_object_disabled_get(entry) && !elm_entry_is_empty(entry);
+	// Not elm_entry_is_empty(): its textblock cursor, made while the entry
+	// handles a change, leaves the entry's own cursor behind the typed text.
+	const char* text = elm_entry_entry_get(entry);
+	bool show = enabled && !elm_object_disabled_get(entry) && text && *text;
 	if (show)
 		evas_object_show(clear);
 	else

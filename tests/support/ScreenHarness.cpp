@@ -189,6 +189,23 @@ void ScreenHarness::__feedKey(const char* key)
 	pumpUntilIdle();
 }
 
+void ScreenHarness::raiseKeypad()
+{
+	m_window->getVirtualKeypad()->show();
+	pumpUntilIdle();
+}
+
+void ScreenHarness::lowerKeypad()
+{
+	m_window->getVirtualKeypad()->hide();
+	pumpUntilIdle();
+}
+
+bool ScreenHarness::isKeypadShown() const
+{
+	return m_window->getVirtualKeypad()->isShown();
+}
+
 void ScreenHarness::sendBackKey()
 {
 	__feedKey("Escape");

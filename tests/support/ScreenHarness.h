@@ -51,6 +51,12 @@ public:
 	void sendBackKey();
 	void sendMoreKey();
 
+	// The on-screen keypad stand-in: raised while an entry takes input;
+	// these raise and lower it as the person would, then pump until idle.
+	void raiseKeypad();
+	void lowerKeypad();
+	bool isKeypadShown() const;
+
 	// Widgets anywhere on the window (popups included), top-most first;
 	// `type` is the widget class name such as "Elm_Genlist".
 	std::vector<Evas_Object*> findWidgets(const char* type) const;

@@ -95,6 +95,21 @@ TEST(EditField, SingleAndMultiLineFieldsWithAClearButton)
 	evas_object_del(multi);
 }
 
+TEST(EditField, TypedCharactersFollowEachOtherWhileTheClearButtonShows)
+{
+	ScreenHarness screen;
+	Evas_Object* field = uxt_edit_field_layout_add(screen.win(), UXT_EDIT_FIELD_LAYOUT_STYLE_SINGLELINE);
+	evas_object_resize(field, 300, 50);
+	Evas_Object* entry = uxt_edit_field_layout_get_entry(field);
+	for (const char* typed : { "6", "5", "0" }) {
+		elm_entry_entry_insert(entry, typed);
+		screen.pumpUntilIdle();
+	}
+	EXPECT_STREQ(elm_entry_entry_get(entry), "650");
+	EXPECT_EQ(elm_entry_cursor_pos_get(entry), 3);
+	evas_object_del(field);
+}
+
 TEST(ButtonsScrollerAndTheme, StylesColoursAndLocaleFormatsApplyAndBadInputIsRefused)
 {
 	ScreenHarness screen;

@@ -235,7 +235,7 @@ std::vector<std::string> ContactsSchema::urisOfChangeKey(const std::string& key)
 	return uris;
 }
 
-const char* ContactsSchema::schemaTag() { return "contacts-service/3"; }
+const char* ContactsSchema::schemaTag() { return "contacts-service/4"; }
 
 namespace {
 
@@ -250,15 +250,23 @@ namespace {
 
 const char* ContactsSchema::upgradeSql(const std::string& fromTag)
 {
+	// The built-in books were named like their providers before tag 4.
+#define CT_RENAME_BUILT_IN_BOOKS \
+	"UPDATE address_books SET name = '" CONTACTS_PHONE_ADDRESS_BOOK_NAME "' WHERE id = 0 AND name = 'Phone';\n" \
+	"UPDATE address_books SET name = '" CONTACTS_SIM1_ADDRESS_BOOK_NAME "' WHERE account_id = 0 AND name = 'SIM1';\n" \
+	"UPDATE address_books SET name = '" CONTACTS_SIM2_ADDRESS_BOOK_NAME "' WHERE account_id = 0 AND name = 'SIM2';\n"
 	if (fromTag == "contacts-service/1")
 		return R"SQL(
 CREATE TABLE profiles(id INTEGER PRIMARY KEY, contact_id INTEGER, owner INTEGER DEFAULT 0, type INTEGER DEFAULT 0,
 	label TEXT, uid TEXT, text TEXT, service_operation TEXT, mime TEXT, app_id TEXT, uri TEXT, category TEXT,
 	extra_data TEXT);
 CREATE INDEX profiles_contact ON profiles(contact_id, owner);
-)SQL" CT_IMAGES_VIEW_SQL;
+)SQL" CT_IMAGES_VIEW_SQL CT_RENAME_BUILT_IN_BOOKS;
 	if (fromTag == "contacts-service/2")
-		return CT_IMAGES_VIEW_SQL;
+		return CT_IMAGES_VIEW_SQL CT_RENAME_BUILT_IN_BOOKS;
+	if (fromTag == "contacts-service/3")
+		return CT_RENAME_BUILT_IN_BOOKS;
+#undef CT_RENAME_BUILT_IN_BOOKS
 	return nullptr;
 }
 
@@ -349,9 +357,10 @@ CREATE INDEX contact_changes_version ON contact_changes(version);
 CREATE TABLE phone_logs(id INTEGER PRIMARY KEY, person_id INTEGER DEFAULT 0, address TEXT, log_time INTEGER DEFAULT 0,
 	log_type INTEGER DEFAULT 0, extra_data1 INTEGER DEFAULT 0, extra_data2 TEXT);
 CREATE TABLE emergencies(id INTEGER PRIMARY KEY, person_id INTEGER, number_id INTEGER, value INTEGER DEFAULT 0);
-INSERT INTO address_books(id, account_id, name, mode, provider_name) VALUES (0, 0, 'Phone', 0, 'Phone');
 INSERT INTO meta(key, value) VALUES ('version', 0), ('name_display_order', 0);
-)SQL";
+)SQL"
+	"INSERT INTO address_books(id, account_id, name, mode, provider_name) VALUES (0, 0, '"
+	CONTACTS_PHONE_ADDRESS_BOOK_NAME "', 0, '" CONTACTS_PHONE_PROVIDER_NAME "');\n";
 }
 
 } // namespace ct::contacts

@@ -29,8 +29,8 @@ int contacts_sim_is_ready(int sim_slot_no, bool *is_ready);
 int contacts_sim_get_field_text_max_len(int sim_slot_no, contacts_sim_field_e field, int *max_len);
 int contacts_sim_get_unused_field_count(int sim_slot_no, contacts_sim_field_e field, int *count);
 int contacts_sim_get_field_status(int sim_slot_no, contacts_sim_field_e field, bool *supported);
-/* Stores a contact record whose address_book_id is a SIM book ("SIM1",
- * "SIM2"): first name, first number, first e-mail. Texts longer than the SIM
+/* Stores a contact record whose address_book_id is a SIM slot's book: first
+ * name, first number, first e-mail. Texts longer than the SIM
  * takes: INVALID_PARAMETER; SIM full: FILE_NO_SPACE; not ready: NOT_SUPPORTED. */
 int contacts_sim_insert(contacts_record_h contact, int *contact_id);
 int contacts_sim_update(contacts_record_h contact);
@@ -49,7 +49,14 @@ int contacts_utils_strstr(const char *haystack, const char *needle, int *len);
 int contacts_setting_get_name_display_order(contacts_name_display_order_e *name_display_order);
 int contacts_setting_set_name_display_order(contacts_name_display_order_e name_display_order);
 
-/* vCard 3.0 text (UTF-8, CRLF, lines folded at 75 bytes) that the caller frees. */
+/* vCard 3.0 text (UTF-8, CRLF, lines folded at 75 bytes) that the caller
+ * frees, with every stored field: names and phonetic names, nicknames,
+ * numbers, e-mails, addresses and web sites (types, custom labels), companies,
+ * messengers, relationships, events, notes, groups, social-network profiles,
+ * the profile status and the pictures (embedded, up to 1 MB each). A
+ * person's card merges its contacts and prefers the person's default number
+ * and e-mail. Cards are read back by
+ * ContactsVcardImport (ContactsVcardImport.h, and contacts-ctl vcard import). */
 int contacts_vcard_make_from_person(contacts_record_h person, char **vcard_stream);
 int contacts_vcard_make_from_contact(contacts_record_h contact, char **vcard_stream);
 int contacts_vcard_make_from_my_profile(contacts_record_h my_profile, char **vcard_stream);

@@ -8,6 +8,8 @@
 #include <random>
 #include <string>
 #include <unistd.h>
+#include <signal.h>
+#include <cerrno>
 #include <vector>
 
 namespace ct::bench {
@@ -162,6 +164,41 @@ void generate(const std::string& dir, int persons)
 // Bumped whenever the generator changes, so that an old cache is not reused.
 const char* kGeneratorVersion = "g2";
 
+// Copies are named after the process that made them ("<prefix><pid>-XXXXXX").
+const char* kCopyPrefix = "/tmp/contacts-bench-copy-";
+
+// A zombie (killed, not yet reaped) counts as ended.
+bool isRunning(pid_t pid)
+{
+	if (kill(pid, 0) != 0 && errno == ESRCH)
+		return false;
+	FILE* f = fopen(("/proc/" + std::to_string(pid) + "/stat").c_str(), "r");
+	if (!f)
+		return true;
+	char state = '?';
+	if (fscanf(f, "%*d %*s %c", &state) != 1)
+		state = '?';
+	fclose(f);
+	return state != 'Z';
+}
+
+// A run killed before its end leaves its copy behind: the next run removes
+// the copies of processes that no longer exist.
+void removeCopiesOfEndedRuns()
+{
+	std::error_code ec;
+	fs::path prefix(kCopyPrefix);
+	for (const auto& entry : fs::directory_iterator(prefix.parent_path(), ec)) {
+		std::string name = entry.path().filename().string();
+		std::string start = prefix.filename().string();
+		if (name.compare(0, start.size(), start) != 0)
+			continue;
+		pid_t pid = static_cast<pid_t>(atol(name.c_str() + start.size()));
+		if (pid > 0 && !isRunning(pid))
+			fs::remove_all(entry.path(), ec);
+	}
+}
+
 } // namespace
 
 BenchDatabase::~BenchDatabase()
@@ -220,9 +257,10 @@ BenchDatabase ensureDatabase(int persons)
 		fs::remove_all(cache);
 		fs::rename(building, cache);
 	}
-	char pattern[] = "/tmp/contacts-bench-XXXXXX";
+	removeCopiesOfEndedRuns();
+	std::string pattern = std::string(kCopyPrefix) + std::to_string(getpid()) + "-XXXXXX";
 	BenchDatabase out;
-	out.dataDir = mkdtemp(pattern);
+	out.dataDir = mkdtemp(pattern.data());
 	out.dbPath = out.dataDir + "/contacts.db";
 	for (const auto& entry : fs::directory_iterator(cache))
 		fs::copy(entry.path(), fs::path(out.dataDir) / entry.path().filename());

@@ -29,7 +29,8 @@ struct BenchDatabase {
 // when missing (names in several scripts, 1-3 numbers, e-mails, some
 // addresses, birthdays and groups, 5% of the persons linked), then copies it
 // into a new data folder and points CONTACTS_DATA_DIR there. The copy is
-// removed when the returned object (usually a global) is destroyed.
+// removed when the returned object (usually a global) is destroyed, or by a
+// later run when this one was killed.
 BenchDatabase ensureDatabase(int persons);
 
 // The id of the first contact whose person id compares to `personId` as

@@ -6,7 +6,7 @@ ASAN_BUILD ?= build-asan
 JOBS       ?= $(shell nproc)
 CMAKE_FLAGS ?=
 
-.PHONY: all run test deps build build-asan test-normal test-asan bench clean
+.PHONY: all run test deps build build-asan test-normal test-asan test-long bench clean
 
 all: build
 
@@ -33,6 +33,10 @@ test-asan: build-asan
 	@cd $(ASAN_BUILD) && ctest --output-on-failure -j$(JOBS)
 
 test: test-normal test-asan
+
+# The long versions of the reliability tests (kills, soak, writers, factory fuzz).
+test-long: build
+	@cd $(BUILD) && CONTACTS_TEST_LONG=1 CONTACTS_FUZZ_RUNS=20000 ctest -L long --output-on-failure -j$(JOBS)
 
 run: deps build
 	@scripts/run-demo $(BUILD)

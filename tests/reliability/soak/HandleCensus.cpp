@@ -33,41 +33,43 @@ struct Handle {
 	bool deleted = false;
 };
 
+// The registries live until the process ends (never destroyed), so that
+// handles still open at exit are not taken for leaks.
 std::unordered_map<void*, Handle*>& handles()
 {
-	static std::unordered_map<void*, Handle*> live;
-	return live;
+	static auto* live = new std::unordered_map<void*, Handle*>();
+	return *live;
 }
 
 std::set<std::tuple<std::string, void*, void*>>& storeCallbacks()
 {
-	static std::set<std::tuple<std::string, void*, void*>> live;
-	return live;
+	static auto* live = new std::set<std::tuple<std::string, void*, void*>>();
+	return *live;
 }
 
 std::set<std::tuple<std::string, void*, void*>>& settingsListeners()
 {
-	static std::set<std::tuple<std::string, void*, void*>> live;
-	return live;
+	static auto* live = new std::set<std::tuple<std::string, void*, void*>>();
+	return *live;
 }
 
 std::set<std::string>& preferenceListeners()
 {
-	static std::set<std::string> live;
-	return live;
+	static auto* live = new std::set<std::string>();
+	return *live;
 }
 
 // Statements are also prepared on worker threads.
 std::mutex& statementsLock()
 {
-	static std::mutex lock;
-	return lock;
+	static auto* lock = new std::mutex();
+	return *lock;
 }
 
 std::set<sqlite3_stmt*>& statements()
 {
-	static std::set<sqlite3_stmt*> live;
-	return live;
+	static auto* live = new std::set<sqlite3_stmt*>();
+	return *live;
 }
 
 void forget(Handle* h)

@@ -15,6 +15,12 @@ set_target_properties(ct::phonenumber PROPERTIES
   INTERFACE_LINK_LIBRARIES ${PHONENUMBER_LIB}
   INTERFACE_INCLUDE_DIRECTORIES ${PHONENUMBER_INCLUDE})
 
+# Tests of the set-up make configure fail once by naming a package that
+# does not exist.
+if(DEFINED ENV{CT_TEST_MISSING_PACKAGE})
+  pkg_check_modules(CT_TEST_MISSING REQUIRED $ENV{CT_TEST_MISSING_PACKAGE})
+endif()
+
 find_package(GTest REQUIRED)
 if(CT_BUILD_BENCH)
   find_package(benchmark REQUIRED)

@@ -71,6 +71,18 @@ Eina_Bool wakeCb(void*)
 	return ECORE_CALLBACK_RENEW;
 }
 
+Eina_Bool holdEndCb(void* ended)
+{
+	*static_cast<bool*>(ended) = true;
+	ecore_main_loop_quit();
+	return ECORE_CALLBACK_CANCEL;
+}
+
+void transitionFinishedCb(void* pushing, Evas_Object*, void*)
+{
+	*static_cast<bool*>(pushing) = false;
+}
+
 void winDeleteRequestCb(void*, Evas_Object*, void*)
 {
 	elm_exit();
@@ -98,15 +110,19 @@ int DemoApp::run()
 {
 	if (!__start())
 		return 1;
-	if (!m_options.screenshotFile.empty())
-		return __saveScreenshot(m_options.screenshotFile);
 	if (!m_options.screenshotDir.empty())
 		return __saveScreenshots(m_options.screenshotDir);
-	if (m_options.personId > 0 && !__openPerson(m_options.personId))
-		fprintf(stderr, "contacts-demo: cannot open person %d\n", m_options.personId);
 	const char* engine = getenv("ELM_ENGINE");
-	if (engine && std::string(engine) == "buffer")
-		return __printPersons();
+	bool headless = engine && std::string(engine) == "buffer";
+	bool shooting = !m_options.screenshotFile.empty();
+	if (!__openRequestedScreen() && (headless || shooting))
+		return 1;
+	if (m_options.holdSeconds > 0)
+		__hold(m_options.holdSeconds);
+	if (shooting)
+		return __saveScreenshot(m_options.screenshotFile);
+	if (headless)
+		return m_options.holdSeconds > 0 ? 0 : __printPersons();
 	return __runWindow();
 }
 
@@ -137,6 +153,7 @@ bool DemoApp::__start()
 	if (!m_naviframe->create(m_window->getBaseLayoutEvasObj(), nullptr))
 		return false;
 	m_naviframeAlive = m_naviframe->getWeakPtr();
+	evas_object_smart_callback_add(m_naviframe->getEvasObj(), "transition,finished", transitionFinishedCb, &m_pushing);
 	m_window->setContent(m_naviframe->getEvasObj());
 	m_naviframe->setOnLastViewBack([](bool* popOut) {
 		*popOut = false;
@@ -170,26 +187,86 @@ int DemoApp::__printPersons()
 
 bool DemoApp::__openPerson(int personId)
 {
-	CreateDetailViewFn factory = m_library.detailViewFactory();
-	if (!factory) {
-		notification_status_message_post("The detail screen is not part of this build");
+	return __pushScreen(*findDemoScreen("detail"), personId);
+}
+
+bool DemoApp::__openRequestedScreen()
+{
+	if (m_options.screen.empty() && m_options.personId < 1)
+		return true;
+	const DemoScreen* screen = findDemoScreen(m_options.screen.empty() ? "detail" : m_options.screen);
+	if (!screen)
+		return false;
+	if (m_options.personId > 0) {
+		contacts_record_h person = nullptr;
+		if (contacts_db_get_record(_contacts_person._uri, m_options.personId, &person) != CONTACTS_ERROR_NONE) {
+			fprintf(stderr, "contacts-demo: there is no person %d\n", m_options.personId);
+			return false;
+		}
+		contacts_record_destroy(person, true);
+	}
+	if (!__pushScreen(*screen, m_options.personId)) {
+		fprintf(stderr, "contacts-demo: the %s screen is not part of this build\n", screen->name);
 		return false;
 	}
+	return true;
+}
+
+bool DemoApp::__pushScreen(const DemoScreen& screen, int personId)
+{
+	DemoScreenContext context{m_library, personId, m_keepAlive};
 	app_assist::WView* view = nullptr;
 	try {
-		view = factory(personId, nullptr);
+		view = screen.make(context);
 	} catch (const std::exception& e) {
-		WERROR("createCtDetailView(%d) threw: %s", personId, e.what());
+		WERROR("the %s screen threw: %s", screen.name, e.what());
 	}
 	if (!view || !m_naviframe || m_naviframeAlive.expired())
 		return false;
-	return m_naviframe->push(view);
+	// A screen pushed over another one slides in; pictures wait for the end.
+	m_pushing = m_naviframe->getViewCount() > 0;
+	bool pushed = m_naviframe->push(view);
+	if (!pushed) {
+		m_pushing = false;
+		return false;
+	}
+	if (screen.reach) {
+		__settle();
+		int below = m_naviframe->getViewCount();
+		screen.reach(m_window->getEvasObj());
+		m_pushing = m_naviframe->getViewCount() > below;
+	}
+	return true;
+}
+
+void DemoApp::__hold(double seconds)
+{
+	// Scripts driving the host from outside wait for the first line, printed
+	// once the screen is up and listening, and read the second to learn what
+	// the changes made of the screen.
+	__settle();
+	printf("holding %s for %g s\n", __topScreenName(), seconds);
+	fflush(stdout);
+	bool ended = false;
+	Ecore_Timer* end = ecore_timer_add(seconds, holdEndCb, &ended);
+	ecore_main_loop_begin();
+	if (!ended)
+		ecore_timer_del(end);   // the window was closed first
+	__settle();
+	printf("after holding: %s\n", __topScreenName());
+	fflush(stdout);
 }
 
 void DemoApp::__popToList()
 {
 	while (!m_naviframeAlive.expired() && m_naviframe->getViewCount() > 1 && m_naviframe->pop())
 		__settle();
+}
+
+const char* DemoApp::__topScreenName() const
+{
+	app_assist::WView* top = m_naviframeAlive.expired() ? nullptr : m_naviframe->getTopView();
+	return top ? top->getClassName() : "nothing";
 }
 
 PersonListView* DemoApp::__list() const
@@ -199,16 +276,6 @@ PersonListView* DemoApp::__list() const
 
 int DemoApp::__saveScreenshot(const std::string& path)
 {
-	if (m_options.personId > 0) {
-		contacts_record_h person = nullptr;
-		if (contacts_db_get_record(_contacts_person._uri, m_options.personId, &person) != CONTACTS_ERROR_NONE) {
-			fprintf(stderr, "contacts-demo: there is no person %d\n", m_options.personId);
-			return 1;
-		}
-		contacts_record_destroy(person, true);
-		if (!__openPerson(m_options.personId))
-			fprintf(stderr, "contacts-demo: no detail screen in this build; saving the person list\n");
-	}
 	__settle();
 	if (!__save(path))
 		return 1;
@@ -275,7 +342,7 @@ bool DemoApp::__settle(double maxSeconds)
 			seen = renders;
 			quietSince = ecore_time_get();
 		}
-		settled = ecore_time_get() - quietSince >= kQuietFramesForIdle * kFrame;
+		settled = !m_pushing && ecore_time_get() - quietSince >= kQuietFramesForIdle * kFrame;
 	}
 	ecore_timer_del(wake);
 	evas_event_callback_del_full(canvas, EVAS_CALLBACK_RENDER_POST, renderPostCb, &renders);

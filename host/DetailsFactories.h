@@ -8,7 +8,12 @@ namespace ct::demo {
 
 using CreateDetailViewFn = decltype(&createCtDetailView);
 using CreateGalDetailViewFn = decltype(&createCtDetailViewForGalSearch);
+using CreateInputViewFn = decltype(&createCtInputView);
+using CreateInputViewForEditFn = decltype(&createCtInputViewForEditAppControl);
 using CreateMyProfileDetailViewFn = decltype(&createCtMyProfileDetailView);
+using CreateMyProfileInputViewFn = decltype(&createCtMyProfileInputView);
+using CreateProfileWizardViewFn = decltype(&createCtProfileWizardView);
+using CreateShareContactViewFn = decltype(&createCtShareContactView);
 
 // Every export, in the order the host reports them.
 inline constexpr const char* kFactoryNames[] = {

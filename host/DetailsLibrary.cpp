@@ -38,7 +38,7 @@ DetailsLibrary::DetailsLibrary(const std::string& path)
 		if (symbol)
 			m_factories[name] = symbol;
 		else
-			WWARNING("%s is not exported by %s; its screens are not offered", name, path.c_str());
+			WINFO("%s is not exported by %s; its screens are not offered", name, path.c_str());
 	}
 }
 

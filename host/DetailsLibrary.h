@@ -31,6 +31,12 @@ public:
 	// Null when the library does not have them.
 	CreateDetailViewFn detailViewFactory() const;
 	CreateMyProfileDetailViewFn myProfileDetailViewFactory() const;
+	// Any export by name, as the function type of DetailsFactories.h.
+	template <typename Fn>
+	Fn factory(const char* name) const
+	{
+		return reinterpret_cast<Fn>(__symbol(name));
+	}
 
 private:
 	void* __symbol(const char* name) const;

@@ -29,6 +29,16 @@ void useEnglishTextsOnPlainLocale()
 		setlocale(LC_MESSAGES, "en_US.UTF-8");
 }
 
+// The toolkit's own diagnostics are not this program's: keep its critical
+// lines, drop its back-traces, and do not start its system modules, which
+// look for a system bus (children such as efreetd inherit this).
+void quietToolkit()
+{
+	setenv("EINA_LOG_LEVEL", "0", 0);
+	setenv("EINA_LOG_BACKTRACE", "-1", 0);
+	setenv("ECORE_NO_SYSTEM_MODULES", "1", 0);
+}
+
 } // namespace
 
 int main(int argc, char** argv)
@@ -36,11 +46,11 @@ int main(int argc, char** argv)
 	ct::demo::DemoOptions options;
 	std::string error;
 	if (!options.parse(argc, argv, error)) {
-		fprintf(stderr, "contacts-demo: %s\n%s", error.c_str(), ct::demo::DemoOptions::usage());
+		fprintf(stderr, "contacts-demo: %s\n%s", error.c_str(), ct::demo::DemoOptions::usage().c_str());
 		return 2;
 	}
 	if (options.help) {
-		printf("%s", ct::demo::DemoOptions::usage());
+		printf("%s", ct::demo::DemoOptions::usage().c_str());
 		return 0;
 	}
 	// Pictures are read back from the buffer engine's pixels.
@@ -49,6 +59,7 @@ int main(int argc, char** argv)
 		setenv("ELM_ENGINE", "buffer", 1);
 		setenv("ECORE_EVAS_ENGINE", "buffer", 1);
 	}
+	quietToolkit();
 	setlocale(LC_ALL, "");
 	useEnglishTextsOnPlainLocale();
 	elm_init(argc, argv);

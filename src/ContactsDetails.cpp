@@ -1,8 +1,9 @@
-// The library's entry points for the detail screen.
+// The library's entry points: the detail screen and the share-fields screen.
 #include "ContactsDetails.h"
 
 #include "ContactsDebug.h"
 #include "CtDetailView.h"
+#include "CtShareContactView.h"
 
 app_assist::WView* createCtDetailView(int personId, CtLaunchRequest* request)
 {
@@ -16,4 +17,9 @@ app_assist::WView* createCtDetailViewForGalSearch(void* galData)
 {
 	WENTER();
 	return new CtDetailView(static_cast<const CtGalSearchData*>(galData));
+}
+
+app_assist::WView* createCtShareContactView(int personId, CtLaunchRequest* request)
+{
+	return new CtShareContactView(personId, request);
 }

@@ -34,7 +34,7 @@ const TableInfo kTables[] = {
 	{ 13, "relationships", "relationships", "owner=0", true },
 	{ 14, "events", "events", "owner=0", true },
 	{ 15, "notes", "notes", "owner=0", true },
-	{ 16, "images", "images", "owner=0", true },
+	{ 16, "images", "images_v", "owner=0", true },
 	{ 17, "nicknames", "nicknames", "owner=0", true },
 	{ 18, "companies", "companies", "owner=0", true },
 	{ 19, "group_relations", "group_relations_v", "owner=0", true },
@@ -171,7 +171,18 @@ const std::vector<const ViewInfo*>& ContactsSchema::childViews(const ViewInfo& p
 	return it == r.children.end() ? none : it->second;
 }
 
-const char* ContactsSchema::schemaTag() { return "contacts-service/2"; }
+const char* ContactsSchema::schemaTag() { return "contacts-service/3"; }
+
+namespace {
+
+// Pictures as read: each with its extension flag (see contacts_view_list.h).
+#define CT_IMAGES_VIEW_SQL \
+	"CREATE VIEW IF NOT EXISTS images_v AS SELECT i.id AS id, i.contact_id AS contact_id, i.owner AS owner, i.type AS type,\n" \
+	"	i.label AS label, i.path AS path, i.is_default AS is_default, i.\"order\" AS \"order\",\n" \
+	"	(i.id = (SELECT j.id FROM images j WHERE j.contact_id = i.contact_id AND j.owner = i.owner\n" \
+	"		ORDER BY j.\"order\", j.id LIMIT 1)) AS extension_flag FROM images i;\n"
+
+} // namespace
 
 const char* ContactsSchema::upgradeSql(const std::string& fromTag)
 {
@@ -181,7 +192,9 @@ CREATE TABLE profiles(id INTEGER PRIMARY KEY, contact_id INTEGER, owner INTEGER 
 	label TEXT, uid TEXT, text TEXT, service_operation TEXT, mime TEXT, app_id TEXT, uri TEXT, category TEXT,
 	extra_data TEXT);
 CREATE INDEX profiles_contact ON profiles(contact_id, owner);
-)SQL";
+)SQL" CT_IMAGES_VIEW_SQL;
+	if (fromTag == "contacts-service/2")
+		return CT_IMAGES_VIEW_SQL;
 	return nullptr;
 }
 
@@ -239,6 +252,7 @@ CREATE TABLE events(id INTEGER PRIMARY KEY, contact_id INTEGER, owner INTEGER DE
 CREATE TABLE notes(id INTEGER PRIMARY KEY, contact_id INTEGER, owner INTEGER DEFAULT 0, note TEXT);
 CREATE TABLE images(id INTEGER PRIMARY KEY, contact_id INTEGER, owner INTEGER DEFAULT 0, type INTEGER DEFAULT 0,
 	label TEXT, path TEXT, is_default INTEGER DEFAULT 0, "order" INTEGER DEFAULT 0);
+)SQL" CT_IMAGES_VIEW_SQL R"SQL(
 CREATE TABLE nicknames(id INTEGER PRIMARY KEY, contact_id INTEGER, owner INTEGER DEFAULT 0, name TEXT);
 CREATE TABLE profiles(id INTEGER PRIMARY KEY, contact_id INTEGER, owner INTEGER DEFAULT 0, type INTEGER DEFAULT 0,
 	label TEXT, uid TEXT, text TEXT, service_operation TEXT, mime TEXT, app_id TEXT, uri TEXT, category TEXT,

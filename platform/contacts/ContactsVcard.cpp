@@ -4,14 +4,30 @@
 #include "ContactsDebug.h"
 #include "ContactsPersons.h"
 #include "ContactsReader.h"
+#include "ContactsVcardTypes.h"
 #include "contacts_service.h"
 
+#include <glib.h>
+
+#include <algorithm>
 #include <cstdlib>
 #include <cstring>
+#include <fstream>
 #include <memory>
+#include <set>
 
 namespace ct::contacts {
 namespace {
+
+using V = ContactsVcard;
+using Kind = ContactsVcardTypes::Kind;
+
+// The text of one card being written; `items` numbers the property groups
+// ("item1.") that tie a custom label to its line.
+struct Card {
+	std::string text;
+	int items = 0;
+};
 
 const std::vector<contacts_record_s*>& childrenOf(const contacts_record_s& r, const char* prop)
 {
@@ -22,79 +38,299 @@ const std::vector<contacts_record_s*>& childrenOf(const contacts_record_s& r, co
 
 bool hasText(const char* s) { return s && *s; }
 
-std::string typeParam(int type, const char* label, std::initializer_list<std::pair<int, const char*>> bits)
+std::string text(const char* s) { return s ? s : ""; }
+
+void addLine(Card& card, const std::string& line)
 {
-	std::string types;
-	for (const auto& [bit, name] : bits)
-		if (type & bit)
-			types += (types.empty() ? "" : ",") + std::string(name);
-	if ((type & 1) && hasText(label))
-		types += (types.empty() ? "X-" : ",X-") + std::string(label);
-	return types.empty() ? "" : ";TYPE=" + types;
+	card.text += V::fold(line);
+	card.text += "\r\n";
 }
 
-void addLine(std::string& out, const std::string& line)
+// A parameter value, quoted when it holds a separator; quotes cannot be kept.
+std::string paramValue(const char* value)
 {
-	out += ContactsVcard::fold(line);
-	out += "\r\n";
+	std::string out = text(value);
+	out.erase(std::remove(out.begin(), out.end(), '"'), out.end());
+	out.erase(std::remove_if(out.begin(), out.end(), [](char c) { return c == '\r' || c == '\n'; }), out.end());
+	return out.find_first_of(";:,") == std::string::npos ? out : "\"" + out + "\"";
 }
 
-void addName(std::string& out, const std::vector<const contacts_record_s*>& sources)
+// NAME;params:value, or itemN.NAME;params:value plus itemN.X-ABLabel:label
+// when the field carries a custom label.
+void addLabelled(Card& card, const std::string& nameAndParams, const std::string& value, const char* label)
+{
+	if (!hasText(label)) {
+		addLine(card, nameAndParams + ":" + value);
+		return;
+	}
+	std::string group = "item" + std::to_string(++card.items) + ".";
+	addLine(card, group + nameAndParams + ":" + value);
+	addLine(card, group + "X-ABLabel:" + V::escape(label));
+}
+
+std::string typeParams(const std::string& types, bool pref)
+{
+	std::string all = types;
+	if (pref)
+		all += (all.empty() ? "" : ",") + std::string("PREF");
+	return all.empty() ? "" : ";TYPE=" + all;
+}
+
+const char* customLabel(const contacts_record_s& r, bool isCustom)
+{
+	return isCustom && hasText(r.getStr("label")) ? r.getStr("label") : nullptr;
+}
+
+std::string readPicture(const char* path)
+{
+	std::ifstream in(path, std::ios::binary | std::ios::ate);
+	if (!in)
+		return {};
+	std::streamoff size = in.tellg();
+	if (size <= 0 || static_cast<size_t>(size) > V::kMaxPictureBytes) {
+		WWARNING("picture %s left out of the vCard: %lld bytes", path, static_cast<long long>(size));
+		return {};
+	}
+	std::string bytes(static_cast<size_t>(size), '\0');
+	in.seekg(0);
+	in.read(bytes.data(), size);
+	return in ? bytes : std::string();
+}
+
+void addPicture(Card& card, const char* property, const char* path)
+{
+	if (!hasText(path))
+		return;
+	std::string bytes = readPicture(path);
+	const char* type = V::pictureType(bytes);
+	if (!type) {
+		if (!bytes.empty())
+			WWARNING("picture %s left out of the vCard: not a known picture format", path);
+		return;
+	}
+	gchar* encoded = g_base64_encode(reinterpret_cast<const guchar*>(bytes.data()), bytes.size());
+	addLine(card, std::string(property) + ";ENCODING=b;TYPE=" + type + ":" + encoded);
+	g_free(encoded);
+}
+
+void addName(Card& card, const std::vector<const contacts_record_s*>& sources)
 {
 	for (const contacts_record_s* s : sources) {
 		for (const contacts_record_s* n : childrenOf(*s, "name")) {
-			addLine(out, "N:" + ContactsVcard::escape(n->getStr("last")) + ";" + ContactsVcard::escape(n->getStr("first"))
-				+ ";" + ContactsVcard::escape(n->getStr("addition")) + ";" + ContactsVcard::escape(n->getStr("prefix"))
-				+ ";" + ContactsVcard::escape(n->getStr("suffix")));
+			addLine(card, "N:" + V::escape(n->getStr("last")) + ";" + V::escape(n->getStr("first")) + ";"
+				+ V::escape(n->getStr("addition")) + ";" + V::escape(n->getStr("prefix")) + ";"
+				+ V::escape(n->getStr("suffix")));
+			for (const auto& [prop, line] : { std::pair{ "phonetic_first", "X-PHONETIC-FIRST-NAME:" },
+					 { "phonetic_middle", "X-PHONETIC-MIDDLE-NAME:" }, { "phonetic_last", "X-PHONETIC-LAST-NAME:" } })
+				if (hasText(n->getStr(prop)))
+					addLine(card, line + V::escape(n->getStr(prop)));
 			return;
 		}
 	}
-	addLine(out, "N:;;;;");
+	addLine(card, "N:;;;;");
 }
 
-void addFields(std::string& out, const contacts_record_s& s)
+void addNumbers(Card& card, const contacts_record_s& s)
 {
-	using V = ContactsVcard;
-	for (const contacts_record_s* c : childrenOf(s, "nickname"))
-		if (hasText(c->getStr("name")))
-			addLine(out, "NICKNAME:" + V::escape(c->getStr("name")));
-	for (const contacts_record_s* c : childrenOf(s, "number"))
-		if (hasText(c->getStr("number")))
-			addLine(out, "TEL" + typeParam(c->getInt("type"), c->getStr("label"),
-				{ { 2, "HOME" }, { 4, "WORK" }, { 8, "VOICE" }, { 16, "FAX" }, { 32, "MSG" }, { 64, "CELL" },
-					{ 128, "PAGER" }, { 256, "BBS" }, { 512, "MODEM" }, { 1024, "CAR" }, { 2048, "ISDN" },
-					{ 4096, "VIDEO" }, { 8192, "PCS" } }) + ":" + V::escape(c->getStr("number")));
-	for (const contacts_record_s* c : childrenOf(s, "email"))
-		if (hasText(c->getStr("email")))
-			addLine(out, "EMAIL" + typeParam(c->getInt("type"), c->getStr("label"), { { 2, "HOME" }, { 4, "WORK" } })
-				+ ":" + V::escape(c->getStr("email")));
-	for (const contacts_record_s* c : childrenOf(s, "address"))
-		addLine(out, "ADR" + typeParam(c->getInt("type"), c->getStr("label"),
-			{ { 2, "HOME" }, { 4, "WORK" }, { 8, "DOM" }, { 16, "INTL" }, { 32, "POSTAL" }, { 64, "PARCEL" } })
-			+ ":" + V::escape(c->getStr("postbox")) + ";" + V::escape(c->getStr("extended")) + ";"
-			+ V::escape(c->getStr("street")) + ";" + V::escape(c->getStr("locality")) + ";"
-			+ V::escape(c->getStr("region")) + ";" + V::escape(c->getStr("postal_code")) + ";"
-			+ V::escape(c->getStr("country")));
-	for (const contacts_record_s* c : childrenOf(s, "company")) {
-		if (hasText(c->getStr("name")) || hasText(c->getStr("department")))
-			addLine(out, "ORG:" + V::escape(c->getStr("name")) + ";" + V::escape(c->getStr("department")));
-		if (hasText(c->getStr("job_title")))
-			addLine(out, "TITLE:" + V::escape(c->getStr("job_title")));
+	for (const contacts_record_s* c : childrenOf(s, "number")) {
+		if (!hasText(c->getStr("number")))
+			continue;
+		int type = c->getInt("type");
+		addLabelled(card,
+			"TEL" + typeParams(ContactsVcardTypes::typeList(Kind::Number, type), c->getInt("is_default")),
+			V::escape(c->getStr("number")), customLabel(*c, type & CONTACTS_NUMBER_TYPE_CUSTOM));
 	}
-	for (const contacts_record_s* c : childrenOf(s, "url"))
-		if (hasText(c->getStr("url")))
-			addLine(out, "URL:" + V::escape(c->getStr("url")));
-	for (const contacts_record_s* c : childrenOf(s, "note"))
-		if (hasText(c->getStr("note")))
-			addLine(out, "NOTE:" + V::escape(c->getStr("note")));
+}
+
+void addEmails(Card& card, const contacts_record_s& s)
+{
+	for (const contacts_record_s* c : childrenOf(s, "email")) {
+		if (!hasText(c->getStr("email")))
+			continue;
+		int type = c->getInt("type");
+		std::string types = ContactsVcardTypes::typeList(Kind::Email, type);
+		addLabelled(card, "EMAIL" + typeParams("INTERNET" + (types.empty() ? "" : "," + types), c->getInt("is_default")),
+			V::escape(c->getStr("email")), customLabel(*c, type & CONTACTS_EMAIL_TYPE_CUSTOM));
+	}
+}
+
+void addAddresses(Card& card, const contacts_record_s& s)
+{
+	for (const contacts_record_s* c : childrenOf(s, "address")) {
+		std::string value;
+		for (const char* part : { "postbox", "extended", "street", "locality", "region", "postal_code", "country" })
+			value += (value.empty() && strcmp(part, "postbox") == 0 ? "" : ";") + V::escape(c->getStr(part));
+		if (value.find_first_not_of(';') == std::string::npos)
+			continue;
+		int type = c->getInt("type");
+		addLabelled(card,
+			"ADR" + typeParams(ContactsVcardTypes::typeList(Kind::Address, type), c->getInt("is_default")), value,
+			customLabel(*c, type & CONTACTS_ADDRESS_TYPE_CUSTOM));
+	}
+}
+
+void addUrls(Card& card, const contacts_record_s& s)
+{
+	for (const contacts_record_s* c : childrenOf(s, "url")) {
+		if (!hasText(c->getStr("url")))
+			continue;
+		int type = c->getInt("type");
+		addLabelled(card, "URL" + typeParams(ContactsVcardTypes::typeList(Kind::Url, type), false),
+			V::escape(c->getStr("url")), customLabel(*c, type == CONTACTS_URL_TYPE_CUSTOM));
+	}
+}
+
+void addMessengers(Card& card, const contacts_record_s& s)
+{
+	for (const contacts_record_s* c : childrenOf(s, "messenger")) {
+		if (!hasText(c->getStr("im_id")))
+			continue;
+		int type = c->getInt("type");
+		const VcardMessenger* m = ContactsVcardTypes::messengerOfType(type);
+		if (m && *m->property) {
+			addLine(card, std::string(m->property) + ":" + V::escape(c->getStr("im_id")));
+			continue;
+		}
+		const char* service = m ? m->service : customLabel(*c, type == CONTACTS_MESSENGER_TYPE_CUSTOM);
+		std::string params = service ? ";X-SERVICE-TYPE=" + paramValue(service) : "";
+		addLine(card, "IMPP" + params + ":" + (m ? m->scheme : "x-apple") + ":" + V::escape(c->getStr("im_id")));
+	}
+}
+
+void addRelationships(Card& card, const contacts_record_s& s)
+{
+	for (const contacts_record_s* c : childrenOf(s, "relationship")) {
+		if (!hasText(c->getStr("name")))
+			continue;
+		int type = c->getInt("type");
+		const char* label = ContactsVcardTypes::relationLabel(type);
+		if (!label)
+			label = type == CONTACTS_RELATIONSHIP_TYPE_CUSTOM && hasText(c->getStr("label"))
+				? c->getStr("label")
+				: ContactsVcardTypes::otherLabel();
+		addLabelled(card, "X-ABRELATEDNAMES", V::escape(c->getStr("name")), label);
+	}
+}
+
+// YYYY-MM-DD; a date without a year is written the way address books that
+// keep such dates read it: year 1604 marked as left out.
+std::string eventDate(int date, std::string* params)
+{
+	int year = date / 10000;
+	if (year == 0) {
+		year = 1604;
+		*params += ";X-APPLE-OMIT-YEAR=1604";
+	}
+	char buf[32];
+	snprintf(buf, sizeof buf, "%04d-%02d-%02d", year, date / 100 % 100, date % 100);
+	return buf;
+}
+
+const char* eventLabel(const contacts_record_s& event)
+{
+	bool custom = event.getInt("type") == CONTACTS_EVENT_TYPE_CUSTOM && hasText(event.getStr("label"));
+	return custom ? event.getStr("label") : ContactsVcardTypes::otherLabel();
+}
+
+void addEvents(Card& card, const contacts_record_s& s)
+{
 	for (const contacts_record_s* c : childrenOf(s, "event")) {
 		int date = c->getInt("date");
-		if (c->getInt("type") != CONTACTS_EVENT_TYPE_BIRTH || date <= 0)
+		if (date <= 0)
 			continue;
-		char buf[16];
-		snprintf(buf, sizeof buf, "%04d-%02d-%02d", date / 10000, date / 100 % 100, date % 100);
-		addLine(out, std::string("BDAY:") + buf);
+		std::string params;
+		if (c->getInt("calendar_type") == CONTACTS_EVENT_CALENDAR_TYPE_LUNAR)
+			params += ";X-CALSCALE=LUNAR";
+		if (c->getInt("is_leap_month"))
+			params += ";X-LEAP-MONTH=TRUE";
+		std::string value = eventDate(date, &params);
+		int type = c->getInt("type");
+		if (type == CONTACTS_EVENT_TYPE_BIRTH)
+			addLine(card, "BDAY" + params + ":" + value);
+		else if (type == CONTACTS_EVENT_TYPE_ANNIVERSARY)
+			addLine(card, "X-ANNIVERSARY" + params + ":" + value);
+		else
+			addLabelled(card, "X-ABDATE" + params, value, eventLabel(*c));
 	}
+}
+
+void addCompanies(Card& card, const contacts_record_s& s)
+{
+	const auto& companies = childrenOf(s, "company");
+	for (const contacts_record_s* c : companies) {
+		// Several companies: each one's lines share a group so they stay together.
+		std::string group = companies.size() > 1 ? "item" + std::to_string(++card.items) + "." : "";
+		if (hasText(c->getStr("name")) || hasText(c->getStr("department")))
+			addLine(card, group + "ORG:" + V::escape(c->getStr("name"))
+				+ (hasText(c->getStr("department")) ? ";" + V::escape(c->getStr("department")) : ""));
+		for (const auto& [prop, name] : { std::pair{ "job_title", "TITLE" }, { "role", "ROLE" },
+				 { "assistant_name", "X-ASSISTANT" }, { "phonetic_name", "X-PHONETIC-ORG" },
+				 { "location", "X-COMPANY-LOCATION" }, { "description", "X-COMPANY-DESCRIPTION" } })
+			if (hasText(c->getStr(prop)))
+				addLine(card, group + name + ":" + V::escape(c->getStr(prop)));
+		addPicture(card, (group + "LOGO").c_str(), c->getStr("logo"));
+	}
+}
+
+void addPictures(Card& card, const contacts_record_s& s)
+{
+	std::vector<const contacts_record_s*> images(childrenOf(s, "image").begin(), childrenOf(s, "image").end());
+	// The default picture first, then the picture order.
+	std::stable_sort(images.begin(), images.end(), [](const contacts_record_s* a, const contacts_record_s* b) {
+		if (a->getInt("is_default") != b->getInt("is_default"))
+			return a->getInt("is_default") > b->getInt("is_default");
+		return a->getInt("order") < b->getInt("order");
+	});
+	for (const contacts_record_s* c : images)
+		addPicture(card, "PHOTO", c->getStr("path"));
+}
+
+// Social-network profiles: the service as TYPE (what address books show),
+// the rest of the launch data in extension parameters.
+void addSocialProfiles(Card& card, const contacts_record_s& s)
+{
+	static const std::pair<const char*, const char*> params[] = { { "label", "TYPE" }, { "uid", "X-USER" },
+		{ "text", "X-TEXT" }, { "app_id", "X-APP-ID" }, { "service_operation", "X-OPERATION" }, { "mime", "X-MIME" },
+		{ "category", "X-CATEGORY" }, { "extra_data", "X-EXTRA" } };
+	for (const contacts_record_s* c : childrenOf(s, "profile")) {
+		std::string line = "X-SOCIALPROFILE";
+		if (c->getInt("type"))
+			line += ";X-PROFILE-TYPE=" + std::to_string(c->getInt("type"));
+		for (const auto& [prop, param] : params)
+			if (hasText(c->getStr(prop)))
+				line += std::string(";") + param + "=" + paramValue(c->getStr(prop));
+		addLine(card, line + ":" + V::escape(c->getStr("uri")));
+	}
+}
+
+void addSimpleLines(Card& card, const contacts_record_s& s)
+{
+	for (const contacts_record_s* c : childrenOf(s, "nickname"))
+		if (hasText(c->getStr("name")))
+			addLine(card, "NICKNAME:" + V::escape(c->getStr("name")));
+	for (const contacts_record_s* c : childrenOf(s, "note"))
+		if (hasText(c->getStr("note")))
+			addLine(card, "NOTE:" + V::escape(c->getStr("note")));
+	if (s.view->findByName("status") && hasText(s.getStr("status")))
+		addLine(card, "X-STATUS:" + V::escape(s.getStr("status")));
+}
+
+void addCategories(Card& card, const std::vector<const contacts_record_s*>& sources)
+{
+	std::string value;
+	std::set<std::string> seen;
+	for (const contacts_record_s* s : sources)
+		for (const contacts_record_s* c : childrenOf(*s, "group_relation"))
+			if (hasText(c->getStr("name")) && seen.insert(c->getStr("name")).second)
+				value += (value.empty() ? "" : ",") + V::escape(c->getStr("name"));
+	if (!value.empty())
+		addLine(card, "CATEGORIES:" + value);
+}
+
+void addUid(Card& card, const std::vector<const contacts_record_s*>& sources)
+{
+	if (!sources.empty() && sources.front()->view->findByName("uid") && hasText(sources.front()->getStr("uid")))
+		addLine(card, "UID:" + V::escape(sources.front()->getStr("uid")));
 }
 
 } // namespace
@@ -119,6 +355,7 @@ std::string ContactsVcard::fold(const std::string& line)
 {
 	const size_t kMax = 75;
 	std::string out;
+	out.reserve(line.size() + line.size() / 25);
 	size_t pos = 0;
 	size_t room = kMax;
 	while (line.size() - pos > room) {
@@ -134,17 +371,50 @@ std::string ContactsVcard::fold(const std::string& line)
 	return out;
 }
 
+const char* ContactsVcard::pictureType(const std::string& b)
+{
+	auto starts = [&](const char* magic, size_t at = 0) {
+		size_t n = strlen(magic);
+		return b.size() >= at + n && b.compare(at, n, magic) == 0;
+	};
+	if (starts("\xFF\xD8\xFF"))
+		return "JPEG";
+	if (starts("\x89PNG\r\n\x1A\n"))
+		return "PNG";
+	if (starts("GIF87a") || starts("GIF89a"))
+		return "GIF";
+	if (starts("BM") && b.size() > 26)
+		return "BMP";
+	if (starts("RIFF") && starts("WEBP", 8))
+		return "WEBP";
+	return nullptr;
+}
+
 std::string ContactsVcard::make(const std::vector<const contacts_record_s*>& sources, const std::string& displayName)
 {
-	std::string out;
-	addLine(out, "BEGIN:VCARD");
-	addLine(out, "VERSION:3.0");
-	addLine(out, "FN:" + escape(displayName.c_str()));
-	addName(out, sources);
+	Card card;
+	addLine(card, "BEGIN:VCARD");
+	addLine(card, "VERSION:3.0");
+	addLine(card, "FN:" + escape(displayName.c_str()));
+	addName(card, sources);
+	for (const contacts_record_s* s : sources) {
+		addSimpleLines(card, *s);
+		addNumbers(card, *s);
+		addEmails(card, *s);
+		addAddresses(card, *s);
+		addCompanies(card, *s);
+		addUrls(card, *s);
+		addMessengers(card, *s);
+		addRelationships(card, *s);
+		addEvents(card, *s);
+		addSocialProfiles(card, *s);
+	}
+	addCategories(card, sources);
+	addUid(card, sources);
 	for (const contacts_record_s* s : sources)
-		addFields(out, *s);
-	addLine(out, "END:VCARD");
-	return out;
+		addPictures(card, *s);
+	addLine(card, "END:VCARD");
+	return std::move(card.text);
 }
 
 } // namespace ct::contacts
@@ -209,6 +479,14 @@ int contacts_vcard_make_from_person(contacts_record_h person, char** vcard_strea
 	}
 	if (contacts.empty())
 		return CONTACTS_ERROR_NO_DATA;
+	// One preferred number and e-mail: the person's defaults, not each contact's.
+	for (auto [prop, kind] : { std::pair{ "number", CONTACTS_PERSON_PROPERTY_NUMBER }, { "email", CONTACTS_PERSON_PROPERTY_EMAIL } }) {
+		int defaultId = 0;
+		contacts_person_get_default_property(kind, person->getInt("id"), &defaultId);
+		for (const auto& c : contacts)
+			for (contacts_record_s* child : *c->children(prop))
+				child->setInt("is_default", child->getInt("id") == defaultId ? 1 : 0);
+	}
 	// The name contact first, so that N comes from it.
 	int nameContact = person->getInt("display_contact_id");
 	std::vector<const contacts_record_s*> sources;

@@ -49,7 +49,14 @@ int contacts_utils_strstr(const char *haystack, const char *needle, int *len);
 int contacts_setting_get_name_display_order(contacts_name_display_order_e *name_display_order);
 int contacts_setting_set_name_display_order(contacts_name_display_order_e name_display_order);
 
-/* vCard 3.0 text (UTF-8, CRLF, lines folded at 75 bytes) that the caller frees. */
+/* vCard 3.0 text (UTF-8, CRLF, lines folded at 75 bytes) that the caller
+ * frees, with every stored field: names and phonetic names, nicknames,
+ * numbers, e-mails, addresses and web sites (types, custom labels), companies,
+ * messengers, relationships, events, notes, groups, social-network profiles,
+ * the profile status and the pictures (embedded, up to 1 MB each). A
+ * person's card merges its contacts and prefers the person's default number
+ * and e-mail. Cards are read back by
+ * ContactsVcardImport (ContactsVcardImport.h, and contacts-ctl vcard import). */
 int contacts_vcard_make_from_person(contacts_record_h person, char **vcard_stream);
 int contacts_vcard_make_from_contact(contacts_record_h contact, char **vcard_stream);
 int contacts_vcard_make_from_my_profile(contacts_record_h my_profile, char **vcard_stream);

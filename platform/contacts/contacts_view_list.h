@@ -228,9 +228,14 @@ CONTACTS_PROP(_contacts_image, path, STR, RW)
 CONTACTS_PROP(_contacts_image, is_default, BOOL, RW)
 CONTACTS_VIEW_END(_contacts_image)
 
-/* Picture order (1 to 5) of the profile's images. */
+/* Picture order (1 to 5) of the profile's images.
+ * extension_flag, set by the service: 1 for the one picture that stands for
+ * its contact (or profile), the first by picture order and then by id; 0 for
+ * its further pictures and for pictures not stored yet. Choosers of a
+ * person's picture list the flagged ones: one per linked contact. */
 CONTACTS_VIEW(_contacts_image_ex, 16, "contacts.view.image", 0x800)
 CONTACTS_PROP(_contacts_image_ex, order, INT, RW)
+CONTACTS_PROP(_contacts_image_ex, extension_flag, INT, RO)
 CONTACTS_VIEW_END(_contacts_image_ex)
 
 CONTACTS_VIEW(_contacts_nickname, 17, "contacts.view.nickname", 0)

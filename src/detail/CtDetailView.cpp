@@ -8,6 +8,8 @@
 #include "CtCommonUsageLog.h"
 #include "CtCommonWidgetUtil.h"
 #include "CtDetailData.h"
+#include "CtDetailImageView.h"
+#include "CtDetailMarkAsDefaultView.h"
 #include "CtDetailViewAddressItem.h"
 #include "CtDetailViewCtxPopup.h"
 #include "CtDetailViewEmailItem.h"
@@ -607,7 +609,8 @@ void CtDetailView::__updateFavoriteBtn()
 {
 	Elm_Object_Item* naviItem = getNaviItem();
 	WPRET_M(!naviItem, "naviItem is nullptr");
-	WPRET_M(m_isSimContact, "__isSimContact == true");
+	if (m_isSimContact)
+		return;   // SIM cards keep no favourites
 	if (elm_object_item_part_content_get(naviItem, "title_right_btn"))
 		return;
 	std::string edj;
@@ -903,9 +906,9 @@ void CtDetailView::onAddressSelected(contacts_record_h address)
 void CtDetailView::onImageSelected(int page)
 {
 	WHIT();
-	// The full-screen picture view comes with its own screen; until then the
-	// tap is only noted.
-	WDEBUG("picture page %d selected", page);
+	app_assist::WNaviframe* naviframe = getNaviframe();
+	WPRET_M(!naviframe || !m_detailData, "naviframe or data is nullptr");
+	naviframe->push(new CtDetailImageView(m_detailData.get(), false, page));
 }
 
 void CtDetailView::__powerSavingModeChangedCb(keynode_t* node, void* data)
@@ -988,7 +991,9 @@ void CtDetailView::__moreButtonCb(void* data, Evas_Object*, void*)
 		contacts = nullptr;
 	WPRET_M(!contacts, "list is nullptr");
 	WPRET_M(eina_list_count(contacts) == 0, "contacts list is empty");
-	// The menu's actions open screens of their own; until they exist the
-	// key does nothing more.
+	// Until the more menu lands, the key opens its one screen that exists
+	// when the person offers a choice of default name or picture.
 	WDEBUG("more menu for person %d", view->getPersoinId());
+	if (CtDetailMarkAsDefaultView::hasChoice(view->m_detailData.get()) && view->getNaviframe())
+		view->getNaviframe()->push(new CtDetailMarkAsDefaultView(view->m_detailData.get()));
 }

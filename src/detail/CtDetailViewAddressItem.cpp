@@ -63,7 +63,10 @@ void CtDetailViewAddressItem::onSelect(Elm_Object_Item* item)
 
 void CtDetailViewAddressItem::onIconClicked(const char*)
 {
-	WPRET_M(m_powerSaving, "power saving mode");
+	if (m_powerSaving) {
+		WINFO("power saving mode");
+		return;
+	}
 	WPRET_M(!m_owner, "owner is nullptr");
 	m_owner->onAddressSelected(m_record);
 }

@@ -66,8 +66,10 @@ void CtDetailViewEmailItem::onIconClicked(const char*)
 void CtDetailViewEmailItem::compose()
 {
 	WENTER();
-	WPRET_M(m_powerSaving, "power saving mode");
-	WPRET_M(!m_emailAppEnabled, "no email application");
+	if (m_powerSaving || !m_emailAppEnabled) {
+		WINFO("%s", m_powerSaving ? "power saving mode" : "no email application");
+		return;
+	}
 	std::string uri = "mailto:" + getCopyText();
 	app_control_h handle = nullptr;
 	int err = app_control_create(&handle);

@@ -92,7 +92,10 @@ void CtDetailViewNumberItem::call()
 		if (ecore_loop_time_get() - m_iconTapTime < kIconTapWindow)
 			return;
 	}
-	WPRET_M(!ContactsCommon::checkCallManagerReady(), "call manager is not ready");
+	if (!ContactsCommon::checkCallManagerReady()) {
+		WWARNING("call manager is not ready");
+		return;
+	}
 	std::string uri = "tel:" + __getNumber();
 	app_control_h handle = nullptr;
 	int err = app_control_create(&handle);

@@ -42,7 +42,10 @@ void CtDetailViewVideoCallItem::onSelect(Elm_Object_Item* item)
 
 void CtDetailViewVideoCallItem::onIconClicked(const char*)
 {
-	WPRET_M(m_powerSaving, "power saving mode");
+	if (m_powerSaving) {
+		WINFO("power saving mode");
+		return;
+	}
 	WPRET_M(!m_owner, "owner is nullptr");
 	m_owner->onVideoCallSelected();
 }

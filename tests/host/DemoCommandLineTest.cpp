@@ -28,6 +28,61 @@ TEST(DemoCommandLineTest, ScreenshotOfAPersonIsWrittenAndAnUnknownPersonOrUnwrit
 	EXPECT_NE(std::string::npos, run.output.find("cannot write")) << run.output;
 }
 
+TEST(DemoCommandLineTest, AHeldDetailScreenClosesWhenAnotherProgramDeletesItsPerson)
+{
+	TempDataDir data;
+	ASSERT_EQ(0, runDemo(data.path(), "").exitCode);   // makes the demo store
+	std::string shot = data.file("held.png");
+	std::string command = "CONTACTS_DATA_DIR=" + shellQuoted(data.path()) + " ELM_ENGINE=buffer " +
+		shellQuoted(hostBuildFile("contacts-demo")) + " --person 3 --hold 4 --screenshot " + shellQuoted(shot) + " 2>/dev/null";
+	FILE* demo = popen(command.c_str(), "r");
+	ASSERT_NE(nullptr, demo);
+	std::string output;
+	char line[512];
+	while (output.find("holding") == std::string::npos && fgets(line, sizeof(line), demo))
+		output += line;
+	EXPECT_NE(std::string::npos, output.find("holding CtDetailView")) << output;
+
+	std::string ctl = "CONTACTS_DATA_DIR=" + shellQuoted(data.path()) + " " +
+		shellQuoted(hostBuildFile("../tools/contacts-ctl")) + " contacts delete 3 >/dev/null 2>&1";
+	EXPECT_EQ(0, system(ctl.c_str()));
+	while (fgets(line, sizeof(line), demo))
+		output += line;
+	int status = pclose(demo);
+	EXPECT_TRUE(WIFEXITED(status) && WEXITSTATUS(status) == 0) << output;
+	EXPECT_NE(std::string::npos, output.find("after holding: PersonListView")) << output;
+	EXPECT_TRUE(isPng(shot));
+}
+
+TEST(DemoCommandLineTest, ScreensByNameOpenThroughTheLibraryOrSayTheyAreMissing)
+{
+	TempDataDir data;
+	DemoRun run = runDemo(data.path(), "--screen detail --person 1 --hold 0.2");
+	EXPECT_EQ(0, run.exitCode) << run.output;
+	EXPECT_NE(std::string::npos, run.output.find("after holding: CtDetailView")) << run.output;
+
+	// A library without an export of the screen: a clear message, not a crash.
+	run = runDemo(data.path(), "--screen wizard --screenshot " + shellQuoted(data.file("w.png")),
+		"CONTACTS_DETAILS_LIBRARY=" + shellQuoted(hostBuildFile("libcontacts-demo-stand-in-details.so")));
+	EXPECT_EQ(1, run.exitCode) << run.output;
+	EXPECT_NE(std::string::npos, run.output.find("the wizard screen is not part of this build")) << run.output;
+}
+
+TEST(DemoCommandLineTest, PictureAndMarkAsDefaultScreensAreReachedFromTheDetailScreen)
+{
+	TempDataDir data;
+	// Person 1 has a picture; person 15 is made of three linked contacts.
+	const std::pair<const char*, const char*> cases[] = {
+		{"--screen pictures --person 1", "after holding: CtDetailImageView"},
+		{"--screen mark-as-default --person 15", "after holding: CtDetailMarkAsDefaultView"},
+	};
+	for (const auto& [args, expected] : cases) {
+		DemoRun run = runDemo(data.path(), std::string(args) + " --hold 0.2");
+		EXPECT_EQ(0, run.exitCode) << run.output;
+		EXPECT_NE(std::string::npos, run.output.find(expected)) << run.output;
+	}
+}
+
 TEST(DemoCommandLineTest, BadArgumentsGiveAClearMessageAndExitCodeTwo)
 {
 	TempDataDir data;
@@ -45,7 +100,13 @@ TEST(DemoCommandLineTest, BadArgumentsGiveAClearMessageAndExitCodeTwo)
 		{"--screenshot ''", "--screenshot needs a value"},
 		{"--screenshots", "--screenshots needs a value"},
 		{"--frobnicate", "unknown argument: --frobnicate"},
-		{"--screenshot a.png --screenshots dir", "either --screenshot or --screenshots"},
+		{"--screenshot a.png --screenshots dir", "--screenshots takes no other option"},
+		{"--screen nowhere", "unknown screen 'nowhere'"},
+		{"--screen detail", "--screen detail needs --person ID"},
+		{"--hold 0", "--hold needs a number of seconds"},
+		{"--hold -1", "--hold needs a number of seconds"},
+		{"--hold nan", "--hold needs a number of seconds"},
+		{"--hold 2x", "--hold needs a number of seconds"},
 	};
 	for (const Case& c : cases) {
 		DemoRun run = runDemo(data.path(), c.args);

@@ -41,14 +41,18 @@ TEST(DemoDetailLibraryTest, DetailScreensComeFromTheLoadedLibraryAndItsRequestsR
 	EXPECT_GE(detailShots, 4) << run.output;
 }
 
-TEST(DemoDetailLibraryTest, UnloadableLibraryLeavesThePersonList)
+TEST(DemoDetailLibraryTest, UnloadableLibraryLeavesThePersonListAndRefusesItsScreens)
 {
 	TempDataDir data;
-	DemoRun run = runDemo(data.path(), "--person 1 --screenshot " + shellQuoted(data.file("p.png")),
-			"CONTACTS_DETAILS_LIBRARY=" + shellQuoted(data.file("missing.so")));
-	EXPECT_EQ(0, run.exitCode) << run.output;
+	std::string missing = "CONTACTS_DETAILS_LIBRARY=" + shellQuoted(data.file("missing.so"));
+	DemoRun run = runDemo(data.path(), "--person 1 --screenshot " + shellQuoted(data.file("p.png")), missing);
+	EXPECT_EQ(1, run.exitCode) << run.output;
 	EXPECT_NE(std::string::npos, run.output.find("dlopen(")) << run.output;
-	EXPECT_NE(std::string::npos, run.output.find("no detail screen in this build")) << run.output;
+	EXPECT_NE(std::string::npos, run.output.find("the detail screen is not part of this build")) << run.output;
+
+	run = runDemo(data.path(), "--screenshot " + shellQuoted(data.file("list.png")), missing);
+	EXPECT_EQ(0, run.exitCode) << run.output;
+	EXPECT_TRUE(isPng(data.file("list.png")));
 }
 
 } // namespace

@@ -1,0 +1,115 @@
+#include "DemoScreens.h"
+
+#include "ContactsDebug.h"
+#include "ShareFieldsRequest.h"
+
+#include <Ecore.h>
+#include <contacts.h>
+
+namespace ct::demo {
+
+namespace {
+
+// The first contact of a person, for the edit form; the caller keeps it.
+contacts_record_h firstContactOf(int personId, std::vector<std::shared_ptr<void>>& keepAlive)
+{
+	contacts_query_h query = nullptr;
+	contacts_filter_h filter = nullptr;
+	contacts_list_h list = nullptr;
+	contacts_record_h contact = nullptr;
+	contacts_query_create(_contacts_contact._uri, &query);
+	contacts_filter_create(_contacts_contact._uri, &filter);
+	contacts_filter_add_int(filter, _contacts_contact.person_id, CONTACTS_MATCH_EQUAL, personId);
+	contacts_query_set_filter(query, filter);
+	if (contacts_db_get_records_with_query(query, 0, 1, &list) == CONTACTS_ERROR_NONE) {
+		contacts_record_h first = nullptr;
+		if (contacts_list_get_current_record_p(list, &first) == CONTACTS_ERROR_NONE && first)
+			contacts_record_clone(first, &contact);
+		contacts_list_destroy(list, true);
+	}
+	contacts_filter_destroy(filter);
+	contacts_query_destroy(query);
+	if (contact)
+		keepAlive.emplace_back(contact, [](void* record) { contacts_record_destroy(static_cast<contacts_record_h>(record), true); });
+	return contact;
+}
+
+// A finger tap at (x, y) of the window, as the device would feed it.
+void tapAt(Evas_Object* win, int x, int y)
+{
+	Evas* canvas = evas_object_evas_get(win);
+	unsigned int stamp = static_cast<unsigned int>(ecore_time_get() * 1000);
+	evas_event_feed_mouse_move(canvas, x, y, stamp, nullptr);
+	evas_event_feed_mouse_down(canvas, 1, EVAS_BUTTON_NONE, stamp + 1, nullptr);
+	evas_event_feed_mouse_up(canvas, 1, EVAS_BUTTON_NONE, stamp + 2, nullptr);
+}
+
+void pressKey(Evas_Object* win, const char* key)
+{
+	Evas* canvas = evas_object_evas_get(win);
+	unsigned int stamp = static_cast<unsigned int>(ecore_time_get() * 1000);
+	evas_event_feed_key_down(canvas, key, key, nullptr, nullptr, stamp, nullptr);
+	evas_event_feed_key_up(canvas, key, key, nullptr, nullptr, stamp + 1, nullptr);
+}
+
+template <typename Fn, typename... Args>
+app_assist::WView* make(const DetailsLibrary& library, const char* exportName, Args... args)
+{
+	Fn factory = library.factory<Fn>(exportName);
+	return factory ? factory(args...) : nullptr;
+}
+
+} // namespace
+
+const std::vector<DemoScreen>& demoScreens()
+{
+	static const std::vector<DemoScreen> screens = {
+		{"detail", true, "a person's detail screen",
+			[](DemoScreenContext& c) { return make<CreateDetailViewFn>(c.library, "createCtDetailView", c.personId, nullptr); }},
+		{"create", false, "the form of a new contact",
+			[](DemoScreenContext& c) {
+				return make<CreateInputViewFn>(c.library, "createCtInputView", contacts_record_h(nullptr), nullptr);
+			}},
+		{"edit", true, "the edit form of a person's first contact",
+			[](DemoScreenContext& c) -> app_assist::WView* {
+				contacts_record_h contact = firstContactOf(c.personId, c.keepAlive);
+				return contact ? make<CreateInputViewFn>(c.library, "createCtInputView", contact, nullptr) : nullptr;
+			}},
+		{"my-profile", false, "the user's own profile",
+			[](DemoScreenContext& c) { return make<CreateMyProfileDetailViewFn>(c.library, "createCtMyProfileDetailView"); }},
+		{"my-profile-edit", false, "the edit form of the user's own profile",
+			[](DemoScreenContext& c) {
+				return make<CreateMyProfileInputViewFn>(c.library, "createCtMyProfileInputView", contacts_record_h(nullptr), nullptr);
+			}},
+		{"pictures", true, "a person's pictures full screen (the detail screen's picture tapped)",
+			[](DemoScreenContext& c) { return make<CreateDetailViewFn>(c.library, "createCtDetailView", c.personId, nullptr); },
+			[](Evas_Object* win) {
+				Evas_Coord w = 0;
+				evas_object_geometry_get(win, nullptr, nullptr, &w, nullptr);
+				tapAt(win, w / 2, 160);
+			}},
+		{"mark-as-default", true, "the choice of a linked person's name and picture (the detail screen's more key)",
+			[](DemoScreenContext& c) { return make<CreateDetailViewFn>(c.library, "createCtDetailView", c.personId, nullptr); },
+			[](Evas_Object* win) { pressKey(win, "Menu"); }},
+		{"wizard", false, "the profile set-up wizard",
+			[](DemoScreenContext& c) { return make<CreateProfileWizardViewFn>(c.library, "createCtProfileWizardView"); }},
+		{"share-fields", true, "chosen fields of a person, returned as text the host prints",
+			[](DemoScreenContext& c) {
+				auto request = std::make_shared<ShareFieldsRequest>();
+				c.keepAlive.push_back(request);
+				return make<CreateShareContactViewFn>(c.library, "createCtShareContactView", c.personId, request->get());
+			}},
+	};
+	return screens;
+}
+
+const DemoScreen* findDemoScreen(const std::string& name)
+{
+	for (const DemoScreen& screen : demoScreens()) {
+		if (name == screen.name)
+			return &screen;
+	}
+	return nullptr;
+}
+
+} // namespace ct::demo

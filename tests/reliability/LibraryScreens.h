@@ -1,6 +1,6 @@
 // Every screen the library exports, made through its factory. The soak, the
 // hostile-input tests and the factory fuzz target walk this table: a new
-// screen is one line here (and KillWriterTest-style checks need nothing).
+// screen is one line here.
 #pragma once
 
 #include "ContactsDetails.h"
@@ -31,6 +31,7 @@ inline const std::vector<LibraryScreen>& libraryScreens()
 		{ "createCtDetailView", [](const ScreenInputs& in) { return createCtDetailView(in.personId, in.request); } },
 		{ "createCtDetailViewForGalSearch",
 			[](const ScreenInputs& in) { return createCtDetailViewForGalSearch(const_cast<CtGalSearchData*>(in.galData)); } },
+		{ "createCtShareContactView", [](const ScreenInputs& in) { return createCtShareContactView(in.personId, in.request); } },
 	};
 	return screens;
 }

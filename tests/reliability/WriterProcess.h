@@ -139,11 +139,17 @@ private:
 	std::string m_buffer;
 };
 
-// The long mode (make test-long) runs `longCount` rounds, the suite `count`.
-inline int rounds(int count, int longCount)
+// Whether this is the long mode (make test-long).
+inline bool longMode()
 {
 	const char* mode = getenv("CONTACTS_TEST_LONG");
-	return mode && *mode && std::string(mode) != "0" ? longCount : count;
+	return mode && *mode && std::string(mode) != "0";
+}
+
+// The long mode runs `longCount` rounds, the suite `count`.
+inline int rounds(int count, int longCount)
+{
+	return longMode() ? longCount : count;
 }
 
 } // namespace ct::test

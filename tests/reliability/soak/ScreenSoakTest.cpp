@@ -138,9 +138,11 @@ TEST_F(ScreenSoakTest, OpeningAndClosingEveryScreenKeepsMemoryAndHandlesFlat)
 			describe(before).c_str(), describe(after).c_str());
 		EXPECT_EQ(before, after);
 		EXPECT_EQ(before, most) << "a count grew while the screen was closed";
-		// The sanitizer's quarantine holds freed memory back on purpose; its
-		// leak check at exit stands in for this figure there.
-		if (!sanitized()) {
+		// Memory is judged in the long mode only: a few cycles are too few to
+		// tell a slow leak from caches still filling. The sanitizer's
+		// quarantine holds freed memory back on purpose; its leak check at exit
+		// stands in for this figure there.
+		if (longMode() && !sanitized()) {
 			EXPECT_LE(mostResident - residentBefore, kMostGrowthBytes);
 		}
 	}

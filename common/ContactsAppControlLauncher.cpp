@@ -14,12 +14,13 @@ ContactsAppControlLauncher::~ContactsAppControlLauncher()
 		app_control_destroy(m_lastLaunched);
 }
 
-bool ContactsAppControlLauncher::sendLaunchRequest(app_control_h request)
+bool ContactsAppControlLauncher::sendAsyncLaunchRequest(app_control_h request,
+	app_control_reply_cb replyCallback, void* data, Evas_Object* ownerObject)
 {
-	return __send(request, nullptr, nullptr);
+	return sendLaunchRequest(request, replyCallback, data, ownerObject);
 }
 
-bool ContactsAppControlLauncher::sendAsyncLaunchRequest(app_control_h request,
+bool ContactsAppControlLauncher::sendLaunchRequest(app_control_h request,
 	app_control_reply_cb replyCallback, void* data, Evas_Object* ownerObject)
 {
 	if (!__send(request, replyCallback, data))

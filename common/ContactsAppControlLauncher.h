@@ -11,11 +11,12 @@ class ContactsAppControlLauncher {
 public:
 	static ContactsAppControlLauncher* getInstance();
 
-	// True when the request was handed to an application.
-	bool sendLaunchRequest(app_control_h request);
-	// Like sendLaunchRequest, with `replyCallback(request, reply, result, data)`
-	// on the main loop. When `ownerObject` is deleted first, the reply is
-	// dropped.
+	// True when the request was handed to an application. A given
+	// `replyCallback(request, reply, result, data)` runs on the main loop,
+	// unless `ownerObject` is deleted first: then the reply is dropped.
+	bool sendLaunchRequest(app_control_h request, app_control_reply_cb replyCallback = nullptr,
+		void* data = nullptr, Evas_Object* ownerObject = nullptr);
+	// The same as sendLaunchRequest (requests never block the main loop here).
 	bool sendAsyncLaunchRequest(app_control_h request, app_control_reply_cb replyCallback,
 		void* data, Evas_Object* ownerObject);
 	// Ends the last launched application, if any.

@@ -52,6 +52,9 @@ bool isSimName(const char* name)
 		       !strcmp(name, CONTACTS_SIM2_ADDRESS_BOOK_NAME));
 }
 
+// Parts of the names of the device and SIM books that no account book has.
+const char* const kBuiltInNameMarks[] = {"addressbook/phone", "addressbook/sim"};
+
 int groupIdBySystemId(int addressbookId, const char* systemId)
 {
 	contacts_filter_h filter = nullptr;
@@ -86,6 +89,16 @@ bool ctCommonIsSimAddressbook(int addressbookId)
 		return false;
 	ScopedRecord book(_contacts_address_book._uri, addressbookId);
 	return book.get() && isSimName(textOf(book.get(), _contacts_address_book.name));
+}
+
+bool ctCommonIsAccountAddressbookName(const char* addressbookName)
+{
+	if (!addressbookName)
+		return false;
+	for (const char* mark : kBuiltInNameMarks)
+		if (strstr(addressbookName, mark))
+			return false;
+	return true;
 }
 
 int ctCommonGetAddressBookId(const char* addressbookName)
@@ -130,7 +143,10 @@ int ctCommonGetProviderNameByAddressbookId(int addressbookId, char** providerNam
 		WFAILED("contacts_db_get_record", book.error());
 		return book.error();
 	}
-	*providerName = dupOrNull(textOf(book.get(), _contacts_address_book.provider_name));
+	if (addressbookId == 0)
+		*providerName = strdup(ContactsCommon::translate("IDS_PB_OPT_DEVICE"));
+	else
+		*providerName = dupOrNull(textOf(book.get(), _contacts_address_book.provider_name));
 	*userName = dupOrNull(textOf(book.get(), _contacts_address_book.user_name));
 	return CONTACTS_ERROR_NONE;
 }

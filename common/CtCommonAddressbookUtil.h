@@ -9,22 +9,27 @@
 // Address-book (storage) helpers of the contacts common library. All read
 // the contacts service; the caller must be connected (contacts_connect).
 
-// Name of the slotless SIM address book; the per-slot books are
-// CONTACTS_SIM1_ADDRESS_BOOK_NAME and CONTACTS_SIM2_ADDRESS_BOOK_NAME.
-#define SIM_ADDRESSBOOK_NAME "SIM"
+// Book names and provider names follow the contacts service's convention
+// (contacts_types.h). Name of the slotless SIM address book; the per-slot
+// books add the slot number ("1", "2").
+#define SIM_ADDRESSBOOK_NAME CONTACTS_SIM_ADDRESS_BOOK_NAME
 #define PHONE_ADDRESSBOOK_NAME CONTACTS_PHONE_ADDRESS_BOOK_NAME
 // Address-book mode of the social (Facebook) accounts.
 #define CT_ADDRESSBOOK_MODE_SOCIAL 101
 
-// True when the address book is one of the SIM books ("SIM", "SIM1", "SIM2").
+// True when the address book is one of the SIM books.
 bool ctCommonIsSimAddressbook(int addressbookId);
+// True when a book of that name belongs to an account (the device and SIM
+// books do not): its contacts are synced. False for null.
+bool ctCommonIsAccountAddressbookName(const char* addressbookName);
 // Id of the address book with that name; -1 when there is none.
 int ctCommonGetAddressBookId(const char* addressbookName);
 // Name of the address book as a new string the caller frees; null when
 // there is no such book.
 char* ctCommonGetAddressBookName(int addressbookId);
 // Provider and user name of the address book as new strings the caller
-// frees (each null when absent). Returns 0 or a negative contacts error.
+// frees (each null when absent); the device book's provider name is the
+// translated "IDS_PB_OPT_DEVICE". Returns 0 or a negative contacts error.
 int ctCommonGetProviderNameByAddressbookId(int addressbookId, char** providerName, char** userName);
 // The two texts that name an account in lists: first the provider text
 // ("IDS_PB_OPT_DEVICE" for the phone, "IDS_PB_OPT_SIM_CARD" for SIM books,

@@ -1,6 +1,7 @@
 #include "CtCommonWidgetUtil.h"
 
 #include "AppControlRouter.h"
+#include "ContactsAppControlLauncher.h"
 #include "ContactsAppIds.h"
 #include "ContactsCommon.h"
 #include "ContactsDebug.h"
@@ -192,6 +193,23 @@ bool ctCommoncheckEmailAppEnable()
 bool ctCommoncheckAccountAppEnable()
 {
 	return ct::appcontrol::hasHandler(CT_ACCOUNT_APP_ID);
+}
+
+bool ctCommonLaunchAddAccount()
+{
+	app_control_h request = nullptr;
+	int err = app_control_create(&request);
+	if (err != APP_CONTROL_ERROR_NONE) {
+		WFAILED("app_control_create", err);
+		return false;
+	}
+	app_control_set_app_id(request, CT_ACCOUNT_APP_ID);
+	app_control_set_launch_mode(request, APP_CONTROL_LAUNCH_MODE_GROUP);
+	app_control_add_extra_data(request, "mode", "add_account");
+	app_control_add_extra_data(request, "capability_filter", ACCOUNT_SUPPORTS_CAPABILITY_CONTACT);
+	bool sent = ContactsAppControlLauncher::getInstance()->sendLaunchRequest(request);
+	app_control_destroy(request);
+	return sent;
 }
 
 bool ctCommontGetMapsAppId(std::string& out)

@@ -3,6 +3,7 @@
 
 #include <Elementary.h>
 
+#include "ContactsAppIds.h"
 #include "CtCommonTextUtil.h"
 
 #include <string>
@@ -60,8 +61,9 @@ void ctCommonChecktStateSet(Evas_Object* check, Eina_Bool state, int animate);
 void ctCommonInvokeDbusCpuBoost();
 int ctCommonGetCpuBoostCount();
 
-// The account application (adds accounts from the storage question).
-#define CT_ACCOUNT_APP_ID "org.velmora.account"
+// The account application (adds accounts from the storage question); the
+// availability check and the launch both use this id.
+#define CT_ACCOUNT_APP_ID ACCOUNT_SETTINGS_APP_ID
 // Returned by ctCommontGetMapsAppId for a generic viewer of "geo:" URIs
 // (reached by operation, without an application id).
 #define CT_GEO_VIEWER_ID "org.velmora.geo-viewer"
@@ -71,6 +73,10 @@ int ctCommonGetCpuBoostCount();
 bool ctCommoncheckEmailAppEnable();
 // Whether the account application CT_ACCOUNT_APP_ID can be started.
 bool ctCommoncheckAccountAppEnable();
+// Starts CT_ACCOUNT_APP_ID to add an account that stores contacts ("mode"
+// "add_account", "capability_filter" ACCOUNT_SUPPORTS_CAPABILITY_CONTACT).
+// True when the request was sent.
+bool ctCommonLaunchAddAccount();
 
 // The maps application to use: MAPS_APP_ID when installed, else
 // CT_GEO_VIEWER_ID when a handler of APP_CONTROL_OPERATION_VIEW or

@@ -10,11 +10,19 @@ namespace app_assist {
 WControl::WControl()
 	// Deletion waits for callers that hold a locked weak pointer right now,
 	// so a control ended under them is still valid memory (in ended state).
-	: m_self(this, [](WControl* control) { delete control; })
+	: m_self(this, [](WControl* control) {
+		if (!control->m_inDestructor)
+			delete control;
+	})
 {
 }
 
-WControl::~WControl() = default;
+// A derived constructor that threw unwinds through here with the self pointer
+// still set; the failed new-expression frees the memory, so it must not.
+WControl::~WControl()
+{
+	m_inDestructor = true;
+}
 
 bool WControl::create(Evas_Object* parent, void* param)
 {

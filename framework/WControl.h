@@ -61,6 +61,8 @@ private:
 	void __addTimer(const std::shared_ptr<WUiTimer>& timer);
 	void __removeTimer(const WUiTimer* timer);
 
+	// Declared before m_self: still alive while m_self is released.
+	bool m_inDestructor = false;
 	std::shared_ptr<WControl> m_self;
 	Evas_Object* m_evasObj = nullptr;
 	bool m_created = false;

@@ -31,11 +31,11 @@ void WMenuPopup::setTextTranslatable(const char* domain)
 	m_domain = domain ? domain : "";
 }
 
-void WMenuPopup::appendItem(const char* label, std::function<void()> action)
+void WMenuPopup::appendItem(const char* label, std::function<void()> action, ItemState state)
 {
 	WPRET_M(!label, "Invalid param : label");
 	WPRET_M(isCreated(), "items are appended before the menu is shown");
-	m_items.push_back(std::make_unique<Item>(Item { this, label, std::move(action) }));
+	m_items.push_back(std::make_unique<Item>(Item { this, label, std::move(action), state }));
 }
 
 Evas_Object* WMenuPopup::onCreate(Evas_Object* parent, void*)
@@ -51,6 +51,7 @@ Evas_Object* WMenuPopup::onCreate(Evas_Object* parent, void*)
 			elm_object_item_text_set(it, item->label.c_str());
 		else
 			elm_object_item_domain_translatable_text_set(it, m_domain.c_str(), item->label.c_str());
+		elm_object_item_disabled_set(it, item->state == ItemState::Disabled);
 	}
 	eext_object_event_callback_add(ctxpopup, EEXT_CALLBACK_BACK, __dismissCb, this);
 	eext_object_event_callback_add(ctxpopup, EEXT_CALLBACK_MORE, __dismissCb, this);
@@ -74,7 +75,7 @@ void WMenuPopup::__itemSelectedCb(void* data, Evas_Object*, void*)
 {
 	WHIT();
 	auto* item = static_cast<Item*>(data);
-	if (item->owner->isDestroying())
+	if (item->owner->isDestroying() || item->state == ItemState::Disabled)
 		return;
 	std::function<void()> action = item->action;
 	item->owner->destroy();

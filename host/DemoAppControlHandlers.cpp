@@ -23,7 +23,7 @@ std::string roleOf(const std::string& appId, const std::string& operation)
 		{MAPS_APP_ID, "Maps"}, {GALLERY_APP_ID, "Gallery"}, {IMAGE_VIEWER_APP_ID, "Image viewer"},
 		{IMAGE_EDITOR_APP_ID, "Image editor"}, {RINGTONE_PICKER_APP_ID, "Ringtone picker"},
 		{MESSAGE_COMPOSER_APP_ID, "Message"}, {CONTACTS_LIST_APP_ID, "Contact picker"},
-		{FACEBOOK_APP_ID, "Facebook"}, {CONTACTS_APP_ID, "Contacts"},
+		{FACEBOOK_APP_ID, "Facebook"}, {CONTACTS_APP_ID, "Contacts"}, {ACCOUNT_SETTINGS_APP_ID, "Accounts"},
 	};
 	static const std::map<std::string, std::string> operations = {
 		{APP_CONTROL_OPERATION_CALL, "Call"}, {APP_CONTROL_OPERATION_DIAL, "Dial"},
@@ -93,7 +93,7 @@ DemoAppControlHandlers::DemoAppControlHandlers(std::string picturePath)
 	for (const char* app : {GALLERY_APP_ID, IMAGE_VIEWER_APP_ID, IMAGE_EDITOR_APP_ID})
 		__byApp(app, Answer::Picture);
 	__byApp(RINGTONE_PICKER_APP_ID, Answer::Ringtone);
-	for (const char* app : {MAPS_APP_ID, MESSAGE_COMPOSER_APP_ID, FACEBOOK_APP_ID})
+	for (const char* app : {MAPS_APP_ID, MESSAGE_COMPOSER_APP_ID, FACEBOOK_APP_ID, ACCOUNT_SETTINGS_APP_ID})
 		__byApp(app, Answer::Done);
 	// The demo has no contact or group picker to choose with.
 	__byApp(CONTACTS_LIST_APP_ID, Answer::None);

@@ -86,7 +86,7 @@ void addFavourites(Filler& f)
 		.company("Golden Gate Logistics", "Dispatcher").image(f.picture(1)).favourite()
 		.event(19750101, kBirthday).url("https://brian.example.com"));
 	f.store(B("Chloé", "Dubois").number("+33 1 42 68 53 00", kCell).email("chloe.dubois@example.fr", kHomeMail)
-		.favourite().event(700, kBirthday).note("Parle français et anglais."));
+		.favourite().event(714, kBirthday).note("Parle français et anglais."));
 	f.store(B("Diego", "Fernández").number("+34 912 345 678", kCell).messenger("diego.fdz", CONTACTS_MESSENGER_TYPE_GOOGLE)
 		.image(f.picture(2)).favourite().nickname("Dieguito"));
 }
@@ -145,7 +145,7 @@ void addBlockedAndPlain(Filler& f)
 	f.store(B("Unknown", "Caller").number("+1 202 555 0199", kCell).note("Keeps calling about car warranty."));
 	f.store(B("Sales", "Hotline").number("+1 800 555 0100", kWork).company("Best Deals Inc.", "Sales"));
 	f.store(B("Hannah", "Schmidt").number("+49 89 1234 5678", kCell).number("+49 89 9999 0000", kWork)
-		.email("hannah@example.de", kHomeMail).event(19950229, kBirthday).event(20180616, kAnniversary));
+		.email("hannah@example.de", kHomeMail).event(19960229, kBirthday).event(20180616, kAnniversary));
 	f.store(B("Isabella", "Rossi").number("+39 06 1234 5678", kCell).event(1224, kBirthday).image(f.picture(7)));
 	f.store(B("Jack", "Smith"));
 	f.store(B(nullptr, nullptr, 0).number("+61 2 9876 5432", kCell));

@@ -2,6 +2,7 @@
 #include "ContactsCommon.h"
 #include "DemoApp.h"
 #include "DemoOptions.h"
+#include "DemoResourceDir.h"
 #include "ToolkitModules.h"
 
 #include <Elementary.h>
@@ -52,6 +53,10 @@ int main(int argc, char** argv)
 	if (options.help) {
 		printf("%s", ct::demo::DemoOptions::usage().c_str());
 		return 0;
+	}
+	if (!ct::demo::DemoResourceDir::resolve(error)) {
+		fprintf(stderr, "contacts-demo: %s\n", error.c_str());
+		return 1;
 	}
 	// Pictures are read back from the buffer engine's pixels.
 	bool headless = !options.screenshotFile.empty() || !options.screenshotDir.empty() || !hasDisplay();

@@ -119,6 +119,29 @@ constexpr int messengerIndexByType(int type, int hangoutsPosition = MESSENGER_ME
 	}
 }
 
+// The two messenger menus: an ordinary contact's, and the profile's, where
+// position 5 gives Jabber, type 2 (Hangouts) sits on position 7 and a full
+// menu gives custom.
+struct MessengerMenu {
+	int hangoutsType;
+	int hangoutsPosition;
+	int whenFull;
+};
+constexpr MessengerMenu kContactMessengerMenu {
+	CONTACTS_MESSENGER_TYPE_GOOGLE, MESSENGER_MENU_HANGOUTS, CONTACTS_MESSENGER_TYPE_JABBER};
+constexpr MessengerMenu kProfileMessengerMenu {
+	CONTACTS_MESSENGER_TYPE_JABBER, MESSENGER_MENU_JABBER, CONTACTS_MESSENGER_TYPE_CUSTOM};
+
+constexpr int messengerTypeByIndex(int index, const MessengerMenu& menu)
+{
+	return messengerTypeByIndex(index, menu.hangoutsType);
+}
+
+constexpr int messengerIndexByType(int type, const MessengerMenu& menu)
+{
+	return messengerIndexByType(type, menu.hangoutsPosition);
+}
+
 // Next types from the types already used by the contact's children.
 
 // First free number menu position from 2 to 8, as a type; other (0) when all are taken.
@@ -175,15 +198,22 @@ inline int nextRelationshipType(const std::vector<int>& usedTypes)
 
 // First free messenger position from 1 to 6, as a type; `whenFull` (Jabber
 // for an ordinary contact) when none is free.
-inline int nextMessengerType(const std::vector<int>& usedTypes, int whenFull = CONTACTS_MESSENGER_TYPE_JABBER)
+inline int nextMessengerType(const std::vector<int>& usedTypes, const MessengerMenu& menu)
 {
 	bool taken[MESSENGER_MENU_JABBER + 1] = {};
 	for (int type : usedTypes)
-		taken[messengerIndexByType(type)] = true;
+		taken[messengerIndexByType(type, menu)] = true;
 	for (int i = MESSENGER_MENU_AIM; i < MESSENGER_MENU_JABBER; ++i)
 		if (!taken[i])
-			return messengerTypeByIndex(i);
-	return whenFull;
+			return messengerTypeByIndex(i, menu);
+	return menu.whenFull;
+}
+
+inline int nextMessengerType(const std::vector<int>& usedTypes, int whenFull = CONTACTS_MESSENGER_TYPE_JABBER)
+{
+	MessengerMenu menu = kContactMessengerMenu;
+	menu.whenFull = whenFull;
+	return nextMessengerType(usedTypes, menu);
 }
 
 } // namespace CtDataType

@@ -31,6 +31,15 @@ contacts_record_h child(contacts_record_h parent, unsigned prop, const char* uri
 	return c;
 }
 
+// A real date between 1950 and 2009, YYYYMMDD.
+int randomBirthday(std::mt19937& rng)
+{
+	int year = 1950 + static_cast<int>(rng() % 60);
+	int month = 1 + static_cast<int>(rng() % 12);
+	int day = 1 + static_cast<int>(rng() % 28);
+	return year * 10000 + month * 100 + day;
+}
+
 contacts_record_h randomContact(std::mt19937& rng, const std::vector<int>& groups, int extraChildren)
 {
 	auto pick = [&](auto& arr) { return arr[rng() % (sizeof(arr) / sizeof(arr[0]))]; };
@@ -59,7 +68,7 @@ contacts_record_h randomContact(std::mt19937& rng, const std::vector<int>& group
 	if (rng() % 10 < 3 || extraChildren) {
 		contacts_record_h ev = child(c, _contacts_contact.event, _contacts_event._uri);
 		contacts_record_set_int(ev, _contacts_event.type, CONTACTS_EVENT_TYPE_BIRTH);
-		contacts_record_set_int(ev, _contacts_event.date, 19500101 + static_cast<int>(rng() % 500000));
+		contacts_record_set_int(ev, _contacts_event.date, randomBirthday(rng));
 	}
 	if (!groups.empty() && rng() % 5 == 0) {
 		contacts_record_h r = child(c, _contacts_contact.group_relation, _contacts_group_relation._uri);
@@ -150,7 +159,39 @@ void generate(const std::string& dir, int persons)
 	contacts_disconnect();
 }
 
+// Bumped whenever the generator changes, so that an old cache is not reused.
+const char* kGeneratorVersion = "g2";
+
 } // namespace
+
+BenchDatabase::~BenchDatabase()
+{
+	if (dataDir.empty())
+		return;
+	std::error_code ec;
+	fs::remove_all(dataDir, ec);
+}
+
+BenchDatabase::BenchDatabase(BenchDatabase&& other) noexcept
+{
+	*this = std::move(other);
+}
+
+BenchDatabase& BenchDatabase::operator=(BenchDatabase&& other) noexcept
+{
+	if (this == &other)
+		return *this;
+	if (!dataDir.empty()) {
+		std::error_code ec;
+		fs::remove_all(dataDir, ec);
+	}
+	dataDir = std::move(other.dataDir);
+	dbPath = std::move(other.dbPath);
+	bigPersonId = other.bigPersonId;
+	persons = other.persons;
+	other.dataDir.clear();
+	return *this;
+}
 
 long residentBytes()
 {
@@ -167,7 +208,8 @@ long residentBytes()
 BenchDatabase ensureDatabase(int persons)
 {
 	const char* cacheEnv = getenv("CONTACTS_BENCH_CACHE");
-	fs::path cache = fs::path(cacheEnv ? cacheEnv : "/tmp/contacts-bench-cache") / ("persons-" + std::to_string(persons));
+	fs::path cache = fs::path(cacheEnv ? cacheEnv : "/tmp/contacts-bench-cache")
+		/ ("persons-" + std::to_string(persons) + "-" + kGeneratorVersion);
 	fs::path cached = cache / "contacts.db";
 	if (!fs::exists(cached)) {
 		fs::path building = cache.string() + ".building-" + std::to_string(getpid());

@@ -8,18 +8,28 @@
 
 namespace ct::bench {
 
+// A copy of the generated database in a fresh data folder, removed with the
+// object (moved, never copied).
 struct BenchDatabase {
 	std::string dataDir; // CONTACTS_DATA_DIR now points here
 	std::string dbPath;  // the contacts database file in it
 	int bigPersonId = 0; // a person of 10 linked contacts with over 100 child records
 	int persons = 0;
+
+	BenchDatabase() = default;
+	~BenchDatabase();
+	BenchDatabase(BenchDatabase&& other) noexcept;
+	BenchDatabase& operator=(BenchDatabase&& other) noexcept;
+	BenchDatabase(const BenchDatabase&) = delete;
+	BenchDatabase& operator=(const BenchDatabase&) = delete;
 };
 
 // Makes sure a database of `persons` persons exists in the cache folder
 // ($CONTACTS_BENCH_CACHE, else /tmp/contacts-bench-cache), generating it
 // when missing (names in several scripts, 1-3 numbers, e-mails, some
-// addresses, events and groups, 5% of the persons linked), then copies it
-// into a new data folder and points CONTACTS_DATA_DIR there.
+// addresses, birthdays and groups, 5% of the persons linked), then copies it
+// into a new data folder and points CONTACTS_DATA_DIR there. The copy is
+// removed when the returned object (usually a global) is destroyed.
 BenchDatabase ensureDatabase(int persons);
 
 // The id of the first contact whose person id compares to `personId` as

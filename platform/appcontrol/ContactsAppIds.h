@@ -12,6 +12,11 @@
 #define RINGTONE_PICKER_APP_ID "org.velmora.ringtone-picker"
 #define MESSAGE_COMPOSER_APP_ID "org.velmora.message-composer"
 #define FACEBOOK_APP_ID "org.velmora.facebook"
+/* The account settings application: lists accounts and adds one
+ * ("mode" = "add_account", "capability_filter" = a capability). */
+#define ACCOUNT_SETTINGS_APP_ID "settings-accounts"
+/* Capability of the accounts that store contacts. */
+#define ACCOUNT_SUPPORTS_CAPABILITY_CONTACT "http://velmora.org/accounts/capability/contact"
 
 /* Operation of a video call ("tel:" URI). */
 #define VIDEO_CALL_OPERATION "http://velmora.org/appcontrol/operation/vt"

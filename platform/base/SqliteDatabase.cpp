@@ -1,6 +1,7 @@
 #include "SqliteDatabase.h"
 #include "SqliteFaultInjector.h"
 
+#include <atomic>
 #include <cerrno>
 #include <utility>
 
@@ -9,6 +10,13 @@ namespace ct::db {
 namespace {
 
 constexpr int kBusyTimeoutMs = 5000;
+
+std::atomic<int64_t> g_statementsStarted{0};
+
+void countStatement()
+{
+	g_statementsStarted.fetch_add(1, std::memory_order_relaxed);
+}
 
 int openFlags(OpenMode mode)
 {
@@ -104,7 +112,11 @@ Statement& Statement::bindNull(int index)
 
 int Statement::step()
 {
-	return m_stmt ? sqlite3_step(m_stmt) : SQLITE_MISUSE;
+	if (!m_stmt)
+		return SQLITE_MISUSE;
+	if (!sqlite3_stmt_busy(m_stmt))
+		countStatement();
+	return sqlite3_step(m_stmt);
 }
 
 int Statement::run()
@@ -217,6 +229,7 @@ int Database::exec(const char* sql)
 {
 	if (!m_db)
 		return SQLITE_MISUSE;
+	countStatement();
 	return sqlite3_exec(m_db, sql, nullptr, nullptr, nullptr);
 }
 
@@ -237,8 +250,10 @@ int Database::changes() const
 
 int64_t Database::dataVersion() const
 {
-	Statement st(m_db, "PRAGMA data_version");
-	return st.step() == SQLITE_ROW ? st.columnInt64(0) : -1;
+	if (!m_db)
+		return -1;
+	CachedStatement st(cached("PRAGMA data_version"));
+	return st->step() == SQLITE_ROW ? st->columnInt64(0) : -1;
 }
 
 ReadSnapshot::ReadSnapshot(const Database& db)
@@ -282,6 +297,11 @@ int Transaction::commit()
 	}
 	m_open = false;
 	return rc;
+}
+
+int64_t statementsStarted()
+{
+	return g_statementsStarted.load(std::memory_order_relaxed);
 }
 
 int toErrno(int sqliteResult)

@@ -145,6 +145,11 @@ private:
 	bool m_open = false;
 };
 
+// Statements started by every connection of the process so far (each first
+// step after a prepare or reset, and each exec), to tell how much work an
+// operation costs the database.
+int64_t statementsStarted();
+
 // Maps an SQLite result to a negative errno-style code: 0, -28 (ENOSPC) for a
 // full disk, -13 (EACCES) for read-only or unopenable files, -16 (EBUSY) for
 // a locked database, -5 (EIO) otherwise.

@@ -1,6 +1,7 @@
 #include "ContactsConnection.h"
 
 #include "ContactsDebug.h"
+#include "ContactsSearchPlanner.h"
 #include "ContactsSim.h"
 #include "DataDir.h"
 #include "contacts_db.h"
@@ -65,6 +66,7 @@ int ContactsConnection::disconnect()
 ContactsConnection::~ContactsConnection()
 {
 	m_watcher.reset();
+	m_searchPlanner.reset();
 	m_db.close();
 }
 
@@ -141,6 +143,13 @@ db::Statement& ContactsConnection::statement(const std::string& sql)
 	return st;
 }
 
+ContactsSearchPlanner& ContactsConnection::searchPlanner()
+{
+	if (!m_searchPlanner)
+		m_searchPlanner = std::make_unique<ContactsSearchPlanner>(*this);
+	return *m_searchPlanner;
+}
+
 int ContactsConnection::failed(const char* what, int sqliteResult)
 {
 	WERROR("%s failed: %s (%d)", what, m_db.errorMessage().c_str(), sqliteResult);
@@ -165,19 +174,21 @@ int ContactsConnection::write(const std::function<int(WriteContext&)>& fn)
 	if (tx.status() != SQLITE_OK)
 		return failed("BEGIN", tx.status());
 	WriteContext ctx;
-	ctx.version = currentVersion() + 1;
 	{
-		CachedStatement st(statement("UPDATE meta SET value = ? WHERE key = 'version'"));
-		int rc = st->bind(1, ctx.version).run();
-		if (rc != SQLITE_DONE)
+		CachedStatement st(statement("UPDATE meta SET value = value + 1 WHERE key = 'version' RETURNING value"));
+		int rc = st->step();
+		if (rc != SQLITE_ROW)
+			return failed("version", rc);
+		ctx.version = st->columnInt(0);
+		if ((rc = st->step()) != SQLITE_DONE)
 			return failed("version", rc);
 	}
 	int err = fn(ctx);
 	if (err != CONTACTS_ERROR_NONE)
 		return err;
-	for (const std::string& uri : ctx.touchedViews) {
+	for (const std::string& key : ctx.touchedKeys) {
 		CachedStatement st(statement("INSERT OR REPLACE INTO view_versions(uri, version) VALUES (?, ?)"));
-		int rc = st->bind(1, uri).bind(2, ctx.version).run();
+		int rc = st->bind(1, key).bind(2, ctx.version).run();
 		if (rc != SQLITE_DONE)
 			return failed("view version", rc);
 	}
@@ -228,11 +239,12 @@ int ContactsConnection::removeChangedCb(const char* uri, contacts_db_changed_cb 
 
 void ContactsConnection::__dispatchChanges()
 {
-	std::vector<std::string> changed;
-	for (const auto& [uri, version] : __viewVersions()) {
-		if (version > m_seenVersions[uri])
-			changed.push_back(uri);
-		m_seenVersions[uri] = version;
+	std::set<std::string> changed;
+	for (const auto& [key, version] : __viewVersions()) {
+		if (version > m_seenVersions[key])
+			for (std::string& uri : ContactsSchema::urisOfChangeKey(key))
+				changed.insert(std::move(uri));
+		m_seenVersions[key] = version;
 	}
 	std::vector<Callback> pending;
 	for (const std::string& uri : changed)

@@ -22,10 +22,13 @@ using db::CachedStatement;
 // What one write transaction did; filled while it runs.
 struct WriteContext {
 	int version = 0;
-	std::set<std::string> touchedViews;
+	// Change keys (ContactsSchema::changeKeyOf) of the views written.
+	std::set<std::string> touchedKeys;
 	std::vector<std::function<void()>> onCommit;
-	void touch(const ViewInfo& v) { touchedViews.insert(v.uri); }
+	void touch(const ViewInfo& v) { touchedKeys.insert(ContactsSchema::changeKeyOf(v)); }
 };
+
+class ContactsSearchPlanner;
 
 // Maps an SQLite result to a CONTACTS_ERROR_* code.
 int contactsError(int sqliteResult);
@@ -53,7 +56,11 @@ public:
 	int write(const std::function<int(WriteContext&)>& fn);
 	int currentVersion();
 	int lastChangeVersion() const { return m_lastChangeVersion; }
+	// The stored setting; a write reads it once (ContactsWriter caches it).
 	int nameDisplayOrder();
+
+	// Lives as long as the connection, with what it learnt of the store.
+	ContactsSearchPlanner& searchPlanner();
 
 	int addChangedCb(const char* uri, contacts_db_changed_cb cb, void* userData);
 	int removeChangedCb(const char* uri, contacts_db_changed_cb cb, void* userData);
@@ -76,6 +83,7 @@ private:
 	std::vector<Callback> m_callbacks;
 	std::map<std::string, int64_t> m_seenVersions;
 	std::unique_ptr<db::StoreChangeWatcher> m_watcher;
+	std::unique_ptr<ContactsSearchPlanner> m_searchPlanner;
 	bool m_dispatching = false;
 	bool m_closeAfterDispatch = false;
 };

@@ -136,6 +136,22 @@ DisplayName ContactsPersons::displayNameOf(const contacts_record_s& record, int 
 	return d;
 }
 
+ContactSummary ContactsPersons::summaryOf(const contacts_record_s& contact, int order)
+{
+	ContactSummary s;
+	s.name = displayNameOf(contact, order);
+	s.hasNumber = !contact.children("number")->empty();
+	s.hasEmail = !contact.children("email")->empty();
+	const auto* images = contact.children("image");
+	const char* thumbnail = images->empty() ? nullptr : images->front()->getStr("path");
+	for (const contacts_record_s* image : *images)
+		if (image->getInt("is_default"))
+			thumbnail = image->getStr("path");
+	if (thumbnail)
+		s.thumbnail = thumbnail;
+	return s;
+}
+
 std::string ContactsPersons::indexOf(const std::string& displayName)
 {
 	if (displayName.empty())
@@ -156,6 +172,37 @@ int ContactsPersons::create(int* id)
 		return m_conn.failed("insert person", rc);
 	*id = static_cast<int>(m_conn.database().lastInsertRowId());
 	return CONTACTS_ERROR_NONE;
+}
+
+int ContactsPersons::createFor(const contacts_record_s& contact, const ContactSummary& summary, int* id,
+	int* displayContactId)
+{
+	// The contact row is written next, so its id is the next of the
+	// contacts' sequence (checked by the caller).
+	CachedStatement st(m_conn.statement("INSERT INTO persons(display_name, display_name_index, display_contact_id, "
+		"ringtone_path, image_thumbnail_path, vibration, message_alert, is_favorite, link_count, addressbook_ids, "
+		"has_phonenumber, has_email, image_id, changed_ver) VALUES (?, ?, "
+		"coalesce((SELECT seq FROM sqlite_sequence WHERE name = 'contacts'), 0) + 1, ?, ?, ?, ?, ?, 1, ?, ?, ?, 0, ?) "
+		"RETURNING id, display_contact_id"));
+	st->bind(1, summary.name.text).bind(2, indexOf(summary.name.text));
+	st->bind(3, contact.getStr("ringtone_path")).bind(4, summary.thumbnail ? summary.thumbnail->c_str() : nullptr);
+	st->bind(5, contact.getStr("vibration")).bind(6, contact.getStr("message_alert"));
+	st->bind(7, contact.getInt("is_favorite") ? 1 : 0).bind(8, std::to_string(contact.getInt("address_book_id")));
+	st->bind(9, summary.hasNumber ? 1 : 0).bind(10, summary.hasEmail ? 1 : 0).bind(11, m_ctx.version);
+	int rc = st->step();
+	if (rc != SQLITE_ROW)
+		return m_conn.failed("insert person", rc);
+	*id = st->columnInt(0);
+	*displayContactId = st->columnInt(1);
+	rc = st->step();
+	return rc == SQLITE_DONE ? CONTACTS_ERROR_NONE : m_conn.failed("insert person", rc);
+}
+
+int ContactsPersons::setDisplayContact(int personId, int contactId)
+{
+	CachedStatement st(m_conn.statement("UPDATE persons SET display_contact_id = ? WHERE id = ?"));
+	int rc = st->bind(1, contactId).bind(2, personId).run();
+	return rc == SQLITE_DONE ? CONTACTS_ERROR_NONE : m_conn.failed("update person", rc);
 }
 
 int ContactsPersons::__delete(int personId)

@@ -32,6 +32,16 @@ std::string quoted(const char* identifier);
 // The full-text phrase that matches `text` literally.
 std::string ftsPhrase(const std::string& text);
 
+// How a "person display name contains" condition finds its rows.
+struct ContainsPlan {
+	enum class Kind {
+		Walk,    // test every row the read walks
+		Phrase,  // narrow through the trigram index first
+		Matches, // narrow to rows already found through the index
+	} kind = Kind::Phrase;
+	std::string matchIds; // Matches: their ids as a JSON array
+};
+
 } // namespace ct::contacts
 
 struct contacts_filter_s {
@@ -48,9 +58,9 @@ struct contacts_filter_s {
 	const ct::contacts::ViewInfo* view = nullptr;
 	std::vector<Item> items;
 
-	// Whether a "display name contains" text should go through the trigram
-	// index; null means whenever the text allows it.
-	using IndexChoice = std::function<bool(const std::string& text)>;
+	// How a "display name contains" text that the trigram index can serve
+	// should find its rows; null means always through the index.
+	using IndexChoice = std::function<ct::contacts::ContainsPlan(const std::string& text)>;
 
 	// Appends "(...)" for this filter to sql; CONTACTS_ERROR_INVALID_PARAMETER
 	// when the filter is empty or ends with an operator.

@@ -2,18 +2,23 @@
 
 #include "ContactsDebug.h"
 #include "ContactsList.h"
+#include "ContactsSearchPlanner.h"
 #include "contacts_list.h"
+#include "contacts_views.h"
 
+#include <algorithm>
 #include <memory>
+#include <optional>
 
 namespace ct::contacts {
 
-void fillRecord(contacts_record_s& record, db::Statement& st, const std::vector<const PropertyInfo*>& props)
+void fillRecord(contacts_record_s& record, db::Statement& st, const std::vector<const PropertyInfo*>& props,
+	int firstColumn)
 {
 	for (size_t i = 0; i < props.size(); ++i) {
 		const PropertyInfo* p = props[i];
 		auto& v = record.values[p->slot];
-		int col = static_cast<int>(i);
+		int col = firstColumn + static_cast<int>(i);
 		v.set = true;
 		switch (p->type) {
 		case PropType::Str:
@@ -50,61 +55,81 @@ std::vector<int> ContactsReader::contactIdsOfPerson(int personId)
 	return ids;
 }
 
-int ContactsReader::loadChildren(contacts_record_s& record, int ownerId, int owner)
-{
-	for (const PropertyInfo& p : record.view->props) {
-		if (p.type != PropType::Record)
-			continue;
-		const ViewInfo& child = *p.child;
-		CachedStatement st(m_conn.statement(child.selectChildrenSql));
-		st->bind(1, ownerId).bind(2, owner);
-		int rc;
-		while ((rc = st->step()) == SQLITE_ROW) {
-			auto* c = new contacts_record_s(child);
-			fillRecord(*c, *st, child.columns);
-			c->parent = &record;
-			record.childLists[p.slot].push_back(c);
-		}
-		if (rc != SQLITE_DONE)
-			return m_conn.failed(child.table, rc);
-	}
-	return CONTACTS_ERROR_NONE;
-}
-
 int ContactsReader::readRecord(const ViewInfo& view, int id, contacts_record_s** out)
 {
 	*out = nullptr;
 	WPRET_VM(!view.findByName("id") || !view.readSource, CONTACTS_ERROR_INVALID_PARAMETER,
 		"records of %s cannot be read by id", view.uri);
 	WPRET_VM(id < 0, CONTACTS_ERROR_INVALID_PARAMETER, "Invalid param : id %d", id);
-	db::ReadSnapshot snapshot(m_conn.database());
 	auto record = std::make_unique<contacts_record_s>(view);
-	{
-		CachedStatement st(m_conn.statement(view.selectByIdSql));
-		int rc = st->bind(1, id).step();
-		if (rc == SQLITE_DONE)
-			return CONTACTS_ERROR_NO_DATA;
-		if (rc != SQLITE_ROW)
-			return m_conn.failed(view.uri, rc);
-		fillRecord(*record, *st, view.columns);
-	}
-	bool isProfile = view.number == kMyProfileView;
-	int err = loadChildren(*record, id, isProfile ? 1 : 0);
-	if (err != CONTACTS_ERROR_NONE)
-		return err;
-	*out = record.release();
+	int err = view.selectWithChildrenSql.empty() ? __readRow(*record, id) : __readWithChildren(*record, id);
+	if (err == CONTACTS_ERROR_NONE)
+		*out = record.release();
+	return err;
+}
+
+int ContactsReader::__readRow(contacts_record_s& record, int id)
+{
+	const ViewInfo& view = *record.view;
+	CachedStatement st(m_conn.statement(view.selectByIdSql));
+	int rc = st->bind(1, id).step();
+	if (rc == SQLITE_DONE)
+		return CONTACTS_ERROR_NO_DATA;
+	if (rc != SQLITE_ROW)
+		return m_conn.failed(view.uri, rc);
+	fillRecord(record, *st, view.columns);
 	return CONTACTS_ERROR_NONE;
 }
 
-contacts_filter_s::IndexChoice ContactsReader::__indexChoiceForLimit(int limit)
+int ContactsReader::__readWithChildren(contacts_record_s& record, int id)
+{
+	const ViewInfo& view = *record.view;
+	std::vector<const PropertyInfo*> parts;
+	for (const PropertyInfo& p : view.props)
+		if (p.type == PropType::Record)
+			parts.push_back(&p);
+	// One statement reads one state of the file: no transaction is needed.
+	CachedStatement st(m_conn.statement(view.selectWithChildrenSql));
+	st->bind(1, id).bind(2, view.number == kMyProfileView ? 1 : 0);
+	bool found = false;
+	int rc;
+	while ((rc = st->step()) == SQLITE_ROW) {
+		size_t part = static_cast<size_t>(st->columnInt(ViewInfo::kPartColumn));
+		if (part == 0) {
+			fillRecord(record, *st, view.columns, ViewInfo::kFirstValueColumn);
+			found = true;
+		} else if (part <= parts.size()) {
+			const PropertyInfo& p = *parts[part - 1];
+			auto* c = new contacts_record_s(*p.child);
+			fillRecord(*c, *st, p.child->columns, ViewInfo::kFirstValueColumn);
+			c->parent = &record;
+			record.childLists[p.slot].push_back(c);
+		}
+	}
+	if (rc != SQLITE_DONE)
+		return m_conn.failed(view.uri, rc);
+	for (const PropertyInfo* p : parts) {
+		auto& list = record.childLists[p->slot];
+		std::stable_sort(list.begin(), list.end(), [](const contacts_record_s* a, const contacts_record_s* b) {
+			return a->getInt64("id") < b->getInt64("id");
+		});
+	}
+	return found ? CONTACTS_ERROR_NONE : CONTACTS_ERROR_NO_DATA;
+}
+
+contacts_filter_s::IndexChoice ContactsReader::__indexChoice(const contacts_query_s* query, int offset, int limit)
 {
 	if (limit <= 0)
 		return nullptr;
-	return [this](const std::string& text) {
-		const int kRareMatches = 500;
-		CachedStatement st(m_conn.statement("SELECT count(*) FROM (SELECT rowid FROM persons_fts WHERE persons_fts "
-			"MATCH ? LIMIT 501)"));
-		return st->bind(1, ftsPhrase(text)).step() == SQLITE_ROW && st->columnInt(0) < kRareMatches;
+	using Order = ContactsSearchPlanner::Order;
+	Order order = Order::Rowid;
+	if (query && !query->sort.empty()) {
+		bool byName = query->sort.front().first->id == _contacts_person.display_name;
+		order = !byName ? Order::Other : query->sort.front().second ? Order::NameAscending : Order::NameDescending;
+	}
+	ContactsSearchPlanner& planner = m_conn.searchPlanner();
+	return [&planner, order, wanted = offset + limit](const std::string& text) {
+		return planner.choose(text, wanted, order);
 	};
 }
 
@@ -137,7 +162,16 @@ int ContactsReader::readList(const ViewInfo& view, const contacts_query_s* query
 	std::string sql = std::string("SELECT ") + (query && query->distinct ? "DISTINCT " : "") + cols + " FROM "
 		+ view.readSource;
 	std::vector<SqlParam> params;
-	int err = __where(view, query, sql, params, __indexChoiceForLimit(limit));
+	// A planned read sees one state of the file from planning to reading,
+	// and takes the read lock once.
+	std::optional<db::ReadSnapshot> snapshot;
+	contacts_filter_s::IndexChoice plan = __indexChoice(query, offset, limit);
+	contacts_filter_s::IndexChoice choice = !plan ? plan : [&](const std::string& text) {
+		if (!snapshot)
+			snapshot.emplace(m_conn.database());
+		return plan(text);
+	};
+	int err = __where(view, query, sql, params, choice);
 	if (err != CONTACTS_ERROR_NONE)
 		return err;
 	if (query && !query->sort.empty()) {

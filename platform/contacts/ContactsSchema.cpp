@@ -3,6 +3,7 @@
 #include "contacts_types.h"
 #include "contacts_views.h"
 
+#include <algorithm>
 #include <cstring>
 #include <map>
 #include <memory>
@@ -87,6 +88,34 @@ struct Registry {
 
 bool accessIsReadOnly(const char* access) { return strcmp(access, "RO") == 0; }
 
+std::string columnList(const ViewInfo& view, size_t width)
+{
+	std::string cols;
+	for (const PropertyInfo* p : view.columns)
+		cols += ", \"" + std::string(p->name) + "\"";
+	for (size_t i = view.columns.size(); i < width; ++i)
+		cols += ", NULL";
+	return cols;
+}
+
+// See ViewInfo::selectWithChildrenSql. The id is repeated as column 1. An
+// ORDER BY would sort every part in a temporary tree; the reader orders the
+// few rows itself.
+std::string selectWithChildren(const ViewInfo& view, const std::vector<const ViewInfo*>& children)
+{
+	size_t width = view.columns.size();
+	for (const ViewInfo* child : children)
+		width = std::max(width, child->columns.size());
+	std::string sql = "SELECT 0, id" + columnList(view, width) + " FROM " + view.readSource + " WHERE id = ?1";
+	if (view.baseWhere)
+		sql += std::string(" AND ") + view.baseWhere;
+	for (size_t i = 0; i < children.size(); ++i) {
+		sql += " UNION ALL SELECT " + std::to_string(i + 1) + ", id" + columnList(*children[i], width) + " FROM "
+			+ children[i]->readSource + " WHERE contact_id = ?1 AND owner = ?2";
+	}
+	return sql;
+}
+
 Registry::Registry()
 {
 	std::map<std::string, const char*> uriOfViewName;
@@ -115,13 +144,17 @@ Registry::Registry()
 		view->selectByIdSql = view->selectSql + " WHERE id = ?";
 		if (view->baseWhere)
 			view->selectByIdSql += std::string(" AND ") + view->baseWhere;
-		view->selectChildrenSql = view->selectSql + " WHERE contact_id = ? AND owner = ? ORDER BY id";
 		for (PropertyInfo& p : view->props) {
 			if (p.type != PropType::Record)
 				continue;
 			p.child = byUri[uriOfViewName[p.childViewName]];
 			children[view.get()].push_back(p.child);
 		}
+	}
+	for (auto& [number, view] : byNumber) {
+		auto kids = children.find(view.get());
+		if (kids != children.end())
+			view->selectWithChildrenSql = selectWithChildren(*view, kids->second);
 	}
 }
 
@@ -171,7 +204,38 @@ const std::vector<const ViewInfo*>& ContactsSchema::childViews(const ViewInfo& p
 	return it == r.children.end() ? none : it->second;
 }
 
-const char* ContactsSchema::schemaTag() { return "contacts-service/3"; }
+namespace {
+
+const char* kContactFamilyKey = "contacts.view.contact+children";
+
+bool isContactFamily(const ViewInfo& view)
+{
+	if (view.number == kPersonView || view.number == kSimpleContactView || view.number == kContactView)
+		return true;
+	const auto& kids = ContactsSchema::childViews(*ContactsSchema::view("contacts.view.contact"));
+	return std::find(kids.begin(), kids.end(), &view) != kids.end();
+}
+
+} // namespace
+
+std::string ContactsSchema::changeKeyOf(const ViewInfo& view)
+{
+	return isContactFamily(view) ? kContactFamilyKey : view.uri;
+}
+
+std::vector<std::string> ContactsSchema::urisOfChangeKey(const std::string& key)
+{
+	if (key != kContactFamilyKey) {
+		const ViewInfo* v = view(key.c_str());
+		return v ? std::vector<std::string>{ v->uri } : std::vector<std::string>{};
+	}
+	std::vector<std::string> uris = { "contacts.view.person", "contacts.view.simple_contact", "contacts.view.contact" };
+	for (const ViewInfo* child : childViews(*view("contacts.view.contact")))
+		uris.push_back(child->uri);
+	return uris;
+}
+
+const char* ContactsSchema::schemaTag() { return "contacts-service/4"; }
 
 namespace {
 
@@ -186,15 +250,23 @@ namespace {
 
 const char* ContactsSchema::upgradeSql(const std::string& fromTag)
 {
+	// The built-in books were named like their providers before tag 4.
+#define CT_RENAME_BUILT_IN_BOOKS \
+	"UPDATE address_books SET name = '" CONTACTS_PHONE_ADDRESS_BOOK_NAME "' WHERE id = 0 AND name = 'Phone';\n" \
+	"UPDATE address_books SET name = '" CONTACTS_SIM1_ADDRESS_BOOK_NAME "' WHERE account_id = 0 AND name = 'SIM1';\n" \
+	"UPDATE address_books SET name = '" CONTACTS_SIM2_ADDRESS_BOOK_NAME "' WHERE account_id = 0 AND name = 'SIM2';\n"
 	if (fromTag == "contacts-service/1")
 		return R"SQL(
 CREATE TABLE profiles(id INTEGER PRIMARY KEY, contact_id INTEGER, owner INTEGER DEFAULT 0, type INTEGER DEFAULT 0,
 	label TEXT, uid TEXT, text TEXT, service_operation TEXT, mime TEXT, app_id TEXT, uri TEXT, category TEXT,
 	extra_data TEXT);
 CREATE INDEX profiles_contact ON profiles(contact_id, owner);
-)SQL" CT_IMAGES_VIEW_SQL;
+)SQL" CT_IMAGES_VIEW_SQL CT_RENAME_BUILT_IN_BOOKS;
 	if (fromTag == "contacts-service/2")
-		return CT_IMAGES_VIEW_SQL;
+		return CT_IMAGES_VIEW_SQL CT_RENAME_BUILT_IN_BOOKS;
+	if (fromTag == "contacts-service/3")
+		return CT_RENAME_BUILT_IN_BOOKS;
+#undef CT_RENAME_BUILT_IN_BOOKS
 	return nullptr;
 }
 
@@ -285,9 +357,10 @@ CREATE INDEX contact_changes_version ON contact_changes(version);
 CREATE TABLE phone_logs(id INTEGER PRIMARY KEY, person_id INTEGER DEFAULT 0, address TEXT, log_time INTEGER DEFAULT 0,
 	log_type INTEGER DEFAULT 0, extra_data1 INTEGER DEFAULT 0, extra_data2 TEXT);
 CREATE TABLE emergencies(id INTEGER PRIMARY KEY, person_id INTEGER, number_id INTEGER, value INTEGER DEFAULT 0);
-INSERT INTO address_books(id, account_id, name, mode, provider_name) VALUES (0, 0, 'Phone', 0, 'Phone');
 INSERT INTO meta(key, value) VALUES ('version', 0), ('name_display_order', 0);
-)SQL";
+)SQL"
+	"INSERT INTO address_books(id, account_id, name, mode, provider_name) VALUES (0, 0, '"
+	CONTACTS_PHONE_ADDRESS_BOOK_NAME "', 0, '" CONTACTS_PHONE_PROVIDER_NAME "');\n";
 }
 
 } // namespace ct::contacts

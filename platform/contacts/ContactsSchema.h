@@ -47,7 +47,13 @@ struct ViewInfo {
 	std::vector<const PropertyInfo*> columns; // every non-record property
 	std::string selectSql;                    // SELECT <columns> FROM readSource
 	std::string selectByIdSql;                // ... WHERE id = ? [AND baseWhere]
-	std::string selectChildrenSql;            // ... WHERE contact_id = ? AND owner = ? ORDER BY id
+	// For views with child records: the record (part 0) and its children
+	// (part i: the i-th record property) in one statement, rows in no set
+	// order. Columns: part, id, then the part's columns padded with NULLs; ?1
+	// is the id, ?2 the owner kind of the children.
+	std::string selectWithChildrenSql;
+	static constexpr int kPartColumn = 0;
+	static constexpr int kFirstValueColumn = 2;
 };
 
 class ContactsSchema {
@@ -58,6 +64,11 @@ public:
 	static const ViewInfo* viewOf(unsigned propertyId);
 	// The child views of contacts (and of my profile) in load order.
 	static const std::vector<const ViewInfo*>& childViews(const ViewInfo& parent);
+	// The key under which changes of a view are versioned. Contacts, persons
+	// and the children of contacts always change together and share one key.
+	static std::string changeKeyOf(const ViewInfo& view);
+	// The view URIs whose changes a stored key stands for (none when unknown).
+	static std::vector<std::string> urisOfChangeKey(const std::string& key);
 	// SQL that creates every table, index, trigger and default row.
 	static const char* createSql();
 	// SQL that brings a database of an older schema tag to the current one,

@@ -48,6 +48,11 @@ const char* ContactsSim::bookName(int slotNo)
 	return slotNo == 0 ? CONTACTS_SIM1_ADDRESS_BOOK_NAME : CONTACTS_SIM2_ADDRESS_BOOK_NAME;
 }
 
+const char* ContactsSim::providerName(int slotNo)
+{
+	return slotNo == 0 ? CONTACTS_SIM1_PROVIDER_NAME : CONTACTS_SIM2_PROVIDER_NAME;
+}
+
 ContactsSim::Slot ContactsSim::slot(int slotNo)
 {
 	Slot s;
@@ -59,7 +64,7 @@ ContactsSim::Slot ContactsSim::slot(int slotNo)
 		s.present = slotNo == 0;
 		return s;
 	}
-	const char* group = bookName(slotNo);
+	const char* group = providerName(slotNo);
 	s.present = g_key_file_has_group(file.get(), group) && readInt(file.get(), group, "present", 1) != 0;
 	s.capacity = readInt(file.get(), group, "capacity", s.capacity);
 	s.nameMax = readInt(file.get(), group, "name_max", s.nameMax);
@@ -98,7 +103,7 @@ int ContactsSim::ensureAddressBooks(ContactsConnection& conn)
 		db::Transaction tx(conn.database());
 		CachedStatement st(conn.statement(
 			"INSERT INTO address_books(account_id, name, mode, provider_name) VALUES (0, ?, 0, ?)"));
-		int rc = st->bind(1, bookName(i)).bind(2, bookName(i)).run();
+		int rc = st->bind(1, bookName(i)).bind(2, providerName(i)).run();
 		if (rc != SQLITE_DONE)
 			return conn.failed("SIM address book", rc);
 		rc = tx.commit();

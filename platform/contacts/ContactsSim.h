@@ -31,6 +31,8 @@ public:
 	// The slot of an address book id, or -1 when it is not a SIM book.
 	static int slotOf(ContactsConnection& conn, int addressBookId);
 	static const char* bookName(int slotNo);
+	// "SIM1" or "SIM2": the book's provider name and the slot's group in sim.conf.
+	static const char* providerName(int slotNo);
 };
 
 } // namespace ct::contacts

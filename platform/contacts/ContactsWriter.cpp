@@ -58,9 +58,32 @@ std::string cleanedNumber(const char* number)
 	return out;
 }
 
-bool isContactOwned(const ViewInfo& v) { return v.isChild; }
+SqlParam optionalText(const std::optional<std::string>& s)
+{
+	SqlParam p;
+	p.kind = s ? SqlParam::Kind::Text : SqlParam::Kind::Null;
+	if (s)
+		p.text = *s;
+	return p;
+}
 
-bool isImageTable(const ViewInfo& v) { return strcmp(v.table, "images") == 0; }
+// A new contact of a new person: its first number and first e-mail become the
+// defaults unless the record names one.
+std::set<const contacts_record_s*> firstChildrenAsDefaults(const contacts_record_s& contact)
+{
+	std::set<const contacts_record_s*> out;
+	for (const char* prop : { "number", "email" }) {
+		const auto* list = contact.children(prop);
+		bool named = false;
+		for (const contacts_record_s* c : *list)
+			named |= c->getInt("is_default") != 0;
+		if (!named && !list->empty())
+			out.insert(list->front());
+	}
+	return out;
+}
+
+bool isContactOwned(const ViewInfo& v) { return v.isChild; }
 
 } // namespace
 
@@ -157,8 +180,25 @@ int ContactsWriter::__checkChild(const ViewInfo& view, const contacts_record_s& 
 	return CONTACTS_ERROR_NONE;
 }
 
-int ContactsWriter::__writeChildren(contacts_record_s& record, int ownerId, int owner, bool replace)
+void ContactsWriter::__numberImageOrder(contacts_record_s& record)
 {
+	// Pictures keep their place in the picture order: one stored without an
+	// order takes its position among the contact's.
+	auto* images = record.children("image");
+	if (!images)
+		return;
+	int position = 0;
+	for (contacts_record_s* image : *images) {
+		++position;
+		if (image->getInt("order") <= 0)
+			image->setInt("order", position);
+	}
+}
+
+int ContactsWriter::__writeChildren(contacts_record_s& record, int ownerId, int owner, bool replace,
+	const std::set<const contacts_record_s*>& defaults)
+{
+	__numberImageOrder(record);
 	for (const PropertyInfo& p : record.view->props) {
 		if (p.type != PropType::Record)
 			continue;
@@ -172,17 +212,13 @@ int ContactsWriter::__writeChildren(contacts_record_s& record, int ownerId, int 
 				stored.insert(st->columnInt(0));
 		}
 		std::set<int> kept;
-		int position = 0;
 		for (contacts_record_s* c : record.childLists[p.slot]) {
 			int err = __checkChild(child, *c);
 			if (err != CONTACTS_ERROR_NONE)
 				return err;
-			++position;
-			// Pictures keep their place in the picture order: one stored
-			// without an order takes its position among the contact's.
-			if (isImageTable(child) && c->getInt("order") <= 0)
-				c->setInt("order", position);
 			Extra extra = { { "contact_id", intParam(ownerId) }, { "owner", intParam(owner) } };
+			if (defaults.count(c))
+				extra.push_back({ "is_default", intParam(1) });
 			int id = c->getInt("id");
 			if (stored.count(id) && !kept.count(id)) {
 				bool found = false;
@@ -250,16 +286,11 @@ int ContactsWriter::touchContact(int contactId, contacts_changed_e change)
 	if (err != CONTACTS_ERROR_NONE)
 		return err;
 	std::unique_ptr<contacts_record_s> record(raw);
-	DisplayName name = ContactsPersons::displayNameOf(*record, m_conn.nameDisplayOrder());
-	const auto* images = record->children("image");
-	const char* thumbnail = images->empty() ? nullptr : images->front()->getStr("path");
-	for (const contacts_record_s* image : *images)
-		if (image->getInt("is_default"))
-			thumbnail = image->getStr("path");
+	ContactSummary summary = ContactsPersons::summaryOf(*record, __nameOrder());
 	CachedStatement st(m_conn.statement("UPDATE contacts SET display_name = ?, display_source_type = ?, "
 		"has_phonenumber = ?, has_email = ?, image_thumbnail_path = ?, changed_time = ?, changed_ver = ? WHERE id = ?"));
-	st->bind(1, name.text).bind(2, name.source).bind(3, record->children("number")->empty() ? 0 : 1);
-	st->bind(4, record->children("email")->empty() ? 0 : 1).bind(5, thumbnail);
+	st->bind(1, summary.name.text).bind(2, summary.name.source).bind(3, summary.hasNumber ? 1 : 0);
+	st->bind(4, summary.hasEmail ? 1 : 0).bind(5, summary.thumbnail ? summary.thumbnail->c_str() : nullptr);
 	st->bind(6, static_cast<int64_t>(time(nullptr))).bind(7, m_ctx.version).bind(8, contactId);
 	int rc = st->run();
 	if (rc != SQLITE_DONE)
@@ -273,21 +304,41 @@ int ContactsWriter::touchContact(int contactId, contacts_changed_e change)
 	return err;
 }
 
+int ContactsWriter::__nameOrder()
+{
+	if (m_nameOrder < 0)
+		m_nameOrder = m_conn.nameDisplayOrder();
+	return m_nameOrder;
+}
+
+// A new contact founds its own person. Everything both rows derive is taken
+// from the record in memory, so each row is written once and nothing is read
+// back.
 int ContactsWriter::__insertContact(contacts_record_s& record, int* id)
 {
 	static const ViewInfo* books = ContactsSchema::view("contacts.view.address_book");
 	int book = record.getInt("address_book_id");
 	WPRET_VM(!m_reader.exists(*books, book), CONTACTS_ERROR_INVALID_PARAMETER, "no address book %d", book);
-	int personId = 0;
-	int err = m_persons.create(&personId);
-	if (err == CONTACTS_ERROR_NONE)
-		err = __insertRow(*record.view, record, { { "person_id", intParam(personId) } }, id);
-	if (err == CONTACTS_ERROR_NONE)
-		err = __writeChildren(record, *id, 0, false);
-	if (err == CONTACTS_ERROR_NONE)
-		err = touchContact(*id, CONTACTS_CHANGE_INSERTED);
+	__numberImageOrder(record);
+	ContactSummary summary = ContactsPersons::summaryOf(record, __nameOrder());
+	int personId = 0, expectedId = 0;
+	int err = m_persons.createFor(record, summary, &personId, &expectedId);
 	if (err != CONTACTS_ERROR_NONE)
 		return err;
+	Extra extra = { { "person_id", intParam(personId) }, { "display_name", textParam(summary.name.text) },
+		{ "display_source_type", intParam(summary.name.source) }, { "has_phonenumber", intParam(summary.hasNumber) },
+		{ "has_email", intParam(summary.hasEmail) }, { "image_thumbnail_path", optionalText(summary.thumbnail) },
+		{ "changed_time", intParam(time(nullptr)) }, { "changed_ver", intParam(m_ctx.version) } };
+	err = __insertRow(*record.view, record, extra, id);
+	if (err == CONTACTS_ERROR_NONE && *id != expectedId)
+		err = m_persons.setDisplayContact(personId, *id);
+	if (err == CONTACTS_ERROR_NONE)
+		err = __writeChildren(record, *id, 0, false, firstChildrenAsDefaults(record));
+	if (err == CONTACTS_ERROR_NONE)
+		err = __logChange(*id, CONTACTS_CHANGE_INSERTED, book);
+	if (err != CONTACTS_ERROR_NONE)
+		return err;
+	__touchContactViews();
 	contacts_record_s* r = &record;
 	m_ctx.onCommit.push_back([r, personId]() { r->setInt("person_id", personId); });
 	return __setIdAfterCommit(record, *id);
@@ -340,7 +391,7 @@ int ContactsWriter::__deleteContact(int id)
 
 int ContactsWriter::__insertProfile(contacts_record_s& record, int* id)
 {
-	DisplayName name = ContactsPersons::displayNameOf(record, m_conn.nameDisplayOrder());
+	DisplayName name = ContactsPersons::displayNameOf(record, __nameOrder());
 	int err = __insertRow(*record.view, record, { { "display_name", textParam(name.text) } }, id);
 	if (err == CONTACTS_ERROR_NONE)
 		err = __writeChildren(record, *id, 1, false);
@@ -350,7 +401,7 @@ int ContactsWriter::__insertProfile(contacts_record_s& record, int* id)
 
 int ContactsWriter::__updateProfile(contacts_record_s& record)
 {
-	DisplayName name = ContactsPersons::displayNameOf(record, m_conn.nameDisplayOrder());
+	DisplayName name = ContactsPersons::displayNameOf(record, __nameOrder());
 	int id = record.getInt("id");
 	bool found = false;
 	int err = __updateRow(*record.view, record, { { "display_name", textParam(name.text) } }, id, &found);

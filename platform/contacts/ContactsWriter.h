@@ -7,6 +7,7 @@
 #include "ContactsReader.h"
 #include "ContactsRecord.h"
 
+#include <set>
 #include <string>
 #include <utility>
 #include <vector>
@@ -38,7 +39,12 @@ private:
 	int __insertRow(const ViewInfo& view, const contacts_record_s& record, const Extra& extra, int* id);
 	int __updateRow(const ViewInfo& view, const contacts_record_s& record, const Extra& extra, int id, bool* found);
 	int __run(const char* sql, std::initializer_list<int> values);
-	int __writeChildren(contacts_record_s& record, int ownerId, int owner, bool replace);
+	// defaults: children stored as their contact's default whatever they hold.
+	int __writeChildren(contacts_record_s& record, int ownerId, int owner, bool replace,
+		const std::set<const contacts_record_s*>& defaults = {});
+	void __numberImageOrder(contacts_record_s& record);
+	// The name display order setting, read once per write.
+	int __nameOrder();
 	int __checkChild(const ViewInfo& view, const contacts_record_s& child);
 	int __insertContact(contacts_record_s& record, int* id);
 	int __updateContact(contacts_record_s& record);
@@ -66,6 +72,7 @@ private:
 	WriteContext& m_ctx;
 	ContactsReader m_reader;
 	ContactsPersons m_persons;
+	int m_nameOrder = -1;
 };
 
 } // namespace ct::contacts

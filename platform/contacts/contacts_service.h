@@ -29,8 +29,8 @@ int contacts_sim_is_ready(int sim_slot_no, bool *is_ready);
 int contacts_sim_get_field_text_max_len(int sim_slot_no, contacts_sim_field_e field, int *max_len);
 int contacts_sim_get_unused_field_count(int sim_slot_no, contacts_sim_field_e field, int *count);
 int contacts_sim_get_field_status(int sim_slot_no, contacts_sim_field_e field, bool *supported);
-/* Stores a contact record whose address_book_id is a SIM book ("SIM1",
- * "SIM2"): first name, first number, first e-mail. Texts longer than the SIM
+/* Stores a contact record whose address_book_id is a SIM slot's book: first
+ * name, first number, first e-mail. Texts longer than the SIM
  * takes: INVALID_PARAMETER; SIM full: FILE_NO_SPACE; not ready: NOT_SUPPORTED. */
 int contacts_sim_insert(contacts_record_h contact, int *contact_id);
 int contacts_sim_update(contacts_record_h contact);

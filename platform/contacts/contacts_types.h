@@ -238,10 +238,32 @@ typedef enum {
 	CONTACTS_RINGTONE_KIND_GROUP = 2
 } contacts_ringtone_kind_e;
 
-/* Names of the built-in address books. */
-#define CONTACTS_PHONE_ADDRESS_BOOK_NAME "Phone"
-#define CONTACTS_SIM1_ADDRESS_BOOK_NAME "SIM1"
-#define CONTACTS_SIM2_ADDRESS_BOOK_NAME "SIM2"
+/* Address-book naming. An address book has two texts:
+ *
+ * - its name (_contacts_address_book.name) says what kind of storage it is.
+ *   The built-in books are named under CONTACTS_ADDRESS_BOOK_NAME_PREFIX:
+ *   ".../addressbook/phone" (book 0, the device), ".../addressbook/sim1" and
+ *   ".../addressbook/sim2" (one per SIM slot) and ".../addressbook/sim" (a
+ *   SIM without slot). An account's book is named after the account (its
+ *   user name, such as "someone@example.com") and never contains
+ *   "addressbook/phone" or "addressbook/sim": a contact in such a book is
+ *   synced to an account. Names are what preferences store
+ *   ("input_base_addressbook"), since they do not change with the language.
+ * - its provider name (_contacts_address_book.provider_name) says who
+ *   provides it, as lists show it: the account's provider ("Google",
+ *   "Exchange", ...), "SIM1", "SIM2" and "SIM" for the SIM books, and
+ *   CONTACTS_PHONE_PROVIDER_NAME for the device book, which the common
+ *   library shows as the translated "IDS_PB_OPT_DEVICE".
+ */
+#define CONTACTS_ADDRESS_BOOK_NAME_PREFIX "http://velmora.org/addressbook/"
+#define CONTACTS_PHONE_ADDRESS_BOOK_NAME CONTACTS_ADDRESS_BOOK_NAME_PREFIX "phone"
+#define CONTACTS_SIM_ADDRESS_BOOK_NAME CONTACTS_ADDRESS_BOOK_NAME_PREFIX "sim"
+#define CONTACTS_SIM1_ADDRESS_BOOK_NAME CONTACTS_SIM_ADDRESS_BOOK_NAME "1"
+#define CONTACTS_SIM2_ADDRESS_BOOK_NAME CONTACTS_SIM_ADDRESS_BOOK_NAME "2"
+#define CONTACTS_PHONE_PROVIDER_NAME "Phone"
+#define CONTACTS_SIM_PROVIDER_NAME "SIM"
+#define CONTACTS_SIM1_PROVIDER_NAME "SIM1"
+#define CONTACTS_SIM2_PROVIDER_NAME "SIM2"
 
 /* Runs on the EFL main loop after a write to `view_uri` committed. */
 typedef void (*contacts_db_changed_cb)(const char *view_uri, void *user_data);

@@ -524,6 +524,9 @@ void CtDetailData::setRingtone(const char* path)
 char* CtDetailData::getImagePath(int order)
 {
 	WPRET_VM(order < 1 || order > 5, nullptr, "Invalid Param : order : %d", order);
+	// A directory entry has no image records: its one picture is its own.
+	if (m_personId == kGalPersonId)
+		return order == 1 && !isEmpty(m_thumbnailPath) ? strdup(m_thumbnailPath) : nullptr;
 	const char* path = nullptr;
 	Eina_List* l = nullptr;
 	void* data = nullptr;

@@ -1170,9 +1170,9 @@ int CtInputData::__simSlot()
 {
 	if (!m_addressbookName)
 		return -1;
-	if (!strcmp(m_addressbookName, SIM_ADDRESSBOOK_NAME) || !strcmp(m_addressbookName, CONTACTS_SIM1_ADDRESS_BOOK_NAME))
+	if (!strcmp(m_addressbookName, CONTACTS_SIM_PROVIDER_NAME) || !strcmp(m_addressbookName, CONTACTS_SIM1_PROVIDER_NAME))
 		return 0;
-	return strcmp(m_addressbookName, CONTACTS_SIM2_ADDRESS_BOOK_NAME) ? -1 : 1;
+	return strcmp(m_addressbookName, CONTACTS_SIM2_PROVIDER_NAME) ? -1 : 1;
 }
 
 int CtInputData::getSimNo() { return __simSlot() + 1; }

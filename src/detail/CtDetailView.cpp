@@ -177,6 +177,7 @@ CtDetailView::CtDetailView(CtLaunchRequest* request)
 	WENTER();
 	__initialize(request);
 	__createData(personIdFromRequest(request));
+	__listenToPowerSaving();
 }
 
 CtDetailView::CtDetailView(int personId, CtLaunchRequest* request)
@@ -184,20 +185,22 @@ CtDetailView::CtDetailView(int personId, CtLaunchRequest* request)
 	WENTER();
 	__initialize(request);
 	__createData(personId);
+	__listenToPowerSaving();
 }
 
 CtDetailView::CtDetailView(const CtGalSearchData* galData)
 {
 	WENTER();
 	__initialize(nullptr);
-	if (!galData) {
+	if (galData) {
+		m_galData = galData;
+		m_detailData.reset(new CtDetailData(galData));
+		m_isSimContact = m_detailData->isSimContact();
+	} else {
 		WERROR("Invalid param : galData");
 		__createData(0);
-		return;
 	}
-	m_galData = galData;
-	m_detailData.reset(new CtDetailData(galData));
-	m_isSimContact = m_detailData->isSimContact();
+	__listenToPowerSaving();
 }
 
 CtDetailView::~CtDetailView()
@@ -250,12 +253,18 @@ const char* CtDetailView::getClassName()
 void CtDetailView::__initialize(CtLaunchRequest* request)
 {
 	m_request = request;
-	CtRegistryMgr::getInstance()->registerVconfChangedCb(VCONFKEY_SETAPPL_PSMODE, __powerSavingModeChangedCb, this);
 	int powerSaving = 0;
 	int err = vconf_get_int(VCONFKEY_SETAPPL_PSMODE, &powerSaving);
 	if (err != VCONF_OK)
 		WWARNING("vconf_get_int() Failed(%d)", err);
 	m_isPowerSaving = powerSaving != 0;
+}
+
+// Last in every constructor: a constructor that throws runs no destructor,
+// which would leave the listener with a dead screen.
+void CtDetailView::__listenToPowerSaving()
+{
+	CtRegistryMgr::getInstance()->registerVconfChangedCb(VCONFKEY_SETAPPL_PSMODE, __powerSavingModeChangedCb, this);
 }
 
 void CtDetailView::__createData(int personId)
@@ -489,17 +498,21 @@ CtDetailViewGenlistItem* CtDetailView::__makeSingleItem(int kind)
 	}
 }
 
-// Adds the row at `index` of `list`; false (adding nothing) once the list is done.
+// Adds the row of the next record from `index` of `list` that gets one (a
+// maker returns null for a record with nothing to show); false (adding
+// nothing) once the list is done.
 bool CtDetailView::__addListItem(Eina_List* list, int& index, int& budget,
 		CtDetailViewGenlistItem* (CtDetailView::*make)(contacts_record_h))
 {
-	auto* record = static_cast<contacts_record_h>(eina_list_nth(list, index));
-	if (!record)
-		return false;
-	++index;
-	__appendItem((this->*make)(record));
-	--budget;
-	return true;
+	while (auto* record = static_cast<contacts_record_h>(eina_list_nth(list, index))) {
+		++index;
+		if (CtDetailViewGenlistItem* row = (this->*make)(record)) {
+			__appendItem(row);
+			--budget;
+			return true;
+		}
+	}
+	return false;
 }
 
 Elm_Object_Item* CtDetailView::__appendItem(CtDetailViewGenlistItem* row)
@@ -556,6 +569,8 @@ CtDetailViewGenlistItem* CtDetailView::__makeRelationItem(contacts_record_h reco
 
 CtDetailViewGenlistItem* CtDetailView::__makeEventItem(contacts_record_h record)
 {
+	if (!CtDetailViewEventItem::hasCalendarDate(m_detailData.get(), record))
+		return nullptr;
 	return new CtDetailViewEventItem(m_detailData.get(), record);
 }
 
@@ -599,20 +614,27 @@ void CtDetailView::__updateTitle()
 	elm_object_item_part_text_set(naviItem, "elm.text.title", title.c_str());
 
 	std::string subtitle;
-	appendNonEmpty(subtitle, m_detailData->getExtraName2());
+	appendNonEmpty(subtitle, m_detailData->getExtraName1Second());
 	appendNonEmpty(subtitle, m_detailData->getExtraName1First());
 	appendNonEmpty(subtitle, m_detailData->getCompany());
 	elm_object_item_part_text_set(naviItem, "subtitle", subtitle.empty() ? nullptr : titleMarkup(subtitle.c_str()).c_str());
 }
 
+// After every rebuild the star shows the stored state: the person may have
+// been made a favourite elsewhere, and a tap inverts what the star shows.
 void CtDetailView::__updateFavoriteBtn()
 {
 	Elm_Object_Item* naviItem = getNaviItem();
 	WPRET_M(!naviItem, "naviItem is nullptr");
 	if (m_isSimContact)
 		return;   // SIM cards keep no favourites
-	if (elm_object_item_part_content_get(naviItem, "title_right_btn"))
+	if (m_galData)
 		return;
+	if (Evas_Object* shown = elm_object_item_part_content_get(naviItem, "title_right_btn")) {
+		if (Evas_Object* check = elm_object_part_content_get(shown, "icon.favorite"))
+			ctCommonChecktStateSet(check, m_detailData->isFavorite() ? EINA_TRUE : EINA_FALSE, 0);
+		return;
+	}
 	std::string edj;
 	ContactsCommon::getAppEdjePath("contacts/detail_layout.edj", edj, true);
 	Evas_Object* layout = ctCommonCreateLayout(m_naviframeObj ? m_naviframeObj : getEvasObj(), edj.c_str(), "layout/favorite");

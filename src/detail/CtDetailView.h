@@ -78,6 +78,7 @@ protected:
 
 private:
 	void __initialize(CtLaunchRequest* request);
+	void __listenToPowerSaving();
 	void __createData(int personId);
 	void __addExtensionThemes();
 	void __connectCallBlock();

@@ -45,7 +45,7 @@ Evas_Object* CtDetailViewAddressItem::getContent(Evas_Object* genlist, const cha
 		return layout;
 	}
 	if (strcmp(part, "copy.text.area") == 0)
-		return createCopyArea(genlist, getCopyText());
+		return createCopyArea(genlist, "elm.text.multiline");
 	return nullptr;
 }
 

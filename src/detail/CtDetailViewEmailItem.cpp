@@ -42,7 +42,7 @@ Evas_Object* CtDetailViewEmailItem::getContent(Evas_Object* genlist, const char*
 		return layout;
 	}
 	if (strcmp(part, "copy.text.area") == 0)
-		return createCopyArea(genlist, getCopyText());
+		return createCopyArea(genlist, "elm.text.main.left.bottom");
 	return nullptr;
 }
 

@@ -9,8 +9,38 @@ namespace {
 
 const int kMinYear = 1902;
 const size_t kMaxDateBytes = 256;
+const int kMaxLunarDay = 30;
+
+bool isLeapYear(int year)
+{
+	return (year % 4 == 0 && year % 100 != 0) || year % 400 == 0;
+}
+
+// Days of a solar month; a February without a year has its 29th.
+int daysInMonth(int year, int month)
+{
+	static const int days[] = {31, 29, 31, 30, 31, 30, 31, 31, 30, 31, 30, 31};
+	if (month == 2 && year != 0 && !isLeapYear(year))
+		return 28;
+	return days[month - 1];
+}
 
 } // namespace
+
+bool CtDetailViewEventItem::hasCalendarDate(CtDetailDataBase* data, contacts_record_h record)
+{
+	WPRET_VM(!data || !record, false, "Invalid param : data or record");
+	int date = data->getEvent(record);
+	int year = date / 10000;
+	int month = date / 100 % 100;
+	int day = date % 100;
+	bool lunar = data->getCalendarType(record) == 1;
+	bool valid = date > 0 && month >= 1 && month <= 12 && day >= 1
+		&& day <= (lunar ? kMaxLunarDay : daysInMonth(year, month));
+	if (!valid)
+		WERROR("Invalid date(mon=%d,day=%d)", month, day);
+	return valid;
+}
 
 CtDetailViewEventItem::CtDetailViewEventItem(CtDetailDataBase* data, contacts_record_h record)
 	: CtDetailViewGenlistItem(data), m_record(record)
@@ -19,14 +49,12 @@ CtDetailViewEventItem::CtDetailViewEventItem(CtDetailDataBase* data, contacts_re
 
 std::string CtDetailViewEventItem::getCopyText()
 {
+	if (!hasCalendarDate(getData(), m_record))
+		return std::string();
 	int date = getData()->getEvent(m_record);
 	int year = date / 10000;
 	int month = date / 100 % 100;
 	int day = date % 100;
-	if (month < 1 || month > 12 || day < 1 || day > 31) {
-		WERROR("Invalid date(mon=%d,day=%d)", month, day);
-		return std::string();
-	}
 	std::string text = year == 0
 		? CtCommonGetDatetimeStr(getData()->getTimeFormatterWithoutYear(), year, month, day)
 		: CtCommonGetDatetimeStr(getData()->getTimeFormatter(), std::max(year, kMinYear), month, day);
@@ -51,7 +79,7 @@ std::string CtDetailViewEventItem::getText(const char* part)
 Evas_Object* CtDetailViewEventItem::getContent(Evas_Object* genlist, const char* part)
 {
 	if (strcmp(part, "copy.text.area") == 0)
-		return createCopyArea(genlist, getCopyText());
+		return createCopyArea(genlist, "elm.text.main.left.bottom");
 	return nullptr;
 }
 

@@ -10,6 +10,11 @@ public:
 	// `record` (_contacts_event) is owned by `data`.
 	CtDetailViewEventItem(CtDetailDataBase* data, contacts_record_h record);
 
+	// Whether the stored date is a day of the calendar (logged when not).
+	// The detail list shows no row for one that is not: a row without a
+	// date tells nothing.
+	static bool hasCalendarDate(CtDetailDataBase* data, contacts_record_h record);
+
 	contacts_record_h getRecord() const { return m_record; }
 
 public: // CtDetailViewGenlistItem

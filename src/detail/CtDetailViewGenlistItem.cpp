@@ -18,13 +18,15 @@ const char* const kHighlightOpen = "<backing=on backing_color=#BFF6FF linesize=2
 const char* const kHighlightClose = "</backing>";
 const char* const kIconEdj = "contacts/image_layout.edj";
 const char* const kDefaultIconColor = "A03O004";
-const char* const kValueTextStyle = "DEFAULT='font=Sans font_size=16 wrap=none'";
 const int kCopyAreaMaxW = 656;
 const int kCopyAreaMaxH = 54;
 // Tags on a content object: the row that made it, for which part, and when.
 const char* const kContentRowKey = "ct.content.row";
 const char* const kContentPartKey = "ct.content.part";
 const char* const kContentGenerationKey = "ct.content.generation";
+// On a copy area: the text part it covers; on a list: its rows' copy areas are sized.
+const char* const kCopyTextPartKey = "ct.copy.part";
+const char* const kCopyAreaSizingKey = "ct.copy.sizing";
 
 uintptr_t partTag(const char* part)
 {
@@ -134,28 +136,39 @@ std::string CtDetailViewGenlistItem::typeLabel(const char* label)
 	return label && *label ? toMarkup(ContactsCommon::translate(label)) : std::string();
 }
 
-Evas_Object* CtDetailViewGenlistItem::createCopyArea(Evas_Object* parent, const std::string& text)
+Evas_Object* CtDetailViewGenlistItem::createCopyArea(Evas_Object* genlist, const char* textPart)
 {
-	Evas* evas = evas_object_evas_get(parent);
-	Evas_Object* measure = evas_object_textblock_add(evas);
-	Evas_Textblock_Style* style = evas_textblock_style_new();
-	evas_textblock_style_set(style, kValueTextStyle);
-	evas_object_textblock_style_set(measure, style);
-	evas_object_textblock_text_markup_set(measure, toMarkup(text.c_str()).c_str());
-	Evas_Coord w = 0, h = 0;
-	evas_object_textblock_size_native_get(measure, &w, &h);
-	evas_object_del(measure);
-	evas_textblock_style_free(style);
-
-	double scale = ctCommonGetScale();
-	w = std::min<Evas_Coord>((Evas_Coord)(w * elm_config_scale_get()), (Evas_Coord)(kCopyAreaMaxW * scale));
-	h = std::min<Evas_Coord>((Evas_Coord)(h * elm_config_scale_get()), (Evas_Coord)(kCopyAreaMaxH * scale));
-	Evas_Object* area = evas_object_rectangle_add(evas);
+	Evas_Object* area = evas_object_rectangle_add(evas_object_evas_get(genlist));
 	evas_object_color_set(area, 0, 0, 0, 0);
-	evas_object_size_hint_min_set(area, w, h);
 	evas_object_pass_events_set(area, EINA_TRUE);
+	evas_object_data_set(area, kCopyTextPartKey, textPart);
 	evas_object_show(area);
+	if (!evas_object_data_get(genlist, kCopyAreaSizingKey)) {
+		evas_object_smart_callback_add(genlist, "realized", __rowRealizedCb, nullptr);
+		evas_object_data_set(genlist, kCopyAreaSizingKey, genlist);
+	}
 	return area;
+}
+
+// The row's own text part is there once the row is realized: the area takes
+// its size from what that part draws (the theme's font, text classes, scale).
+void CtDetailViewGenlistItem::__rowRealizedCb(void*, Evas_Object*, void* eventInfo)
+{
+	auto* item = static_cast<Elm_Object_Item*>(eventInfo);
+	Evas_Object* area = item ? elm_object_item_part_content_get(item, "copy.text.area") : nullptr;
+	auto* part = area ? static_cast<const char*>(evas_object_data_get(area, kCopyTextPartKey)) : nullptr;
+	Evas_Object* row = area ? evas_object_smart_parent_get(area) : nullptr;
+	if (!part || !row)
+		return;
+	edje_object_calc_force(row);
+	auto* text = const_cast<Evas_Object*>(edje_object_part_object_get(row, part));
+	Evas_Coord w = 0, h = 0;
+	if (text)
+		evas_object_textblock_size_native_get(text, &w, &h);
+	double scale = ctCommonGetScale();
+	w = std::min<Evas_Coord>(w, (Evas_Coord)(kCopyAreaMaxW * scale));
+	h = std::min<Evas_Coord>(h, (Evas_Coord)(kCopyAreaMaxH * scale));
+	evas_object_size_hint_min_set(area, w, h);
 }
 
 Evas_Object* CtDetailViewGenlistItem::createIconLayout(Evas_Object* parent, const char* group)

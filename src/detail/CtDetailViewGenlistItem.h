@@ -80,9 +80,9 @@ protected:
 	static std::string translate(const char* textId);
 	// A type label of the common library (a translation id or a custom label) as markup.
 	static std::string typeLabel(const char* label);
-	// A transparent rectangle as large as `text` is drawn in the value font,
-	// at most 656 x 54 (scaled).
-	static Evas_Object* createCopyArea(Evas_Object* parent, const std::string& text);
+	// A transparent rectangle as large as the row's `textPart` (a literal)
+	// draws its text, at most 656 x 54 (scaled); sized when the row is realized.
+	static Evas_Object* createCopyArea(Evas_Object* genlist, const char* textPart);
 	// The icon layout `group` of "contacts/detail_layout.edj" with the
 	// buttons added by addIconButton.
 	static Evas_Object* createIconLayout(Evas_Object* parent, const char* group);
@@ -99,6 +99,7 @@ private:
 	static char* __textGetCb(void* data, Evas_Object* obj, const char* part);
 	static Evas_Object* __contentGetCb(void* data, Evas_Object* obj, const char* part);
 	static Evas_Object* __reusableContentGetCb(void* data, Evas_Object* obj, const char* part, Evas_Object* old);
+	static void __rowRealizedCb(void* data, Evas_Object* obj, void* eventInfo);
 	static void __iconClickedCb(void* data, Evas_Object* obj, const char* emission, const char* source);
 	static void __iconPressedCb(void* data, Evas_Object* obj, const char* emission, const char* source);
 	static void __iconReleasedCb(void* data, Evas_Object* obj, const char* emission, const char* source);

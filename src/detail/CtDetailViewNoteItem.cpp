@@ -27,7 +27,7 @@ std::string CtDetailViewNoteItem::getText(const char* part)
 Evas_Object* CtDetailViewNoteItem::getContent(Evas_Object* genlist, const char* part)
 {
 	if (strcmp(part, "copy.text.area") == 0)
-		return createCopyArea(genlist, getCopyText());
+		return createCopyArea(genlist, "elm.text.multiline");
 	return nullptr;
 }
 

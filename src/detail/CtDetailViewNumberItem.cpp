@@ -63,7 +63,7 @@ Evas_Object* CtDetailViewNumberItem::getContent(Evas_Object* genlist, const char
 		return layout;
 	}
 	if (strcmp(part, "copy.text.area") == 0)
-		return createCopyArea(genlist, __getNumber());
+		return createCopyArea(genlist, "elm.text.main.left.bottom");
 	return nullptr;
 }
 

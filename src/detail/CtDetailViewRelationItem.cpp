@@ -27,7 +27,7 @@ std::string CtDetailViewRelationItem::getText(const char* part)
 Evas_Object* CtDetailViewRelationItem::getContent(Evas_Object* genlist, const char* part)
 {
 	if (strcmp(part, "copy.text.area") == 0)
-		return createCopyArea(genlist, getCopyText());
+		return createCopyArea(genlist, "elm.text.main.left.bottom");
 	return nullptr;
 }
 

@@ -34,7 +34,7 @@ Evas_Object* CtDetailViewWebsiteItem::getContent(Evas_Object* genlist, const cha
 		return layout;
 	}
 	if (strcmp(part, "copy.text.area") == 0)
-		return createCopyArea(genlist, getCopyText());
+		return createCopyArea(genlist, "elm.text.main.left.bottom");
 	return nullptr;
 }
 

@@ -124,7 +124,7 @@ TEST_F(Popup, ButtonThatDestroysItsOwnViewDoesNotCrash)
 	EXPECT_TRUE(aliveBelow.expired());
 }
 
-TEST_F(MenuPopup, MoreKeyOpensTheMenuWithItemsInAppendOrder)
+TEST_F(MenuPopup, MoreKeyOpensTheMenuWithItemsInAppendOrderAndDisabledItemsDoNothing)
 {
 	auto* view = pushView("v");
 	std::vector<std::string> chosen;
@@ -132,7 +132,8 @@ TEST_F(MenuPopup, MoreKeyOpensTheMenuWithItemsInAppendOrder)
 	std::function<void()> openMenu = [&] {
 		auto* menu = new WMenuPopup(view->getWindow(), view->getNaviframe());
 		for (const char* label : { "Edit", "Delete", "Share" })
-			menu->appendItem(label, [&chosen, label] { chosen.push_back(label); });
+			menu->appendItem(label, [&chosen, label] { chosen.push_back(label); },
+				strcmp(label, "Share") ? WMenuPopup::ItemState::Enabled : WMenuPopup::ItemState::Disabled);
 		view->attachPopup(menu);
 		menuAlive = menu->getWeakPtr();
 	};
@@ -146,8 +147,14 @@ TEST_F(MenuPopup, MoreKeyOpensTheMenuWithItemsInAppendOrder)
 	ASSERT_EQ(menus.size(), 1u);
 	std::vector<std::string> labels;
 	for (Elm_Object_Item* it = elm_ctxpopup_first_item_get(menus[0]); it; it = elm_ctxpopup_item_next_get(it))
-		labels.push_back(elm_object_item_text_get(it));
-	EXPECT_EQ(labels, (std::vector<std::string> { "Edit", "Delete", "Share" }));
+		labels.push_back(std::string(elm_object_item_text_get(it)) + (elm_object_item_disabled_get(it) ? " (off)" : ""));
+	EXPECT_EQ(labels, (std::vector<std::string> { "Edit", "Delete", "Share (off)" }));
+
+	// Choosing the disabled item neither runs it nor closes the menu.
+	elm_ctxpopup_item_selected_set(elm_ctxpopup_last_item_get(menus[0]), EINA_TRUE);
+	screen.pumpUntilIdle();
+	EXPECT_TRUE(chosen.empty());
+	ASSERT_FALSE(menuAlive.expired());
 
 	Elm_Object_Item* second = elm_ctxpopup_item_next_get(elm_ctxpopup_first_item_get(menus[0]));
 	elm_ctxpopup_item_selected_set(second, EINA_TRUE);

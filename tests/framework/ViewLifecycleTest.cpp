@@ -6,6 +6,7 @@
 #include <gtest/gtest.h>
 
 #include <algorithm>
+#include <stdexcept>
 
 using namespace ct::test;
 using app_assist::WView;
@@ -120,4 +121,24 @@ TEST_F(ViewLifecycle, BackIsRefusedByOnPopOrByTheLastViewHandler)
 	letGo = true;
 	screen.sendBackKey();
 	EXPECT_TRUE(alive.expired());
+}
+
+// A screen whose own constructor fails after its framework base was built.
+class FailingView : public WView {
+public:
+	explicit FailingView(EventLog& log) : m_log(log) { throw std::runtime_error("no memory for the data"); }
+	~FailingView() override { m_log.push_back("destructor"); }
+
+private:
+	EventLog& m_log;
+};
+
+TEST(ViewTeardown, AConstructorThatThrowsLeavesItsBaseFreedOnceAndTheExceptionToTheCaller)
+{
+	EventLog log;
+	EXPECT_THROW(new FailingView(log), std::runtime_error);
+	// The derived destructor never ran; the base freed nothing of its own.
+	EXPECT_TRUE(log.empty());
+	ScreenHarness screen;
+	EXPECT_TRUE(screen.push(new RecordingView(log, "next")));
 }

@@ -28,6 +28,36 @@ TEST(DemoCommandLineTest, ScreenshotOfAPersonIsWrittenAndAnUnknownPersonOrUnwrit
 	EXPECT_NE(std::string::npos, run.output.find("cannot write")) << run.output;
 }
 
+TEST(DemoCommandLineTest, AResourceFolderNamedRelativelyIsUsedAndAMissingOrEmptyOneIsAClearFailure)
+{
+	TempDataDir data;
+	const char* built = getenv("CONTACTS_RES_DIR");
+	ASSERT_TRUE(built && *built);
+	std::filesystem::path res(built);
+	std::string absoluteShot = data.file("absolute.png");
+	DemoRun run = runDemo(data.path(), "--person 1 --screenshot " + shellQuoted(absoluteShot));
+	ASSERT_EQ(0, run.exitCode) << run.output;
+
+	// Started from the folder above the resources, naming them relatively.
+	std::string relativeShot = data.file("relative.png");
+	std::string fromParent = "cd " + shellQuoted(res.parent_path().string()) + " && CONTACTS_RES_DIR=" +
+		shellQuoted(res.filename().string());
+	run = runDemo(data.path(), "--person 1 --screenshot " + shellQuoted(relativeShot), fromParent);
+	ASSERT_EQ(0, run.exitCode) << run.output;
+	EXPECT_EQ(std::string::npos, run.output.find("* Critical *")) << run.output;
+	ASSERT_TRUE(isPng(relativeShot));
+	EXPECT_EQ(std::filesystem::file_size(absoluteShot), std::filesystem::file_size(relativeShot));
+
+	TempDataDir empty;
+	for (const std::string& dir : {data.file("no-such-folder"), empty.path()}) {
+		std::string shot = data.file("none.png");
+		run = runDemo(data.path(), "--person 1 --screenshot " + shellQuoted(shot), "CONTACTS_RES_DIR=" + shellQuoted(dir));
+		EXPECT_EQ(1, run.exitCode) << dir << "\n" << run.output;
+		EXPECT_NE(std::string::npos, run.output.find("contacts-demo: no resources in " + dir)) << run.output;
+		EXPECT_FALSE(std::filesystem::exists(shot));
+	}
+}
+
 TEST(DemoCommandLineTest, AHeldDetailScreenClosesWhenAnotherProgramDeletesItsPerson)
 {
 	TempDataDir data;

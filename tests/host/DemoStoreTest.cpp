@@ -64,6 +64,17 @@ int simBookId()
 	return id;
 }
 
+// YYYYMMDD, the year 0 when none is stored.
+bool isCalendarDate(int date)
+{
+	int year = date / 10000, month = date / 100 % 100, day = date % 100;
+	if (date <= 0 || month < 1 || month > 12 || day < 1)
+		return false;
+	const int days[] = {31, 29, 31, 30, 31, 30, 31, 31, 30, 31, 30, 31};
+	bool leap = year == 0 || (year % 4 == 0 && year % 100 != 0) || year % 400 == 0;
+	return day <= (month == 2 && !leap ? 28 : days[month - 1]);
+}
+
 // The "id<TAB>name" lines of the person list the demo prints.
 std::vector<std::string> personLines(const std::string& output)
 {
@@ -122,6 +133,8 @@ TEST(DemoStoreTest, HeadlessStartListsTheVariedDemoStoreCreatedOnceAndReopenedWi
 		return intOf(e, _contacts_event.calendar_type) == CONTACTS_EVENT_CALENDAR_TYPE_LUNAR;
 	}), 2);
 	EXPECT_EQ(1, countWhere(event, [](R e) { return boolOf(e, _contacts_event.is_leap_month); }));
+	// Every stored date is a day of the calendar (year 0: a day of some year).
+	EXPECT_EQ(0, countWhere(event, [](R e) { return !isCalendarDate(intOf(e, _contacts_event.date)); }));
 	EXPECT_GE(countWhere(_contacts_note._uri, [](R n) { return textOf(n, _contacts_note.note).size() > 300; }), 1);
 
 	// Several scripts: names with letters beyond Latin-1 (multi-byte first bytes above 0xC3).

@@ -14,6 +14,7 @@
 
 #include <filesystem>
 #include <fstream>
+#include <map>
 #include <vector>
 #include <set>
 #include <sstream>
@@ -58,6 +59,7 @@ void collect(const std::string& text, const char* pattern, std::set<std::string>
 AskedNames scanSources()
 {
 	const char* style = R"(getItemStyle\(\) override \{ return ([^;]+);)";
+	const char* styleDefinition = R"(::getItemStyle\(\)(?: const)?\s*\{([^}]*)\})";
 	const char* layout = R"((?:createIconLayout|ctCommonCreateLayout)\([^;{\n]*?("[^"]+")\))";
 	const char* image = R"(("[A-Za-z0-9_]+\.png"))";
 	const char* part = R"(("(?:elm|touch|copy|main|sub|image|favor)\.[a-z0-9._]+"))";
@@ -70,6 +72,7 @@ AskedNames scanSources()
 			read << std::ifstream(entry.path()).rdbuf();
 			const std::string text = read.str();
 			collect(text, style, names.styles);
+			collect(text, styleDefinition, names.styles);
 			collect(text, layout, names.layouts);
 			collect(text, image, names.images);
 			for (const std::string& file : captures(text, R"re("contacts/([a-z_]+\.edj)")re"))
@@ -152,11 +155,14 @@ TEST(ThemeGroups, EveryStyleGroupImageAndPartTheCodeNamesExists)
 		if (layout)
 			loaded.push_back(layout);
 	}
-	// Title-bar parts belong to the naviframe item of the light theme.
-	Evas_Object* titleBar = canvas.load("light.edj", "elm/naviframe/item/basic/default");
-	EXPECT_NE(titleBar, nullptr);
-	if (titleBar)
-		loaded.push_back(titleBar);
+	// Title-bar parts belong to the naviframe item of the light theme, the
+	// indicator area to the window's base layout.
+	for (const char* group : {"elm/naviframe/item/basic/default", "elm/layout/application/default"}) {
+		Evas_Object* obj = canvas.load("light.edj", group);
+		EXPECT_NE(obj, nullptr) << group;
+		if (obj)
+			loaded.push_back(obj);
+	}
 	for (const std::string& part : asked.parts) {
 		bool found = false;
 		for (Evas_Object* obj : loaded) // "sub.name" names the numbered parts sub.name1...
@@ -170,6 +176,86 @@ TEST(ThemeGroups, EveryStyleGroupImageAndPartTheCodeNamesExists)
 		EXPECT_TRUE(edje_file_group_exists(edjePath("image_layout.edj").c_str(), image.c_str())) << image;
 		EXPECT_TRUE(ecore_file_exists((buildResDir() + "/images/" + image).c_str())) << image;
 	}
+}
+
+// The widget styles the code names (widget style setters, styled buttons and
+// toolbars, naviframe item styles).
+std::set<std::string> scanWidgetStyles()
+{
+	const char* const patterns[] = {R"re(elm_object_style_set\([^,;]+, "([^"]+)"\))re",
+		R"re((?:uxt_button_add|uxt_toolbar_add|ctCommonCreateButton)\([^,;]+, "([^"]+)")re",
+		R"re(elm_naviframe_item_push\([^;]*, "([^"]+)"\);)re"};
+	std::set<std::string> styles;
+	for (const char* dir : {"src", "common", "framework", "host"}) {
+		for (const auto& entry : std::filesystem::recursive_directory_iterator(sourceRoot() + "/" + dir)) {
+			if (!entry.is_regular_file())
+				continue;
+			std::stringstream read;
+			read << std::ifstream(entry.path()).rdbuf();
+			for (const char* pattern : patterns)
+				for (const std::string& style : captures(read.str(), pattern))
+					styles.insert(style);
+		}
+	}
+	return styles;
+}
+
+// Where the toolkit looks for a group: the light overlay, the screens' theme
+// files (added as extensions) and the toolkit's own theme.
+bool groupFound(const std::string& group)
+{
+	std::vector<std::string> files = {edjePath("light.edj"), edjePath("contacts.edj"), edjePath("detail_layout.edj")};
+	if (const char* system = elm_theme_list_item_path_get("default", nullptr))
+		files.push_back(system);
+	for (const std::string& file : files)
+		if (edje_file_group_exists(file.c_str(), group.c_str()))
+			return true;
+	return false;
+}
+
+TEST(ThemeGroups, EveryWidgetStyleTheCodeNamesExists)
+{
+	// Each style with the groups the toolkit loads for it; a widget whose
+	// style is missing falls back to the default look (a popup to none).
+	auto popup = [](const std::string& style) {
+		std::vector<std::string> groups = {"elm/popup/base/" + style, "elm/popup/content/popup/" + style,
+			"elm/notify/block_events/popup/" + style, "elm/label/base/popup/" + style,
+			"elm/scroller/base/popup/" + style};
+		for (const char* part : {"buttons1", "buttons2", "buttons3"})
+			groups.push_back(std::string("elm/popup/") + part + "/popup/" + style);
+		for (const char* place : {"center", "bottom", "top"})
+			groups.push_back(std::string("elm/notify/") + place + "/popup/" + style);
+		return groups;
+	};
+	// The more menu keeps the toolkit's own context-popup look on purpose.
+	const std::set<std::string> defaultLook = {"more/default"};
+	const std::map<std::string, std::vector<std::string>> known = {
+		{"naviframe/title_right", {"elm/button/base/naviframe/title_right"}},
+		{"naviframe/title_left", {"elm/button/base/naviframe/title_left"}},
+		{"naviframe/back_btn/default", {"elm/button/base/naviframe/back_btn/default"}},
+		{"naviframe/more/default", {"elm/button/base/naviframe/more/default"}},
+		{"circle", {"elm/button/base/circle"}}, {"transparent", {"elm/button/base/transparent"}},
+		{"arrow_btn_with_swallow", {"elm/button/base/arrow_btn_with_swallow"}},
+		{"btn_with_swallow", {"elm/button/base/btn_with_swallow"}},
+		{"on_gradient_bg", {"elm/button/base/on_gradient_bg"}}, {"bottom", {"elm/button/base/bottom"}},
+		{"theme_bg", popup("theme_bg")}, {"toast", popup("toast")}, {"popup", {"elm/genlist/base/popup", "elm/button/base/popup"}}, {"on&off", {"elm/check/base/on&off"}},
+		{"favorite_contact", {"elm/check/base/favorite_contact"}}, {"effect", {"elm/scroller/base/effect"}},
+		{"pagecontrol", {"elm/index/base/horizontal/pagecontrol", "elm/index/item/horizontal/pagecontrol"}},
+		{"wheel", {"elm/progressbar/horizontal/wheel"}},
+		{"tabbar_with_title", {"elm/toolbar/base/tabbar_with_title", "elm/toolbar/item/tabbar_with_title"}},
+		{"tabbar", {"elm/naviframe/item/tabbar/default"}}, {"basic", {"elm/naviframe/item/basic/default"}},
+		{"datetime", {"elm/uiclock/base/default"}},
+		// The indicator looks the picture viewer switches between.
+		{"indicator", {"elm/layout/indicator/headerbg", "elm/layout/indicator/image/viewer"}},
+		{"default", {"elm/radio/base/default", "elm/check/base/default", "elm/button/base/default"}}};
+	const std::set<std::string> asked = scanWidgetStyles();
+	ASSERT_GE(asked.size(), 5u) << "the scan no longer finds the widget styles";
+	for (const std::string& style : asked)
+		EXPECT_TRUE(known.count(style) || defaultLook.count(style))
+			<< "style \"" << style << "\" is named in the code but not listed here";
+	for (const auto& [style, groups] : known)
+		for (const std::string& group : groups)
+			EXPECT_TRUE(groupFound(group)) << "style " << style << ": no group " << group;
 }
 
 TEST(ThemeGroups, SwitchesReachTheirParts)
@@ -198,6 +284,20 @@ TEST(ThemeGroups, SwitchesReachTheirParts)
 		{"contacts.edj", "=layout/basicInfo/callerId", "disable", "touch_area", "touch_area", "default"},
 		{"detail_layout.edj", "=list/C/profile/my_profile", "btn.disable", "touch.event.area", "touch.event.area",
 			"disabled"},
+		// Title-bar buttons on both sides hide with the title; the tab bar too.
+		{"light.edj", "=elm/naviframe/item/basic/default", "elm,state,title,hide", "elm", "title_left_btn",
+			"title-hidden"},
+		{"light.edj", "=elm/naviframe/item/basic/default", "elm,state,title,show", "elm", "title_left_btn", "default"},
+		{"light.edj", "=elm/naviframe/item/tabbar/default", "elm,state,title,hide", "elm", "title_right_btn",
+			"title-hidden"},
+		{"light.edj", "=elm/toolbar/item/tabbar_with_title", "elm,state,selected", "elm", "bar", "selected"},
+		{"light.edj", "=elm/toolbar/item/tabbar_with_title", "elm,state,unselected", "elm", "bar", "default"},
+		{"light.edj", "=elm/check/base/on&off", "elm,state,check,on", "elm", "knob", "on"},
+		{"light.edj", "=elm/check/base/on&off", "elm,state,disabled", "elm", "clip", "disabled"},
+		{"light.edj", "=elm/button/base/naviframe/title_right", "elm,state,disabled", "elm", "clip", "disabled"},
+		{"light.edj", "=elm/popup/base/theme_bg", "elm,state,title_area,visible", "elm", "title_area", "visible"},
+		{"light.edj", "=elm/popup/base/theme_bg", "elm,state,action_area,visible", "elm", "elm.swallow.action_area",
+			"visible"},
 	};
 	EdjeCanvas canvas;
 	Evas_Object* obj = nullptr;

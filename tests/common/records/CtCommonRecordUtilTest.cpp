@@ -25,7 +25,7 @@ std::string tr(const char* id)
 
 TEST_F(CtCommonRecordUtilTest, SimContactIsASinglePersonContactInASimBook)
 {
-	int sim = addAddressbook(CONTACTS_SIM1_ADDRESS_BOOK_NAME, 0, 0, CONTACTS_SIM1_ADDRESS_BOOK_NAME);
+	int sim = addAddressbook(CONTACTS_SIM1_ADDRESS_BOOK_NAME, 0, 0, CONTACTS_SIM1_PROVIDER_NAME);
 	int simContact = store(newContact(sim, "Sim"));
 	int phoneContact = store(newContact(0, "Phone"));
 	EXPECT_TRUE(ctCommonIsSimAddressbook(sim));

@@ -180,3 +180,22 @@ TEST_F(WidgetUtilTest, ApplicationsAreAvailableWhileTheirHandlersAreRegistered)
 	EXPECT_FALSE(ctCommoncheckEmailAppEnable());
 	EXPECT_FALSE(ctCommontGetMapsAppId(maps));
 }
+
+TEST_F(WidgetUtilTest, AddAccountStartsTheCheckedApplicationAskingForContactAccounts)
+{
+	EXPECT_FALSE(ctCommonLaunchAddAccount());
+	std::string extras;
+	auto account = ct::appcontrol::registerAppHandler("settings-accounts",
+		[&](app_control_h request, const ct::appcontrol::Reply&) {
+			for (const char* key : {"mode", "capability_filter"}) {
+				char* value = nullptr;
+				app_control_get_extra_data(request, key, &value);
+				extras += std::string(key) + "=" + (value ? value : "") + ";";
+				free(value);
+			}
+			return 0;
+		});
+	EXPECT_TRUE(ctCommoncheckAccountAppEnable());
+	ASSERT_TRUE(ctCommonLaunchAddAccount());
+	EXPECT_EQ(extras, "mode=add_account;capability_filter=" ACCOUNT_SUPPORTS_CAPABILITY_CONTACT ";");
+}

@@ -204,7 +204,7 @@ TEST_F(CtDetailDataLoadTest, ReadOnlySocialAndSimModesFollowTheAddressBooks)
 {
 	int readOnly = addAddressbook("ro", CONTACTS_ADDRESS_BOOK_MODE_READONLY, 4, "Corp");
 	int social = addAddressbook("fb", CT_ADDRESSBOOK_MODE_SOCIAL, 5, "Facebook");
-	int sim = addAddressbook(CONTACTS_SIM1_ADDRESS_BOOK_NAME, 0, 0, CONTACTS_SIM1_ADDRESS_BOOK_NAME);
+	int sim = addAddressbook(CONTACTS_SIM1_ADDRESS_BOOK_NAME, 0, 0, CONTACTS_SIM1_PROVIDER_NAME);
 
 	int roContact = store(newContact(readOnly, "Ro"));
 	{

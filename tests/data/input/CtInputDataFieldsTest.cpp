@@ -59,6 +59,17 @@ TEST(CtDataTypeTables, NumberAndMessengerPositionsBothWays)
 	for (const auto& [type, index] : messengerIndexes)
 		EXPECT_EQ(messengerIndexByType(type), index) << type;
 	EXPECT_EQ(messengerIndexByType(2, 7), 7);
+
+	// The profile's menu: {position or type, contact's answer, profile's answer}.
+	struct Both {
+		int given, contact, profile;
+	};
+	for (const Both& c : {Both{5, 2, 9}, Both{4, 8, 8}, Both{7, 9, 9}})
+		EXPECT_EQ((std::pair{messengerTypeByIndex(c.given, kContactMessengerMenu),
+			messengerTypeByIndex(c.given, kProfileMessengerMenu)}), (std::pair{c.contact, c.profile})) << c.given;
+	for (const Both& c : {Both{2, 5, 7}, Both{9, 7, 7}, Both{10, 3, 3}})
+		EXPECT_EQ((std::pair{messengerIndexByType(c.given, kContactMessengerMenu),
+			messengerIndexByType(c.given, kProfileMessengerMenu)}), (std::pair{c.contact, c.profile})) << c.given;
 }
 
 TEST(CtDataTypeTables, NextTypes)
@@ -74,7 +85,10 @@ TEST(CtDataTypeTables, NextTypes)
 		{nextEventType({}), 2}, {nextEventType({2}), 3}, {nextEventType({3, 2}), 0}, {nextEventType({3}), 2},
 		{nextRelationshipType({}), 1}, {nextRelationshipType({1, 2, 0, 15, -4}), 3},
 		{nextRelationshipType(allRelationships), 14}, {nextMessengerType({}), 7}, {nextMessengerType({7, 4}), 10},
-		{nextMessengerType(sixMessengers), 9}, {nextMessengerType(sixMessengers, CONTACTS_MESSENGER_TYPE_CUSTOM), 1}};
+		{nextMessengerType(sixMessengers), 9}, {nextMessengerType(sixMessengers, CONTACTS_MESSENGER_TYPE_CUSTOM), 1},
+		{nextMessengerType({7, 4, 10, 8, 9, 6}, kContactMessengerMenu), 2},
+		{nextMessengerType({7, 4, 10, 8, 9, 6}, kProfileMessengerMenu), 9},
+		{nextMessengerType(sixMessengers, kProfileMessengerMenu), 9}};
 	for (size_t i = 0; i < std::size(cases); ++i)
 		EXPECT_EQ(cases[i].first, cases[i].second) << "case " << i;
 }

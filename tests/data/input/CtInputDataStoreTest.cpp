@@ -8,6 +8,8 @@
 #include "LogSink.h"
 #include "SqliteFaultInjector.h"
 
+#include <sqlite3.h>
+
 #include <cstdlib>
 #include <fstream>
 
@@ -96,7 +98,7 @@ void expectSavedDespiteWriteFaults(Save save, State state)
 
 using CtInputDataStoreTest = InputStoreTest;
 
-TEST_F(CtInputDataStoreTest, InsertedContactIsStoredUnlinkedWithItsRingtone)
+TEST_F(CtInputDataStoreTest, InsertedContactIsStoredUnlinkedWithItsRingtoneCustomTypesAndLunarDates)
 {
 	int first = personOf(storeAda());
 	int id = 0;
@@ -105,12 +107,57 @@ TEST_F(CtInputDataStoreTest, InsertedContactIsStoredUnlinkedWithItsRingtone)
 		data.setFullName("Ada Byron");
 		data.addNumber("0101");
 		data.setRingtone("/snd/bell.ogg", "2500");
+		// Every kind with a custom type (a negative type and a label).
+		data.setNumberType(data.getDefaultNumber(), -1, "Boat");
+		data.setEmailType(data.addEmail("a@x"), -1, "Club");
+		data.setAddressType(data.addAddress("1 Main St"), -1, "Cabin");
+		data.setMessengerType(data.addMessenger("ada"), -1, "Pager");
+		data.setRelationshipType(data.addRelationship("Bo"), -1, "Mentor");
+		contacts_record_h lunar = data.addEvent(20200115);
+		data.setEventType(lunar, -1, "Feast");
+		data.setCalendarType(lunar, CONTACTS_EVENT_CALENDAR_TYPE_LUNAR);
+		data.setIsLeapMonth(lunar, true);
+		data.addEvent(19991231);
 		ASSERT_EQ(data.insertContact(&id), 0);
 	}
 	reopenStore();
-	EXPECT_NE(personOf(id), first); // link mode 1: same name, still a person of its own
-	EXPECT_EQ(snapshot(id), "Ada|Byron|0101|||/snd/bell.ogg");
+	// Link mode "ignore once": the store must not join it to the other Ada.
+	contacts_record_h stored = readContact(id);
+	int linkMode = -1;
+	contacts_record_get_int(stored, _contacts_contact.link_mode, &linkMode);
+	contacts_record_destroy(stored, true);
+	EXPECT_EQ(linkMode, CONTACTS_CONTACT_LINK_MODE_IGNORE_ONCE);
+	EXPECT_NE(personOf(id), first);
+	EXPECT_EQ(snapshot(id), "Ada|Byron|0101|a@x||/snd/bell.ogg");
 	EXPECT_EQ(ringtoneInfo(id), "/snd/bell.ogg|1|2500");
+
+	CtInputData loaded(readContact(id));
+	std::vector<std::string> types;
+	const std::pair<Eina_List*, std::pair<unsigned int, unsigned int>> kinds[] = {
+		{loaded.getNumberList(), {_contacts_number.type, _contacts_number.label}},
+		{loaded.getEmailList(), {_contacts_email.type, _contacts_email.label}},
+		{loaded.getAddressList(), {_contacts_address.type, _contacts_address.label}},
+		{loaded.getMessengerList(), {_contacts_messenger.type, _contacts_messenger.label}},
+		{loaded.getRelationshipList(), {_contacts_relationship.type, _contacts_relationship.label}},
+		{loaded.getEventList(), {_contacts_event.type, _contacts_event.label}}};
+	for (const auto& [list, properties] : kinds) {
+		auto record = static_cast<contacts_record_h>(eina_list_data_get(list));
+		types.push_back(std::to_string(loaded.getDataType(record, properties.first)) + ":"
+			+ str(loaded.getDataTypeCustom(record, properties.second)));
+		eina_list_free(list);
+	}
+	EXPECT_EQ(types, (std::vector<std::string>{"1:Boat", "1:Club", "1:Cabin", "1:Pager", "15:Mentor", "1:Feast"}));
+
+	// {date, calendar, leap month} of each event, read back.
+	std::vector<std::string> events;
+	Eina_List* list = loaded.getEventList();
+	for (Eina_List* l = list; l; l = eina_list_next(l)) {
+		auto event = static_cast<contacts_record_h>(eina_list_data_get(l));
+		events.push_back(std::to_string(loaded.getEventEvent(event)) + "/" + std::to_string(loaded.getCalendarType(event))
+			+ "/" + std::to_string(loaded.getIsLeapMonth(event)));
+	}
+	eina_list_free(list);
+	EXPECT_EQ(events, (std::vector<std::string>{"20200115/1/1", "19991231/0/0"}));
 }
 
 TEST_F(CtInputDataStoreTest, EditLoadsThePersonAndUpdatesOneField)
@@ -207,6 +254,32 @@ TEST_F(CtInputDataStoreTest, OwnKeysOfTheContactsApplicationAndThePrimaryEdit)
 	EXPECT_EQ(snapshot(id), "Augusta|Byron|0101|||");
 }
 
+TEST_F(CtInputDataStoreTest, PrimaryEditOfALinkedPersonPutsThePictureOnItsWritableContact)
+{
+	// The display contact lives in a read-only account; the phone contact linked to it can be written.
+	int readOnly = addAddressbook("ro@example.com", CONTACTS_ADDRESS_BOOK_MODE_READONLY, 9, "Social");
+	int shown = store(newContact(readOnly, "Shown"));
+	int writable = store(newContact(0, "Writable"));
+	int person = linkContacts({shown, writable});
+	auto imagePath = [](int contactId) {
+		contacts_record_h contact = readContact(contactId);
+		std::string path = textOf(childAt(contact, _contacts_contact.image, 0), _contacts_image.path);
+		contacts_record_destroy(contact, true);
+		return path;
+	};
+	{
+		CtInputData data(nullptr, request(nullptr, {{"person_id", std::to_string(person)}, {"type", "112"}}).get());
+		ASSERT_EQ(data.getContactId(), shown);
+		ASSERT_EQ(data.setImage(nullptr, "/pics/p.jpg", 0), 0);
+		EXPECT_EQ(str(data.getImagePath()), "/pics/p.jpg");
+		data.setFirstName("Shown Again");
+		ASSERT_EQ(data.updateContact(), 0);
+	}
+	reopenStore();
+	EXPECT_EQ((std::vector<std::string>{imagePath(shown), imagePath(writable), snapshot(shown), snapshot(writable)}),
+		(std::vector<std::string>{"", "/pics/p.jpg", "Shown Again|||||", "Writable|||||"}));
+}
+
 TEST_F(CtInputDataStoreTest, GoogleStorageJoinsItsDefaultGroupOnceAndGroupNamesShowTheEmergencyGroup)
 {
 	int google = addAddressbook("g@example.com", 0, 7, "Google");
@@ -242,18 +315,28 @@ TEST_F(CtInputDataStoreTest, GoogleStorageJoinsItsDefaultGroupOnceAndGroupNamesS
 
 TEST_F(CtInputDataStoreTest, BaseStorageComesFromThePreferenceWithSimPowerChecksExceptForEmergencyContacts)
 {
+	std::ofstream(m_dir.file("sim.conf")) << "[SIM1]\n[SIM2]\nname_max=9\n";
+	reopenStore();
 	int account = addAddressbook("work@example.com", 0, 7, "Exchange");
-	int sim1 = ctCommonGetAddressBookId("SIM1");
+	int sim1 = ctCommonGetAddressBookId(CONTACTS_SIM1_ADDRESS_BOOK_NAME);
+	int sim2 = ctCommonGetAddressBookId(CONTACTS_SIM2_ADDRESS_BOOK_NAME);
 	ASSERT_GT(sim1, 0);
-	const std::pair<const char*, int> choices[] = {{"work@example.com", account}, {"SIM1", sim1},
-		{"SIM2", 0}, {"gone@example.com", 0}, {"", 0}};
-	for (const auto& [preference, expected] : choices) {
-		preference_set_string("input_base_addressbook", preference);
-		EXPECT_EQ(CtInputData(nullptr).getAddressbookId(), expected) << preference;
+	ASSERT_GT(sim2, 0);
+	// {chosen last time, SIM 1 power, SIM 2 power, storage of a new contact, its SIM number, its name length}
+	struct Choice {
+		const char* preference;
+		int power1, power2, expected, simNo, nameMax;
+	} choices[] = {{"work@example.com", 1, 0, account, 0, 0}, {CONTACTS_SIM1_ADDRESS_BOOK_NAME, 1, 0, sim1, 1, 14},
+		{CONTACTS_SIM2_ADDRESS_BOOK_NAME, 1, 0, 0, 0, 0}, {CONTACTS_SIM2_ADDRESS_BOOK_NAME, 0, 1, sim2, 2, 9},
+		{CONTACTS_SIM1_ADDRESS_BOOK_NAME, 0, 1, 0, 0, 0}, {"gone@example.com", 1, 1, 0, 0, 0}, {"", 1, 1, 0, 0, 0}};
+	for (const Choice& c : choices) {
+		preference_set_string("input_base_addressbook", c.preference);
+		vconf_set_int("db/telephony/sim_power_state1", c.power1);
+		vconf_set_int("db/telephony/sim_power_state2", c.power2);
+		CtInputData data(nullptr);
+		EXPECT_EQ((std::vector<int>{data.getAddressbookId(), data.getSimNo(), data.getSimFieldTextMaxLen(CONTACTS_SIM_FIELD_NAME)}),
+			(std::vector<int>{c.expected, c.simNo, c.nameMax})) << c.preference << " " << c.power1 << c.power2;
 	}
-	preference_set_string("input_base_addressbook", "SIM1");
-	vconf_set_int("db/telephony/sim_power_state1", 0);
-	EXPECT_EQ(CtInputData(nullptr).getAddressbookId(), 0) << "a SIM that is off";
 
 	// An emergency contact (type 126) stays on the phone whatever is chosen.
 	preference_set_string("input_base_addressbook", "work@example.com");
@@ -270,8 +353,8 @@ TEST_F(CtInputDataStoreTest, BaseStorageComesFromThePreferenceWithSimPowerChecks
 TEST_F(CtInputDataStoreTest, SimContactKeepsTheSecondOfExactlyTwoNumbers)
 {
 	// A new contact goes to the SIM chosen last time.
-	preference_set_string("input_base_addressbook", "SIM1");
-	int sim1 = ctCommonGetAddressBookId("SIM1");
+	preference_set_string("input_base_addressbook", CONTACTS_SIM1_ADDRESS_BOOK_NAME);
+	int sim1 = ctCommonGetAddressBookId(CONTACTS_SIM1_ADDRESS_BOOK_NAME);
 	contacts_record_h two = newContact(sim1, "Two");
 	addNumber(two, "111", CONTACTS_NUMBER_TYPE_CELL);
 	addNumber(two, "222", CONTACTS_NUMBER_TYPE_CELL);
@@ -299,7 +382,7 @@ TEST_F(CtInputDataStoreTest, SimContactKeepsTheSecondOfExactlyTwoNumbers)
 TEST_F(CtInputDataStoreTest, SimSaveStoresTheWholeNameAndACleanNumber)
 {
 	CtInputData data(nullptr);
-	data.setAddressbookInfo(ctCommonGetAddressBookId("SIM1"));
+	data.setAddressbookInfo(ctCommonGetAddressBookId(CONTACTS_SIM1_ADDRESS_BOOK_NAME));
 	EXPECT_EQ(data.getSimNo(), 1);
 	EXPECT_EQ(data.getSimFieldTextMaxLen(CONTACTS_SIM_FIELD_NAME), 14);
 	EXPECT_TRUE(data.getSimFieldStatus(CONTACTS_SIM_FIELD_EMAIL));
@@ -324,7 +407,7 @@ TEST_F(CtInputDataStoreTest, SimThatIsOffOrFullRefusesTheSave)
 {
 	std::ofstream(m_dir.file("sim.conf")) << "[SIM1]\ncapacity=1\n";
 	reopenStore();
-	int sim1 = ctCommonGetAddressBookId("SIM1");
+	int sim1 = ctCommonGetAddressBookId(CONTACTS_SIM1_ADDRESS_BOOK_NAME);
 	ASSERT_GT(sim1, 0);
 	auto simContact = [&](const char* name) {
 		auto data = std::make_unique<CtInputData>(nullptr);
@@ -358,14 +441,14 @@ TEST_F(CtInputDataStoreTest, SimWithoutTextLimitsGetsTheDefaultLengthAndStoresNo
 	std::ofstream(m_dir.file("sim.conf")) << "[SIM1]\nname_max=0\nnumber_max=0\nemail_max=0\n";
 	reopenStore();
 	CtInputData data(nullptr);
-	data.setAddressbookInfo(ctCommonGetAddressBookId("SIM1"));
+	data.setAddressbookInfo(ctCommonGetAddressBookId(CONTACTS_SIM1_ADDRESS_BOOK_NAME));
 	EXPECT_EQ(data.getSimFieldTextMaxLen(CONTACTS_SIM_FIELD_NAME), 20);
 	EXPECT_EQ(data.getSimFieldTextMaxLen(CONTACTS_SIM_FIELD_NUMBER), 20);
 	EXPECT_EQ(data.getSimFieldTextMaxLen(CONTACTS_SIM_FIELD_EMAIL), 0);
 
 	std::ofstream(m_dir.file("sim.conf")) << "[SIM1]\nemail_max=0\n";
 	reopenStore();
-	data.setAddressbookInfo(ctCommonGetAddressBookId("SIM1"));
+	data.setAddressbookInfo(ctCommonGetAddressBookId(CONTACTS_SIM1_ADDRESS_BOOK_NAME));
 	data.setFullName("Mail Less");
 	data.addNumber("12");
 	data.addEmail("dropped@x");
@@ -392,6 +475,11 @@ TEST_F(CtInputDataStoreTest, RingtoneInfoIsWrittenOnlyWhenItChanged)
 	EXPECT_EQ(ringtoneInfo(id), "/snd/a.ogg|1|10");
 	edit([](CtInputData& d) { d.setRingtone("/snd/a.ogg", "99"); });
 	EXPECT_EQ(ringtoneInfo(id), "/snd/a.ogg|1|99");
+	// A position that is no position starts the ringtone from its beginning.
+	for (const char* position : {"-5", "x7"}) {
+		edit([position](CtInputData& d) { d.setRingtone("/snd/b.ogg", position); });
+		EXPECT_EQ(ringtoneInfo(id), "/snd/b.ogg|1|0") << position;
+	}
 	edit([](CtInputData& d) { d.setRingtone(nullptr); });
 	EXPECT_EQ(ringtoneInfo(id).rfind("<null>|", 0), 0u);
 	EXPECT_EQ(snapshot(id), "Ada|Byron|0101|||");
@@ -407,6 +495,15 @@ TEST_F(CtInputDataStoreTest, FailedSavesLeaveTheStoredContactAsItWas)
 		return data.updateContact();
 	}, [id] { return snapshot(id); });
 	EXPECT_EQ(snapshot(id), "Ada|Lovelace|0101,0202|||");
+
+	// The ringtone is written after the contact: an update whose ringtone
+	// write failed must not report success.
+	expectSavedDespiteWriteFaults([id] {
+		CtInputData data(readContact(id));
+		data.setRingtone("/snd/new.ogg", "7");
+		return data.updateContact();
+	}, [id] { return ringtoneInfo(id); });
+	EXPECT_EQ(ringtoneInfo(id), "/snd/new.ogg|1|7");
 
 	// An insert either stores the contact and reports success, or stores nothing.
 	int count = countContacts();
@@ -448,7 +545,17 @@ TEST_F(CtInputDataStoreTest, EmergencyNumberAndStatusComeFromThePerson)
 	ASSERT_EQ(data.updateContact(), 0);
 	reopenStore();
 	EXPECT_EQ(snapshot(id), "Ada|Byron|0999|||");
-	free(const_cast<char*>(data.getStatus()));
+
+	// The status is the person's (written by the service, not through records).
+	sqlite3* db = nullptr;
+	ASSERT_EQ(sqlite3_open(m_dir.file("contacts.db").c_str(), &db), SQLITE_OK);
+	std::string sql = "UPDATE persons SET status = 'On holiday' WHERE id = " + std::to_string(personOf(id));
+	ASSERT_EQ(sqlite3_exec(db, sql.c_str(), nullptr, nullptr, nullptr), SQLITE_OK);
+	sqlite3_close(db);
+	char* status = const_cast<char*>(data.getStatus());
+	EXPECT_EQ(str(status), "On holiday");
+	free(status);
+	EXPECT_EQ(CtInputData(nullptr).getStatus(), nullptr);
 }
 
 TEST_F(CtInputDataStoreTest, DeletedFlagFollowsChangesFromAnotherProcess)
@@ -474,11 +581,12 @@ TEST_F(CtInputDataStoreTest, DeletedFlagFollowsChangesFromAnotherProcess)
 	EXPECT_GE(listener.uris.size(), 2u);
 	EXPECT_EQ(listener.uris.back(), _contacts_contact._uri);
 
-	// Unrelated changes after the delete neither notify nor clear the flag.
+	// Unrelated changes after the delete neither notify nor clear the flag;
+	// once detached, the listener hears nothing more.
 	size_t calls = listener.uris.size();
-	data.detachListener();
 	addNumberToStoredContact(otherId, "0404");
 	settle(0.8);
 	EXPECT_EQ(listener.uris.size(), calls);
 	EXPECT_TRUE(data.checkChangedTypeIsDeleted());
+	data.detachListener();
 }

@@ -115,8 +115,12 @@ TEST_F(CtxPopupTest, LongPressHighlightsTheValueAndTheBackKeyRemovesIt)
 		EXPECT_EQ(std::string(kBacking) + value + "</backing>", text(item, "elm.text.main.left.bottom"));
 		EXPECT_EQ(ELM_SCROLLER_MOVEMENT_BLOCK_VERTICAL, elm_scroller_movement_block_get(genlist));
 		EXPECT_EQ(std::make_pair(wanted.x, wanted.y), std::make_pair(popup->getPosition().x, popup->getPosition().y));
-
+		// The popup itself went there: its arrow points at that spot.
 		Evas_Object* ctxpopup = popup->getEvasObj();
+		Evas_Coord shownX = -1, shownY = -1;
+		evas_object_geometry_get(ctxpopup, &shownX, &shownY, nullptr, nullptr);
+		EXPECT_EQ(std::make_pair(wanted.x, wanted.y), std::make_pair(shownX, shownY));
+
 		Elm_Object_Item* entry = elm_ctxpopup_first_item_get(ctxpopup);
 		ASSERT_NE(nullptr, entry);
 		EXPECT_STREQ(ContactsCommon::translate("IDS_PB_OPT_VIEW_COPY"), elm_object_item_text_get(entry));

@@ -54,6 +54,45 @@ TEST_F(NumberRowTest, ShowsTypeAndEscapedNumberWithCallAndMessageButtonsAndACapp
 	EXPECT_LE(h, (Evas_Coord)(54 * s));
 }
 
+TEST_F(NumberRowTest, TheCopyAreaIsAsLargeAsTheNumberTheRowDraws)
+{
+	CtDetailData* data = personWithNumber("010-2345");
+	auto areaSize = [this](Elm_Object_Item* item) {
+		m_screen->pumpUntilIdle();
+		Evas_Coord w = 0, h = 0;
+		evas_object_size_hint_min_get(content(item, "copy.text.area"), &w, &h);
+		return std::make_pair(w, h);
+	};
+	auto drawnSize = [this](Elm_Object_Item* item) {
+		Evas_Object* row = evas_object_smart_parent_get(content(item, "copy.text.area"));
+		Evas_Coord w = 0, h = 0;
+		evas_object_textblock_size_native_get(
+				const_cast<Evas_Object*>(edje_object_part_object_get(row, "elm.text.main.left.bottom")), &w, &h);
+		return std::make_pair(w, h);
+	};
+	Elm_Object_Item* plain = numberRow(data);
+	auto plainArea = areaSize(plain);
+	EXPECT_GT(plainArea.first, 0);
+	EXPECT_EQ(drawnSize(plain), plainArea);
+
+	// A larger font for the values (the user's font size setting) and a
+	// larger list scale give larger numbers: the area follows both.
+	edje_text_class_set("ct_main", "Sans", 24);
+	Elm_Object_Item* larger = numberRow(data);
+	auto largerArea = areaSize(larger);
+	EXPECT_EQ(drawnSize(larger), largerArea);
+	EXPECT_GT(largerArea.first, plainArea.first * 5 / 4);
+	EXPECT_GT(largerArea.second, plainArea.second);
+	edje_text_class_del("ct_main");
+
+	elm_object_scale_set(m_view->genlist, 1.5);
+	Elm_Object_Item* scaled = numberRow(data);
+	auto scaledArea = areaSize(scaled);
+	EXPECT_EQ(drawnSize(scaled), scaledArea);
+	EXPECT_GT(scaledArea.first, plainArea.first * 5 / 4);
+	elm_object_scale_set(m_view->genlist, 1.0);
+}
+
 TEST_F(NumberRowTest, CallAndMessageLaunchWithTheirUsageAndAMessageTapIsNotAlsoACall)
 {
 	CtDetailData* data = personWithNumber("+82 10 1111 2222");

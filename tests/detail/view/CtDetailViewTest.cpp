@@ -2,6 +2,7 @@
 // order, how the screen follows changes of the person, the favourite star,
 // power saving and the call-block list, and what bad requests give.
 #include "../../data/detail/DetailTestStore.h"
+#include "FailingAllocation.h"
 
 #include "AppControlRouter.h"
 #include "ContactsAppIds.h"
@@ -11,8 +12,10 @@
 #include "CtDetailView.h"
 #include "CtDetailViewGenlistItem.h"
 #include "CtDetailViewNumberItem.h"
-#include "CtSimMgr.h"
+#include "CtCommonRecordUtil.h"
 #include "CtCommonWidgetUtil.h"
+#include "CtRegistryMgr.h"
+#include "CtSimMgr.h"
 #include "LogSink.h"
 #include "ScreenHarness.h"
 
@@ -20,10 +23,22 @@
 #include <vconf.h>
 
 #include <cstdio>
+#include <filesystem>
+#include <fstream>
+#include <iterator>
 
 using namespace ct::test;
 
 namespace {
+
+// Where the screen tests leave pictures for review.
+std::string shotPath(const std::string& file)
+{
+	const char* bin = getenv("CONTACTS_TEST_BIN_DIR");
+	std::string dir = std::string(bin ? bin : "/tmp") + "/test-output/detail";
+	std::filesystem::create_directories(dir);
+	return dir + "/" + file;
+}
 
 // A screen pushed above the detail screen.
 class CoverView : public app_assist::WView {
@@ -121,6 +136,11 @@ protected:
 		std::string path = m_dir.file(name);
 		Evas_Object* image = evas_object_image_filled_add(evas_object_evas_get(m_screen->win()));
 		evas_object_image_size_set(image, 320, 320);
+		// Two colour bands, so a picture shown can be told from none.
+		auto* pixels = static_cast<uint32_t*>(evas_object_image_data_get(image, EINA_TRUE));
+		for (int i = 0; pixels && i < 320 * 320; ++i)
+			pixels[i] = i < 320 * 160 ? 0xFF3C78B4 : 0xFFE8A33C;
+		evas_object_image_data_set(image, pixels);
 		evas_object_image_save(image, path.c_str(), nullptr, nullptr);
 		evas_object_del(image);
 		return path;
@@ -155,14 +175,70 @@ TEST_F(CtDetailViewTest, PersonIdComesFromTheRequestOnlyWhenNoIdIsGiven)
 	EXPECT_EQ(0, CtDetailView::personIdFromRequest(Launch(APP_CONTROL_OPERATION_PICK, {{"person_id", "12"}}).get()));
 	EXPECT_TRUE(ct::log::contains("* Critical * wrong operation requested " APP_CONTROL_OPERATION_PICK));
 	EXPECT_EQ(0, CtDetailView::personIdFromRequest(nullptr));
+}
 
-	// An explicit id wins over the request's extra data.
-	int personId = addSimplePerson("Given");
-	Launch other(nullptr, {{"ct_person_id", "34"}});
-	auto* view = static_cast<CtDetailView*>(createCtDetailView(personId, other.get()));
-	ASSERT_TRUE(m_screen->push(view));
-	EXPECT_EQ(personId, view->getPersoinId());
-	EXPECT_EQ("Given", ScreenHarness::naviText(view));
+TEST_F(CtDetailViewTest, TheFactoryShowsThePersonTheRequestNamesUnlessAnIdIsGiven)
+{
+	const std::string first = std::to_string(addSimplePerson("First"));
+	const std::string second = std::to_string(addSimplePerson("Second"));
+	struct Case {
+		int givenId;
+		const char* operation;
+		std::map<std::string, std::string> extras;
+		std::string title; // empty: the screen of no person
+	};
+	const Case cases[] = {
+		{0, nullptr, {{"person_id", first}, {"ct_person_id", second}}, "Second"},
+		{0, APP_CONTROL_OPERATION_DEFAULT, {{"person_id", first}}, "First"},
+		{0, APP_CONTROL_OPERATION_VIEW, {{APP_CONTROL_DATA_ID, second}, {"person_id", first}}, "Second"},
+		{0, APP_CONTROL_OPERATION_VIEW, {{"person_id", first}}, ""},
+		{0, APP_CONTROL_OPERATION_PICK, {{"person_id", first}}, ""},
+		{std::stoi(first), nullptr, {{"ct_person_id", second}}, "First"},
+	};
+	for (const Case& c : cases) {
+		SCOPED_TRACE(c.title + " " + (c.operation ? c.operation : "none"));
+		Launch launch(c.operation, c.extras);
+		auto* view = static_cast<CtDetailView*>(createCtDetailView(c.givenId, launch.get()));
+		ASSERT_TRUE(m_screen->push(view));
+		EXPECT_EQ(c.title.empty() ? 0 : std::stoi(c.title == "First" ? first : second), view->getPersoinId());
+		EXPECT_EQ(c.title.empty() ? ContactsCommon::translate("IDS_LOGS_MBODY_UNKNOWN") : c.title, ScreenHarness::naviText(view));
+		view->popOut();
+		ASSERT_TRUE(m_screen->pumpUntil([this] { return m_screen->viewCount() == 0; }));
+	}
+}
+
+TEST_F(CtDetailViewTest, SubtitleShowsPhoneticNameNicknameAndCompanyOnceEach)
+{
+	struct Case {
+		const char* phonetic;
+		const char* nickname;
+		const char* company;
+		std::string subtitle;
+	};
+	const Case cases[] = {
+		{"An", "Annie", "Acme", "An,Annie,Acme"},
+		{nullptr, "Dieguito", nullptr, "Dieguito"},
+		{"An", nullptr, "Acme", "An,Acme"},
+		{nullptr, "Annie", "Acme", "Annie,Acme"},
+		{"An", "Annie", nullptr, "An,Annie"},
+		{nullptr, nullptr, nullptr, ""},
+	};
+	for (const Case& c : cases) {
+		SCOPED_TRACE(c.subtitle);
+		contacts_record_h contact = newContact(0, "Ann");
+		contacts_record_h name = nullptr;
+		contacts_record_get_child_record_at_p(contact, _contacts_contact.name, 0, &name);
+		if (c.phonetic)
+			contacts_record_set_str(name, _contacts_name.phonetic_first, c.phonetic);
+		if (c.nickname)
+			addText(contact, _contacts_contact.nickname, _contacts_nickname._uri, _contacts_nickname.name, c.nickname);
+		if (c.company)
+			addText(contact, _contacts_contact.company, _contacts_company._uri, _contacts_company.name, c.company);
+		CtDetailView* view = show(personOf(store(contact)));
+		EXPECT_EQ(c.subtitle, ScreenHarness::naviText(view, "subtitle"));
+		view->popOut();
+		ASSERT_TRUE(m_screen->pumpUntil([this] { return m_screen->viewCount() == 0; }));
+	}
 }
 
 TEST_F(CtDetailViewTest, RowsFollowTheKindOrderSixInTheFirstFrameThenOnePerFrame)
@@ -206,7 +282,7 @@ TEST_F(CtDetailViewTest, RowsFollowTheKindOrderSixInTheFirstFrameThenOnePerFrame
 
 TEST_F(CtDetailViewTest, SimContactAndPersonWithoutNumbersGetFewerRows)
 {
-	int sim = addAddressbook(CONTACTS_SIM1_ADDRESS_BOOK_NAME, 0, 0, CONTACTS_SIM1_ADDRESS_BOOK_NAME);
+	int sim = addAddressbook(CONTACTS_SIM1_ADDRESS_BOOK_NAME, 0, 0, CONTACTS_SIM1_PROVIDER_NAME);
 	contacts_record_h simContact = newContact(sim, "Taxi");
 	addNumber(simContact, "+44 20 7946 0000", CONTACTS_NUMBER_TYPE_CELL);
 	contacts_record_set_str(simContact, _contacts_contact.ringtone_path, "/opt/ringtones/Bell.ogg");
@@ -296,6 +372,136 @@ TEST_F(CtDetailViewTest, FavouriteTapsSettleIntoOneSignalWithoutRebuilding)
 	EXPECT_EQ(1, signals.count(CT_REGISTRY_KEY_FAVORITE_CHANGED));
 	EXPECT_EQ(0, view->getRebuildCount());
 	EXPECT_FALSE(CtDetailData(personId).isFavorite());
+}
+
+TEST_F(CtDetailViewTest, TheStarShowsTheStoredStateAfterEveryRebuild)
+{
+	int personId = addSimplePerson("Star");
+	CtDetailView* view = show(personId);
+	ASSERT_NE(nullptr, favoriteCheck(view));
+	EXPECT_FALSE(elm_check_state_get(favoriteCheck(view)));
+
+	// Made a favourite elsewhere (another screen, another process).
+	CtDetailData(personId).setFavorite(true);
+	ASSERT_TRUE(m_screen->pumpUntil([view] { return view->getRebuildCount() == 1; }, 4.0));
+	ASSERT_NE(nullptr, favoriteCheck(view));
+	EXPECT_TRUE(elm_check_state_get(favoriteCheck(view)));
+
+	// So the next tap does what the user sees: it takes the star away.
+	tap(favoriteCheck(view));
+	m_screen->pumpUntilIdle();
+	EXPECT_FALSE(elm_check_state_get(favoriteCheck(view)));
+	EXPECT_FALSE(CtDetailData(personId).isFavorite());
+}
+
+// The picture shown in a picture row: the file of its image (an edje file
+// for the default silhouette).
+std::string shownPicture(CtDetailViewGenlistItem* row)
+{
+	Evas_Object* layout = elm_object_item_part_content_get(row->getElmObjectItem(), "elm.icon");
+	Evas_Object* image = layout ? elm_object_part_content_get(layout, "elm.swallow.content") : nullptr;
+	const char* file = nullptr;
+	if (image)
+		elm_image_file_get(image, &file, nullptr);
+	return file ? file : "";
+}
+
+TEST_F(CtDetailViewTest, ADirectoryEntryShowsItsPictureAndNoStar)
+{
+	std::string picture = writePicture("gal.png");
+	CtGalSearchData gal = {nullptr, picture.c_str(), "Gal Person", "0201234567", nullptr, "02 555 0188",
+		"gal@example.com", "Corp"};
+	auto* view = static_cast<CtDetailView*>(createCtDetailViewForGalSearch(&gal));
+	// At the phone's size, in English and with the host's title colour, saved for review.
+	m_screen = std::make_unique<ScreenHarness>(360, 640);
+	CtView::changeLanguage("en_US.UTF-8");
+	for (const char* text : {"/fg/normal/naviframe/text/title", "/fg/normal/naviframe/text/subtitle"})
+		edje_color_class_set(text, 31, 35, 40, 255, 0, 0, 0, 0, 0, 0, 0, 0);
+	ASSERT_TRUE(m_screen->push(view));
+	EXPECT_TRUE(m_screen->savePng(shotPath("directory-entry.png")));
+	for (const char* text : {"/fg/normal/naviframe/text/title", "/fg/normal/naviframe/text/subtitle"})
+		edje_color_class_del(text);
+	auto pictures = rowsOfKind(view, DETAIL_ITEM_MULTI_IMAGE);
+	ASSERT_EQ(1u, pictures.size());
+	EXPECT_EQ(picture, shownPicture(pictures[0]));
+	EXPECT_EQ(picture, pictures[0]->getCopyText());
+	EXPECT_EQ(nullptr, favoriteCheck(view));
+	EXPECT_EQ("Corp", ScreenHarness::naviText(view, "subtitle"));
+}
+
+TEST_F(CtDetailViewTest, EventsWhoseStoredDateIsNoCalendarDateAreNotShown)
+{
+	contacts_record_h contact = newContact(0, "Dates");
+	// No year, month 7, day 0; February 30; a month 13; a real date.
+	for (int date : {700, 19900230, 20011315, 19900315, 229}) {
+		contacts_record_h event = addChild(contact, _contacts_contact.event, _contacts_event._uri);
+		contacts_record_set_int(event, _contacts_event.date, date);
+		contacts_record_set_int(event, _contacts_event.type, CONTACTS_EVENT_TYPE_BIRTH);
+	}
+	ct::log::clear();
+	CtDetailView* view = show(personOf(store(contact)));
+	auto events = rowsOfKind(view, DETAIL_ITEM_EVENT);
+	std::vector<std::string> shown;
+	for (auto* row : events)
+		shown.push_back(ScreenHarness::itemText(row->getElmObjectItem(), "elm.text.main.left.bottom"));
+	CtDetailData* data = view->getDetailData();
+	// February 29 without a year is a birthday some years have.
+	EXPECT_EQ((std::vector<std::string>{CtCommonGetDatetimeStr(data->getTimeFormatter(), 1990, 3, 15),
+				  CtCommonGetDatetimeStr(data->getTimeFormatterWithoutYear(), 0, 2, 29)}),
+			shown);
+	EXPECT_TRUE(ct::log::contains("* Critical * Invalid date(mon=7,day=0)"));
+	EXPECT_TRUE(ct::log::contains("* Critical * Invalid date(mon=2,day=30)"));
+}
+
+TEST_F(CtDetailViewTest, AnAllocationFailureWhileLoadingThePersonLeavesNoSettingsListenerBehind)
+{
+	int personId = addSimplePerson("Spare");
+	size_t listeners = CtRegistryMgr::getInstance()->getVconfListenerCount(VCONFKEY_SETAPPL_PSMODE);
+	failNextAllocationOf(sizeof(CtDetailData));
+	EXPECT_THROW(createCtDetailView(personId, nullptr), std::bad_alloc);
+	failNextAllocationOf(0);
+	EXPECT_EQ(listeners, CtRegistryMgr::getInstance()->getVconfListenerCount(VCONFKEY_SETAPPL_PSMODE));
+	// A change of the setting reaches no half-built screen.
+	vconf_set_int(VCONFKEY_SETAPPL_PSMODE, 1);
+	m_screen->pumpUntilIdle();
+	vconf_set_int(VCONFKEY_SETAPPL_PSMODE, 0);
+
+	// The next screen is built as usual.
+	CtDetailView* view = show(personId);
+	EXPECT_EQ("Spare", ScreenHarness::naviText(view));
+	EXPECT_EQ(listeners + 1, CtRegistryMgr::getInstance()->getVconfListenerCount(VCONFKEY_SETAPPL_PSMODE));
+}
+
+// The PNG of the screen of a person with just a name, saved for review.
+std::string shotOfPersonNamed(ScreenHarness& screen, CtDetailView* view, const std::string& file)
+{
+	std::string path = shotPath(file);
+	EXPECT_TRUE(screen.savePng(path));
+	view->popOut();
+	screen.pumpUntil([&screen] { return screen.viewCount() == 0; });
+	std::ifstream in(path, std::ios::binary);
+	return std::string((std::istreambuf_iterator<char>(in)), std::istreambuf_iterator<char>());
+}
+
+TEST_F(CtDetailViewTest, ChineseAndKoreanNamesAreDrawnInTheirOwnLetters)
+{
+	// The title in the host's dark text colour (the toolkit's own is white).
+	edje_color_class_set("/fg/normal/naviframe/text/title", 31, 35, 40, 255, 0, 0, 0, 0, 0, 0, 0, 0);
+	// Names of as many letters: drawn as boxes (no font has the letters),
+	// two names give the same picture.
+	const std::pair<const char*, const char*> pairs[] = {{"王芳", "李娜"}, {"김민준", "이서연"}};
+	int shot = 0;
+	for (const auto& [first, second] : pairs) {
+		SCOPED_TRACE(first);
+		CtDetailView* view = show(addSimplePerson(first));
+		ASSERT_EQ(first, ScreenHarness::naviText(view));
+		std::string firstShot = shotOfPersonNamed(*m_screen, view, "script-name-" + std::to_string(++shot) + ".png");
+		view = show(addSimplePerson(second));
+		std::string secondShot = shotOfPersonNamed(*m_screen, view, "script-name-" + std::to_string(++shot) + ".png");
+		ASSERT_FALSE(firstShot.empty());
+		EXPECT_TRUE(firstShot != secondShot) << "the same picture for " << first << " and " << second;
+	}
+	edje_color_class_del("/fg/normal/naviframe/text/title");
 }
 
 TEST_F(CtDetailViewTest, PowerSavingDisablesVideoCallEmailAndAddressRowsWhileOn)

@@ -14,7 +14,7 @@ namespace {
 int simBook(int slot)
 {
 	QueryOwner q(_contacts_address_book._uri);
-	contacts_filter_add_str(q.filter, _contacts_address_book.name, CONTACTS_MATCH_EXACTLY, slot == 0 ? "SIM1" : "SIM2");
+	contacts_filter_add_str(q.filter, _contacts_address_book.name, CONTACTS_MATCH_EXACTLY, slot == 0 ? CONTACTS_SIM1_ADDRESS_BOOK_NAME : CONTACTS_SIM2_ADDRESS_BOOK_NAME);
 	std::vector<int> ids = q.run(_contacts_address_book.id);
 	return ids.empty() ? -1 : ids[0];
 }

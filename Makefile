@@ -38,6 +38,10 @@ test-asan: build-asan
 
 test: test-normal test-asan
 
+# The long versions of the reliability tests (kills, soak, writers, factory fuzz).
+test-long: build
+	@cd $(BUILD) && CONTACTS_TEST_LONG=1 CONTACTS_FUZZ_RUNS=20000 ctest -L long --output-on-failure -j$(JOBS)
+
 run: build
 	@scripts/run-demo $(BUILD)
 

@@ -2,7 +2,9 @@
 
 #include "ContactsCommon.h"
 
+#include <algorithm>
 #include <cstring>
+#include <string>
 
 namespace ct::demo {
 
@@ -42,7 +44,12 @@ void PersonListItem::onSelect(Elm_Object_Item* item)
 char* PersonListItem::__getTextCb(void* data, Evas_Object*, const char* part)
 {
 	auto* self = static_cast<PersonListItem*>(data);
-	return strcmp(part, "elm.text") == 0 ? strdup(self->m_person.name.c_str()) : nullptr;
+	if (strcmp(part, "elm.text") != 0)
+		return nullptr;
+	// A stored name is text on one line, never markup for the row to interpret.
+	std::string line = self->m_person.name;
+	std::replace_if(line.begin(), line.end(), [](char c) { return c >= 0 && c < ' '; }, ' ');
+	return elm_entry_utf8_to_markup(line.c_str());
 }
 
 Evas_Object* PersonListItem::__getContentCb(void* data, Evas_Object* obj, const char* part)

@@ -2,6 +2,7 @@
 // command line is one input, then `-runs=N` random inputs (default 1000) of
 // up to 1.5 KiB, biased towards UTF-8 and markup so the text paths are reached.
 // The seed is printed so that a failing run can be repeated (-seed=S).
+// CONTACTS_FUZZ_RUNS, when set, overrides -runs (the long test mode).
 #include <cstdint>
 #include <cstdio>
 #include <cstdlib>
@@ -63,6 +64,8 @@ int main(int argc, char** argv)
 		else if (argv[i][0] != '-' && !runFile(argv[i]))
 			return 1;
 	}
+	if (const char* longRuns = getenv("CONTACTS_FUZZ_RUNS"))
+		runs = strtol(longRuns, nullptr, 10);
 	printf("seed %lu, %ld random inputs\n", seed, runs);
 	std::mt19937 rng(static_cast<std::mt19937::result_type>(seed));
 	LLVMFuzzerTestOneInput(nullptr, 0);

@@ -31,6 +31,8 @@
 #include "CtSimMgr.h"
 #include "CtThemeMgr.h"
 #include "WNaviframe.h"
+
+#include <glib.h>
 #include "WPopup.h"
 
 #include <app_control.h>
@@ -94,6 +96,22 @@ int readExtraId(app_control_h request, const char* key, bool* present = nullptr)
 	int id = parseId(value);
 	free(value);
 	return id;
+}
+
+// The toolkit composes title texts in fixed buffers and aborts on very long
+// ones; no one reads past the first few lines of a title anyway.
+constexpr glong kTitleMostCharacters = 256;
+
+std::string titleMarkup(const char* text)
+{
+	if (!text || !*text)
+		return "";
+	gchar* valid = g_utf8_make_valid(text, -1);
+	gchar* shortened = g_utf8_substring(valid, 0, std::min(g_utf8_strlen(valid, -1), kTitleMostCharacters));
+	std::string markup = ctCommonUtf8ToMarkup(shortened);
+	g_free(shortened);
+	g_free(valid);
+	return markup;
 }
 
 void appendNonEmpty(std::string& joined, const char* part)
@@ -590,7 +608,7 @@ void CtDetailView::__updateTitle()
 {
 	Elm_Object_Item* naviItem = getNaviItem();
 	WPRET_M(!naviItem, "naviItem is nullptr");
-	std::string title = ctCommonUtf8ToMarkup(m_detailData->getDisplayName());
+	std::string title = titleMarkup(m_detailData->getDisplayName());
 	if (title.empty())
 		title = ContactsCommon::translate("IDS_LOGS_MBODY_UNKNOWN");
 	elm_object_item_part_text_set(naviItem, "elm.text.title", title.c_str());
@@ -599,7 +617,7 @@ void CtDetailView::__updateTitle()
 	appendNonEmpty(subtitle, m_detailData->getExtraName1Second());
 	appendNonEmpty(subtitle, m_detailData->getExtraName1First());
 	appendNonEmpty(subtitle, m_detailData->getCompany());
-	elm_object_item_part_text_set(naviItem, "subtitle", subtitle.empty() ? nullptr : ctCommonUtf8ToMarkup(subtitle.c_str()).c_str());
+	elm_object_item_part_text_set(naviItem, "subtitle", subtitle.empty() ? nullptr : titleMarkup(subtitle.c_str()).c_str());
 }
 
 // After every rebuild the star shows the stored state: the person may have

@@ -8,6 +8,7 @@
 #include "ui_extension.h"
 
 
+#include <algorithm>
 #include <cstdint>
 #include <cstring>
 #include <functional>
@@ -133,7 +134,13 @@ std::string CtDetailViewGenlistItem::translate(const char* textId)
 
 std::string CtDetailViewGenlistItem::typeLabel(const char* label)
 {
-	return label && *label ? toMarkup(ContactsCommon::translate(label)) : std::string();
+	if (!label || !*label)
+		return std::string();
+	// A type label is drawn on one line, and the toolkit's one-line ellipsis
+	// breaks on a line break; custom labels are stored as the user typed them.
+	std::string line = ContactsCommon::translate(label);
+	std::replace_if(line.begin(), line.end(), [](char c) { return c == '\n' || c == '\r' || c == '\t'; }, ' ');
+	return toMarkup(line.c_str());
 }
 
 Evas_Object* CtDetailViewGenlistItem::createCopyArea(Evas_Object* genlist, const char* textPart)

@@ -23,7 +23,7 @@ public: // WGenlistItem
 	Elm_Genlist_Item_Class* getItemClassStatic() override;
 
 protected: // CtInputViewFieldItem
-	EntrySpec getEntrySpec() const override { return {"IDS_PB_BODY_ADDRESS_ABB2", true, 1000, ELM_INPUT_PANEL_LAYOUT_NORMAL, false, "elm.icon.2", kAddKind}; }
+	EntryTraits getEntryTraits() const override { return {"IDS_PB_BODY_ADDRESS_ABB2", true, 1000, ELM_INPUT_PANEL_LAYOUT_NORMAL, false, "elm.icon.2", kAddKind}; }
 	std::string readText() override;
 	void writeText(const char* text) override;
 	bool hasTypes() const override { return true; }

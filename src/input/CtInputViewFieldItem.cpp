@@ -57,12 +57,12 @@ void CtInputViewFieldItem::addCurrentCustomChoice(std::vector<CtInputViewTypeSel
 
 Evas_Object* CtInputViewFieldItem::getContent(Evas_Object* genlist, const char* part)
 {
-	EntrySpec spec = getEntrySpec();
+	EntryTraits traits = getEntryTraits();
 	if (strcmp(part, "elm.icon.entry") == 0)
 		return __createEntry(genlist);
 	if (strcmp(part, "elm.icon.1") == 0 && hasTypes())
 		return __createSelector(genlist);
-	if (spec.deletePart && strcmp(part, spec.deletePart) == 0) {
+	if (traits.deletePart && strcmp(part, traits.deletePart) == 0) {
 		if (isProfileSharingStorage())
 			return nullptr;
 		return ctCommonCreateDeleteImage(genlist, __deleteClickedCb, this);
@@ -72,11 +72,11 @@ Evas_Object* CtInputViewFieldItem::getContent(Evas_Object* genlist, const char* 
 
 Evas_Object* CtInputViewFieldItem::__createEntry(Evas_Object* genlist)
 {
-	EntrySpec spec = getEntrySpec();
-	Evas_Object* field = createEditField(genlist, spec.guideTextId, spec.multiline, spec.maxChars);
+	EntryTraits traits = getEntryTraits();
+	Evas_Object* field = createEditField(genlist, traits.guideTextId, traits.multiline, traits.maxChars);
 	WPRET_VM(!field, nullptr, "layout is NULL");
 	Evas_Object* entry = uxt_edit_field_layout_get_entry(field);
-	elm_entry_input_panel_layout_set(entry, spec.panelLayout);
+	elm_entry_input_panel_layout_set(entry, traits.panelLayout);
 	m_lastText = readText();
 	if (!m_lastText.empty())
 		setEntryText(entry, m_lastText.c_str());
@@ -86,10 +86,10 @@ Evas_Object* CtInputViewFieldItem::__createEntry(Evas_Object* genlist)
 	}
 	for (const char* signal : {"changed", "preedit,changed"})
 		evas_object_smart_callback_add(entry, signal, __entryChangedCb, this);
-	if (spec.passesReturnKey)
+	if (traits.passesReturnKey)
 		evas_object_smart_callback_add(entry, "activated", __entryActivatedCb, this);
 	evas_object_smart_callback_add(entry, "focused", __entryFocusedCb, this);
-	if (spec.focusAddKind && m_addKind == spec.focusAddKind && !m_focusedOnShow) {
+	if (traits.focusAddKind && m_addKind == traits.focusAddKind && !m_focusedOnShow) {
 		// The field is shown as soon as it is made: focus it once the row is on screen.
 		app_assist::WUiTimer::addTimer(kFocusDelay, [this, entry](void*) {
 			__focusOnFirstShow(entry);

@@ -36,7 +36,7 @@ public: // CtInputViewGenlistItem
 	Evas_Object* getHoverselObj() override { return m_hoversel; }
 
 protected:
-	struct EntrySpec {
+	struct EntryTraits {
 		const char* guideTextId;
 		bool multiline;
 		int maxChars;
@@ -51,7 +51,7 @@ protected:
 	CtInputViewFieldItem(std::shared_ptr<CtData> data, contacts_record_h record, int addKind,
 			CtInputViewItemCallbacks callbacks, const char* initialText);
 
-	virtual EntrySpec getEntrySpec() const = 0;
+	virtual EntryTraits getEntryTraits() const = 0;
 	virtual std::string readText() = 0;
 	virtual void writeText(const char* text) = 0;
 	// Type menu in order (none: the row has no selector), the selector's label

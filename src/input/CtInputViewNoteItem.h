@@ -16,7 +16,7 @@ public: // WGenlistItem
 	Elm_Genlist_Item_Class* getItemClassStatic() override;
 
 protected: // CtInputViewFieldItem
-	EntrySpec getEntrySpec() const override { return {"IDS_PB_BUTTON_NOTES", true, 1000, ELM_INPUT_PANEL_LAYOUT_NORMAL, false, "elm.icon.edit", kAddKind}; }
+	EntryTraits getEntryTraits() const override { return {"IDS_PB_BUTTON_NOTES", true, 1000, ELM_INPUT_PANEL_LAYOUT_NORMAL, false, "elm.icon.edit", kAddKind}; }
 	std::string readText() override;
 	void writeText(const char* text) override;
 };

@@ -30,7 +30,7 @@ public: // WGenlistItem
 	Elm_Genlist_Item_Class* getItemClassStatic() override;
 
 protected: // CtInputViewFieldItem
-	EntrySpec getEntrySpec() const override
+	EntryTraits getEntryTraits() const override
 	{
 		return {"IDS_PB_BODY_PHONE_NUMBER_ABB", false, kMaxChars, ELM_INPUT_PANEL_LAYOUT_PHONENUMBER, true, "elm.icon.2",
 			kAddKind};

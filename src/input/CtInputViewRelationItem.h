@@ -25,7 +25,7 @@ public: // WGenlistItem
 	Elm_Genlist_Item_Class* getItemClassStatic() override;
 
 protected: // CtInputViewFieldItem
-	EntrySpec getEntrySpec() const override { return {"IDS_PB_OPT_RELATIONSHIP_ABB2", false, 1000, ELM_INPUT_PANEL_LAYOUT_NORMAL, true, "elm.icon.2", kAddKind}; }
+	EntryTraits getEntryTraits() const override { return {"IDS_PB_OPT_RELATIONSHIP_ABB2", false, 1000, ELM_INPUT_PANEL_LAYOUT_NORMAL, true, "elm.icon.2", kAddKind}; }
 	std::string readText() override;
 	void writeText(const char* text) override;
 	bool hasTypes() const override { return true; }

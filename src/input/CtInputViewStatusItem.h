@@ -19,7 +19,7 @@ public: // WGenlistItem
 	Elm_Genlist_Item_Class* getItemClassStatic() override;
 
 protected: // CtInputViewFieldItem
-	EntrySpec getEntrySpec() const override { return {"IDS_PB_MBODY_STATUS", false, kMaxChars, ELM_INPUT_PANEL_LAYOUT_NORMAL, true, nullptr, 0}; }
+	EntryTraits getEntryTraits() const override { return {"IDS_PB_MBODY_STATUS", false, kMaxChars, ELM_INPUT_PANEL_LAYOUT_NORMAL, true, nullptr, 0}; }
 	std::string readText() override;
 	void writeText(const char* text) override;
 };

@@ -16,7 +16,7 @@ public: // WGenlistItem
 	Elm_Genlist_Item_Class* getItemClassStatic() override;
 
 protected: // CtInputViewFieldItem
-	EntrySpec getEntrySpec() const override { return {"IDS_PB_OPT_WEB_ADDRESS_ABB", false, 1000, ELM_INPUT_PANEL_LAYOUT_URL, true, "elm.icon.2", kAddKind}; }
+	EntryTraits getEntryTraits() const override { return {"IDS_PB_OPT_WEB_ADDRESS_ABB", false, 1000, ELM_INPUT_PANEL_LAYOUT_URL, true, "elm.icon.2", kAddKind}; }
 	std::string readText() override;
 	void writeText(const char* text) override;
 };

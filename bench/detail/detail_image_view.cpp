@@ -2,6 +2,7 @@
 // headless at 360x640: from making the view to the end of the first rendered
 // frame that shows its pager with five pages laid out, against a bare view
 // showing one of the pictures, pushed the same way in the same run.
+#include "BenchLoop.h"
 #include "CtDetailImageView.h"
 #include "CtMyProfileDetailData.h"
 #include "WNaviframe.h"
@@ -21,25 +22,13 @@
 
 namespace {
 
+using ct::bench::pumpFor;
+using ct::bench::pumpUntil;
+
 using Clock = std::chrono::steady_clock;
 
 constexpr int kPages = 5;
 std::string g_dataDir;
-
-Eina_Bool wakeCb(void*)
-{
-	return ECORE_CALLBACK_RENEW;
-}
-
-template <class Done>
-void pumpUntil(Done done, double maxSeconds)
-{
-	Ecore_Timer* wake = ecore_timer_add(0.001, wakeCb, nullptr);
-	double deadline = ecore_time_get() + maxSeconds;
-	while (!done() && ecore_time_get() < deadline)
-		ecore_main_loop_iterate_may_block(EINA_TRUE);
-	ecore_timer_del(wake);
-}
 
 void writePicture(Evas_Object* win, const std::string& path, uint32_t colour)
 {

@@ -3,6 +3,7 @@
 // rows, for a person of 10 linked contacts with over 100 child records,
 // against a bare six-row genlist pushed the same way in the same run; and
 // how many rebuilds a burst of ten changes within two seconds costs.
+#include "BenchLoop.h"
 #include "ContactsBenchData.h"
 #include "ContactsDetails.h"
 #include "CtDetailView.h"
@@ -23,6 +24,9 @@
 #include <vector>
 
 namespace {
+
+using ct::bench::pumpFor;
+using ct::bench::pumpUntil;
 
 using Clock = std::chrono::steady_clock;
 
@@ -61,26 +65,6 @@ protected:
 		return genlist;
 	}
 };
-
-Eina_Bool wakeCb(void*)
-{
-	return ECORE_CALLBACK_RENEW;
-}
-
-template <class Done>
-void pumpUntil(Done done, double maxSeconds)
-{
-	Ecore_Timer* wake = ecore_timer_add(0.001, wakeCb, nullptr);
-	double deadline = ecore_time_get() + maxSeconds;
-	while (!done() && ecore_time_get() < deadline)
-		ecore_main_loop_iterate_may_block(EINA_TRUE);
-	ecore_timer_del(wake);
-}
-
-void pumpFor(double seconds)
-{
-	pumpUntil([] { return false; }, seconds);
-}
 
 // A window with a naviframe, torn down with everything pushed on it.
 class Screen {

@@ -1,5 +1,6 @@
 // Time from pushing a view with a 50-row genlist to its first rendered frame,
 // headless (buffer engine).
+#include "BenchLoop.h"
 #include "WGenlistItem.h"
 #include "WNaviframe.h"
 #include "WView.h"
@@ -13,6 +14,9 @@
 #include <string>
 
 namespace {
+
+using ct::bench::pumpFor;
+using ct::bench::pumpUntil;
 
 constexpr int kRows = 50;
 
@@ -62,26 +66,6 @@ void renderPostCb(void* data, Evas*, void*)
 	*static_cast<bool*>(data) = true;
 }
 
-Eina_Bool wakeCb(void*)
-{
-	return ECORE_CALLBACK_RENEW;
-}
-
-void pumpUntil(const bool& flag, double maxSeconds)
-{
-	Ecore_Timer* wake = ecore_timer_add(0.001, wakeCb, nullptr);
-	double deadline = ecore_time_get() + maxSeconds;
-	while (!flag && ecore_time_get() < deadline)
-		ecore_main_loop_iterate_may_block(EINA_TRUE);
-	ecore_timer_del(wake);
-}
-
-void pumpFor(double seconds)
-{
-	bool never = false;
-	pumpUntil(never, seconds);
-}
-
 void BM_PushListViewToFirstFrame(benchmark::State& state)
 {
 	app_assist::WWindow window("bench", 480, 800);
@@ -94,7 +78,7 @@ void BM_PushListViewToFirstFrame(benchmark::State& state)
 		bool rendered = false;
 		evas_event_callback_add(canvas, EVAS_CALLBACK_RENDER_POST, renderPostCb, &rendered);
 		naviframe->push(new ListView());
-		pumpUntil(rendered, 5.0);
+		pumpUntil([&] { return rendered; }, 5.0);
 		evas_event_callback_del_full(canvas, EVAS_CALLBACK_RENDER_POST, renderPostCb, &rendered);
 		state.PauseTiming();
 		if (!rendered)

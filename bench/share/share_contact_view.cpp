@@ -3,6 +3,7 @@
 // from the factory call to the first drawn frame; one mark (recount, title
 // and preview, which composes the whole text again); and composing the text
 // of a hundred marked fields on its own.
+#include "BenchLoop.h"
 #include "ContactsBenchData.h"
 #include "ContactsDetails.h"
 #include "CtShareContactText.h"
@@ -23,29 +24,12 @@
 
 namespace {
 
+using ct::bench::pumpFor;
+using ct::bench::pumpUntil;
+
 using Clock = std::chrono::steady_clock;
 
 ct::bench::BenchDatabase g_db;
-
-Eina_Bool wakeCb(void*)
-{
-	return ECORE_CALLBACK_RENEW;
-}
-
-template <class Done>
-void pumpUntil(Done done, double maxSeconds)
-{
-	Ecore_Timer* wake = ecore_timer_add(0.001, wakeCb, nullptr);
-	double deadline = ecore_time_get() + maxSeconds;
-	while (!done() && ecore_time_get() < deadline)
-		ecore_main_loop_iterate_may_block(EINA_TRUE);
-	ecore_timer_del(wake);
-}
-
-void pumpFor(double seconds)
-{
-	pumpUntil([] { return false; }, seconds);
-}
 
 double seconds(Clock::time_point from, Clock::time_point to)
 {

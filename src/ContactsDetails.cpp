@@ -1,8 +1,9 @@
-// The library's entry points: the detail screen and the share-fields screen.
+// The library's entry points: the detail screen, the create/edit form and the share-fields screen.
 #include "ContactsDetails.h"
 
 #include "ContactsDebug.h"
 #include "CtDetailView.h"
+#include "CtInputView.h"
 #include "CtShareContactView.h"
 
 app_assist::WView* createCtDetailView(int personId, CtLaunchRequest* request)
@@ -17,6 +18,20 @@ app_assist::WView* createCtDetailViewForGalSearch(void* galData)
 {
 	WENTER();
 	return new CtDetailView(static_cast<const CtGalSearchData*>(galData));
+}
+
+// The input view's framework base is not its first base: the pointer handed
+// out is that of the framework base, which the host deletes through.
+app_assist::WView* createCtInputView(contacts_record_h record, CtLaunchRequest* request)
+{
+	WENTER();
+	return new CtInputView(record, request);
+}
+
+app_assist::WView* createCtInputViewForEditAppControl(CtLaunchRequest* request)
+{
+	WENTER();
+	return new CtInputView(request);
 }
 
 app_assist::WView* createCtShareContactView(int personId, CtLaunchRequest* request)

@@ -14,6 +14,9 @@
 #include "CtDllViewFactory.h"
 #include "CtEsuAgentMgr.h"
 #include "CtInputData.h"
+#include "CtInputViewControl.h"
+#include "WGenlistItem.h"  // before the SIM control, which uses it
+#include "CtInputViewSimControl.h"
 #include "CtRegistryMgr.h"
 #include "CtSimMgr.h"
 #include "CtThemeMgr.h"
@@ -1233,60 +1236,134 @@ void CtInputView::__pushRelationshipPicker()
 		naviframe->push(picker);
 }
 
-// List control access. Until the list controls exist this is a plain list.
+// List control access.
+
+CtInputViewControl* CtInputView::__control() const
+{
+	return static_cast<CtInputViewControl*>(m_control.lock().get());
+}
+
+// SIM_CONTROL_PENDING: the SIM control is not built yet.
+#define SIM_CONTROL_PENDING 1
+
+CtInputViewSimControl* CtInputView::__simControl() const
+{
+	return static_cast<CtInputViewSimControl*>(m_simControl.lock().get());
+}
 
 void CtInputView::__createControl(Evas_Object* layout, bool sim)
 {
-	(void)sim;
-	Evas_Object* genlist = elm_genlist_add(layout);
-	evas_object_size_hint_weight_set(genlist, EVAS_HINT_EXPAND, EVAS_HINT_EXPAND);
-	evas_object_size_hint_align_set(genlist, EVAS_HINT_FILL, EVAS_HINT_FILL);
-	elm_object_part_content_set(layout, "elm.swallow.content", genlist);
-	if (Evas_Object* bg = elm_object_part_content_unset(layout, "elm.swallow.bg"))
-		evas_object_del(bg);
+	app_assist::WControl* control = nullptr;
+	if (sim) {
+		// The SIM form comes with the SIM control; until then a plain list.
+		Evas_Object* genlist = elm_genlist_add(layout);
+		evas_object_size_hint_weight_set(genlist, EVAS_HINT_EXPAND, EVAS_HINT_EXPAND);
+		evas_object_size_hint_align_set(genlist, EVAS_HINT_FILL, EVAS_HINT_FILL);
+		elm_object_part_content_set(layout, "elm.swallow.content", genlist);
+		return;
+	}
+	std::weak_ptr<bool> alive = m_alive;
+	control = new CtInputViewControl(m_data, this,
+		[this, alive](contacts_record_h record) {
+			if (auto isAlive = alive.lock(); isAlive && *isAlive)
+				__editExistContact(record);
+		},
+		[this, alive] {
+			if (auto isAlive = alive.lock(); isAlive && *isAlive)
+				__pushRelationshipPicker();
+		},
+		[this, alive] {
+			if (auto isAlive = alive.lock(); isAlive && *isAlive)
+				__onKeypadDown();
+		});
+	if (!control->create(layout, nullptr)) {
+		WERROR("list control not created");
+		return;
+	}
+	m_control = control->getWeakPtr();
+	elm_object_part_content_set(layout, "elm.swallow.content", control->getEvasObj());
 }
 
 bool CtInputView::__controlIsEmpty()
 {
+	if (CtInputViewControl* control = __control())
+		return control->__checkIsEmpty();
+#if !SIM_CONTROL_PENDING
+	if (CtInputViewSimControl* control = __simControl())
+		return control->getIsEmpty();
+#endif
 	return true;
 }
 
 bool CtInputView::__controlIsChanged()
 {
+	if (CtInputViewControl* control = __control())
+		return control->getIsChanged();
+#if !SIM_CONTROL_PENDING
+	if (CtInputViewSimControl* control = __simControl())
+		return control->getIsChanged();
+#endif
 	return false;
 }
 
 bool CtInputView::__controlCheckEmergencyGroup()
 {
-	return true;
+	CtInputViewControl* control = __control();
+	return !control || control->checkEmergencyGroup();
 }
 
 void CtInputView::__controlUpdateNameRecordForSim()
 {
+#if !SIM_CONTROL_PENDING
+	if (CtInputViewSimControl* control = __simControl())
+		control->updateNameRecordForSim();
+#endif
 }
 
 void CtInputView::__controlHideInputPanel()
 {
+	if (CtInputViewControl* control = __control())
+		control->hideInputPanel();
+	else if (Evas_Object* focused = elm_object_focused_object_get(m_layout))
+		elm_object_focus_set(focused, EINA_FALSE);
 }
 
 void CtInputView::__controlShowCreateKeypad()
 {
+	if (CtInputViewControl* control = __control())
+		control->basicInfoItemShowCreateKeypad();
 }
 
 void CtInputView::__controlFocusForRename()
 {
+	if (CtInputViewControl* control = __control())
+		control->focusForRename();
+#if !SIM_CONTROL_PENDING
+	else if (CtInputViewSimControl* control = __simControl())
+		control->focusForRename();
+#endif
 }
 
 void CtInputView::__controlCloseHoversel()
 {
+	if (CtInputViewControl* control = __control())
+		control->closeHoversel();
 }
 
 void CtInputView::__controlUpdateStorageRow()
 {
+#if !SIM_CONTROL_PENDING
+	if (CtInputViewSimControl* control = __simControl())
+		control->updateAddrBookItem();
+#endif
 }
 
 void CtInputView::__controlUpdateRealizedItems()
 {
+	if (CtInputViewControl* control = __control())
+		control->updateRealizedItems();
+	else if (Evas_Object* genlist = elm_object_part_content_get(m_layout, "elm.swallow.content"))
+		elm_genlist_realized_items_update(genlist);
 }
 
 void CtInputView::__updateTabHostSaveBtn(bool disabled)

@@ -20,6 +20,8 @@ class WPopup;
 
 class CtData;
 class CtEditTabView;
+class CtInputViewControl;
+class CtInputViewSimControl;
 class CtThread;
 
 // The create/edit form of a contact on the phone, an account or a SIM card:
@@ -148,6 +150,8 @@ private:
 	void __readEmptyAndChanged(bool* empty, bool* changed);
 	void __onSimPowerChanged(const char* key);
 
+	CtInputViewControl* __control() const;
+	CtInputViewSimControl* __simControl() const;
 	void __createControl(Evas_Object* layout, bool sim);
 	bool __controlIsEmpty();
 	bool __controlIsChanged();

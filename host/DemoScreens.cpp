@@ -10,8 +10,8 @@ namespace ct::demo {
 
 namespace {
 
-// The first contact of a person, for the edit form; the caller keeps it.
-contacts_record_h firstContactOf(int personId, std::vector<std::shared_ptr<void>>& keepAlive)
+// A copy of a person's first contact, for the edit form (which takes it over).
+contacts_record_h firstContactOf(int personId)
 {
 	contacts_query_h query = nullptr;
 	contacts_filter_h filter = nullptr;
@@ -29,8 +29,6 @@ contacts_record_h firstContactOf(int personId, std::vector<std::shared_ptr<void>
 	}
 	contacts_filter_destroy(filter);
 	contacts_query_destroy(query);
-	if (contact)
-		keepAlive.emplace_back(contact, [](void* record) { contacts_record_destroy(static_cast<contacts_record_h>(record), true); });
 	return contact;
 }
 
@@ -72,8 +70,9 @@ const std::vector<DemoScreen>& demoScreens()
 			}},
 		{"edit", true, "the edit form of a person's first contact",
 			[](DemoScreenContext& c) -> app_assist::WView* {
-				contacts_record_h contact = firstContactOf(c.personId, c.keepAlive);
-				return contact ? make<CreateInputViewFn>(c.library, "createCtInputView", contact, nullptr) : nullptr;
+				auto factory = c.library.factory<CreateInputViewFn>("createCtInputView");
+				contacts_record_h contact = factory ? firstContactOf(c.personId) : nullptr;
+				return contact ? factory(contact, nullptr) : nullptr;
 			}},
 		{"my-profile", false, "the user's own profile",
 			[](DemoScreenContext& c) { return make<CreateMyProfileDetailViewFn>(c.library, "createCtMyProfileDetailView"); }},

@@ -26,10 +26,12 @@
 
 #include <app_control.h>
 #include <app_preference.h>
+#include <glib.h>
 #include <notification.h>
 #include <ui-gadget.h>
 #include <ui_extension.h>
 
+#include <algorithm>
 #include <cerrno>
 #include <climits>
 #include <cstdlib>
@@ -48,7 +50,6 @@ constexpr const char* kSimPower2Key = "db/telephony/sim_power_state2";
 constexpr const char* kDetailsAppId = "contacts-details";
 constexpr double kStorageQuestionDelay = 0.5;
 constexpr double kDetailsLaunchCloseDelay = 2.0;
-constexpr int kNoSpaceError = -28;
 constexpr int kTypePictureCrop = 41;
 constexpr int kTypePrimaryEdit = 112;
 constexpr int kTypeEmergency = 126;
@@ -90,6 +91,20 @@ std::string readOperation(CtLaunchRequest* request)
 	std::string text = operation ? operation : "";
 	free(operation);
 	return text;
+}
+
+// The toolkit composes popup titles in fixed buffers and aborts on very long
+// ones: texts of a request are made valid UTF-8 and cut before they are shown.
+constexpr glong kShownRequestTextCharacters = 256;
+
+std::string shownMarkup(const std::string& text)
+{
+	gchar* valid = g_utf8_make_valid(text.c_str(), -1);
+	gchar* cut = g_utf8_substring(valid, 0, std::min(g_utf8_strlen(valid, -1), kShownRequestTextCharacters));
+	std::string markup = ctCommonUtf8ToMarkup(cut);
+	g_free(cut);
+	g_free(valid);
+	return markup;
 }
 
 bool isSimName(const std::string& name)
@@ -434,14 +449,15 @@ void CtInputView::__attachToSimInThread()
 
 void CtInputView::__showNumberChangingAlert()
 {
-	std::string name = readExtra(m_request, "name");
+	std::string name = shownMarkup(readExtra(m_request, "name"));
 	if (name.empty())
 		name = "Profile sharing";
-	std::string text = "This contact's mobile phone number has changed from " + readExtra(m_request, "previous_number")
-		+ " to " + readExtra(m_request, "new_number") + ". Tap Update to change number.";
+	std::string text = "This contact's mobile phone number has changed from "
+		+ shownMarkup(readExtra(m_request, "previous_number")) + " to " + shownMarkup(readExtra(m_request, "new_number"))
+		+ ". Tap Update to change number.";
 	auto* popup = new app_assist::WPopup();
-	popup->setTitle(ctCommonUtf8ToMarkup(name.c_str()).c_str());
-	popup->setContent(ctCommonUtf8ToMarkup(text.c_str()).c_str());
+	popup->setTitle(name.c_str());
+	popup->setContent(text.c_str());
 	popup->addButton("Ok", [](bool*) {});
 	attachPopup(popup);
 }
@@ -608,7 +624,7 @@ void CtInputView::__saveInEditMode(const std::string& storageName)
 			CtContactsAgentMgr::getInstance()->syncDataStart(m_data->getPersonId());
 	} else {
 		WERROR("update failed %d", err);
-		postToast(err == kNoSpaceError ? "IDS_PB_POP_NOT_ENOUGH_MEMORY" : "IDS_PB_POP_FAILED");
+		postToast(err == CONTACTS_ERROR_FILE_NO_SPACE ? "IDS_PB_POP_NOT_ENOUGH_MEMORY" : "IDS_PB_POP_FAILED");
 	}
 	__replyEdit(success);
 	if (!success && !m_request) {
@@ -661,7 +677,7 @@ void CtInputView::__saveInCreateMode(const std::string& storageName)
 	}
 	if (err != CONTACTS_ERROR_NONE) {
 		WERROR("insert failed %d", err);
-		postToast(err == kNoSpaceError ? "IDS_PB_POP_NOT_ENOUGH_MEMORY" : "IDS_PB_POP_FAILED");
+		postToast(err == CONTACTS_ERROR_FILE_NO_SPACE ? "IDS_PB_POP_NOT_ENOUGH_MEMORY" : "IDS_PB_POP_FAILED");
 		__replyCreate(false, 0);
 		if (!m_request)
 			return;   // the form stays, with what was typed, for another try

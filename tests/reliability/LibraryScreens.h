@@ -16,13 +16,14 @@ namespace ct::test {
 struct ScreenInputs {
 	int personId = 0;
 	CtLaunchRequest* request = nullptr;
-	contacts_record_h record = nullptr;
+	contacts_record_h record = nullptr;   // given away to the factory that takes it
 	const CtGalSearchData* galData = nullptr;
 };
 
 struct LibraryScreen {
 	const char* factory; // the exported name
 	app_assist::WView* (*make)(const ScreenInputs& in);
+	bool takesRecord = false; // the factory owns ScreenInputs::record from then on
 };
 
 inline const std::vector<LibraryScreen>& libraryScreens()
@@ -32,6 +33,10 @@ inline const std::vector<LibraryScreen>& libraryScreens()
 		{ "createCtDetailViewForGalSearch",
 			[](const ScreenInputs& in) { return createCtDetailViewForGalSearch(const_cast<CtGalSearchData*>(in.galData)); } },
 		{ "createCtShareContactView", [](const ScreenInputs& in) { return createCtShareContactView(in.personId, in.request); } },
+		// The form takes the record over.
+		{ "createCtInputView", [](const ScreenInputs& in) { return createCtInputView(in.record, in.request); }, true },
+		{ "createCtInputViewForEditAppControl",
+			[](const ScreenInputs& in) { return createCtInputViewForEditAppControl(in.request); } },
 	};
 	return screens;
 }

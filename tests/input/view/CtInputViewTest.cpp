@@ -4,17 +4,74 @@
 
 #include "ContactsCommon.h"
 #include "ContactsDetails.h"
+#include "CtCommonAddressbookUtil.h"
 #include "CtData.h"
+#include "CtDetailView.h"
 #include "CtInputView.h"
 #include "CtView.h"
 #include "ScreenHarness.h"
+#include "SqliteFaultInjector.h"
+#include "UiGadget.h"
 
 #include <app_preference.h>
 #include <vconf.h>
 
+#include <filesystem>
+#include <fstream>
+
 using namespace ct::test;
 
 namespace {
+
+std::string tr(const char* id)
+{
+	return ContactsCommon::translate(id);
+}
+
+std::string shotPath(const std::string& file)
+{
+	const char* bin = getenv("CONTACTS_TEST_BIN_DIR");
+	std::string dir = std::string(bin ? bin : "/tmp") + "/test-output/input";
+	std::filesystem::create_directories(dir);
+	return dir + "/" + file;
+}
+
+int countContactsNamed(const char* name)
+{
+	contacts_query_h query = nullptr;
+	contacts_filter_h filter = nullptr;
+	contacts_query_create(_contacts_contact._uri, &query);
+	contacts_filter_create(_contacts_contact._uri, &filter);
+	contacts_filter_add_str(filter, _contacts_contact.display_name, CONTACTS_MATCH_EXACTLY, name);
+	contacts_query_set_filter(query, filter);
+	int count = 0;
+	contacts_db_get_count_with_query(query, &count);
+	contacts_filter_destroy(filter);
+	contacts_query_destroy(query);
+	return count;
+}
+
+std::string preferenceText(const char* key)
+{
+	char* value = nullptr;
+	preference_get_string(key, &value);
+	std::string text = value ? value : "";
+	free(value);
+	return text;
+}
+
+// A launch request as a UI-gadget caller makes it; the test owns it.
+struct GadgetLaunch {
+	explicit GadgetLaunch(const char* operation) : owned(request(operation)), gadget("contacts-input")
+	{
+		launch.ug = gadget.handle();
+		launch.appControl = owned.get();
+		launch.callerAppId = "org.velmora.dialer";
+	}
+	Request owned;
+	ct::ug::UiGadget gadget;
+	CtLaunchRequest launch;
+};
 
 class CtInputViewTest : public InputStoreTest {
 protected:
@@ -24,12 +81,16 @@ protected:
 		CtView::changeLanguage("en_US.UTF-8");
 		vconf_set_int(VCONFKEY_SETAPPL_PSMODE, 0);
 		preference_set_boolean("hide_storage_popup", true);
+		ScreenHarness::clearNotices();
 		m_screen = std::make_unique<ScreenHarness>();
 	}
 	void TearDown() override
 	{
 		m_screen.reset();
-		InputStoreTest::TearDown();
+		preference_close_store();
+		// The settings store stays open: it follows the next test's data folder
+		// with its listeners, which the application's singletons registered once.
+		StoreTest::TearDown();
 	}
 
 	CtInputView* open(app_assist::WView* view)
@@ -40,10 +101,39 @@ protected:
 		return input;
 	}
 
+	// What the rows do as the person types a name: the contact takes it and
+	// the view hears that the form is no longer empty.
+	static void typeName(CtInputView* view, const char* name)
+	{
+		view->getData()->setFullName(name);
+		view->updateSaveBtn(false);
+	}
+
+	bool pressDone(CtInputView* view)
+	{
+		bool fired = ScreenHarness::click(view->getDoneButton());
+		m_screen->pumpUntilIdle();
+		return fired;
+	}
+
+	std::string popupTitle() const
+	{
+		std::vector<Evas_Object*> popups = m_screen->findWidgets("Elm_Popup");
+		if (popups.empty())
+			return "";
+		const char* title = elm_object_part_text_get(popups.front(), "title,text");
+		return title ? title : "";
+	}
+
+	bool leaves()
+	{
+		return m_screen->pumpUntil([this] { return m_screen->viewCount() == 0; });
+	}
+
 	std::unique_ptr<ScreenHarness> m_screen;
 };
 
-TEST_F(CtInputViewTest, titleAndButtonsFollowTheMode)
+TEST_F(CtInputViewTest, TitleAndDoneFollowTheModeAndLeavingAnUntouchedFormAsksNothing)
 {
 	int contactId = 0;
 	addSimplePerson("Anna", &contactId);
@@ -59,13 +149,156 @@ TEST_F(CtInputViewTest, titleAndButtonsFollowTheMode)
 	for (const Case& c : cases) {
 		SCOPED_TRACE(c.name);
 		CtInputView* view = open(createCtInputView(c.record, nullptr));
-		EXPECT_EQ(ContactsCommon::translate(c.title), ScreenHarness::naviText(view));
+		EXPECT_EQ(tr(c.title), ScreenHarness::naviText(view));
 		EXPECT_EQ(c.doneDisabled, ScreenHarness::isDisabled(view->getDoneButton()));
 		EXPECT_EQ(-1, view->getInputType());
-		EXPECT_TRUE(m_screen->findButton(ContactsCommon::translate("IDS_TPLATFORM_ACBUTTON_CANCEL_ABB")));
+		EXPECT_TRUE(m_screen->findButton(tr("IDS_TPLATFORM_ACBUTTON_CANCEL_ABB")));
 		m_screen->sendBackKey();
-		EXPECT_TRUE(m_screen->pumpUntil([this] { return m_screen->viewCount() == 0; }));
+		EXPECT_TRUE(leaves());
+		EXPECT_EQ("", popupTitle());
 	}
+}
+
+TEST_F(CtInputViewTest, NameInUseAsksOnceAndSaveAnywayStoresTheSecondContact)
+{
+	addSimplePerson("Anna");
+	CtInputView* view = open(createCtInputView(nullptr, nullptr));
+	typeName(view, "Anna");
+	ASSERT_TRUE(pressDone(view));
+	EXPECT_EQ(tr("IDS_PB_HEADER_NAME_ALREADY_IN_USE_ABB3"), popupTitle());
+	EXPECT_EQ(1, countContactsNamed("Anna"));
+
+	ASSERT_TRUE(ScreenHarness::click(m_screen->findButton(tr("IDS_PB_BUTTON_SAVE_ANYWAY_ABB2"))));
+	ASSERT_TRUE(m_screen->pumpUntil([this] { return dynamic_cast<CtDetailView*>(m_screen->topView()); }));
+	EXPECT_EQ(2, countContactsNamed("Anna"));
+	EXPECT_NE(tr("IDS_PB_HEADER_NAME_ALREADY_IN_USE_ABB3"), popupTitle());
+}
+
+TEST_F(CtInputViewTest, RenameKeepsTheFormWithoutSaving)
+{
+	addSimplePerson("Anna");
+	CtInputView* view = open(createCtInputView(nullptr, nullptr));
+	typeName(view, "Anna");
+	pressDone(view);
+	ASSERT_TRUE(ScreenHarness::click(m_screen->findButton(tr("IDS_PB_BUTTON_RENAME_ABB4"))));
+	m_screen->pumpUntilIdle();
+	EXPECT_EQ(view, m_screen->topView());
+	EXPECT_EQ(1, countContactsNamed("Anna"));
+	EXPECT_FALSE(view->isSaved());
+}
+
+TEST_F(CtInputViewTest, FailedSaveKeepsTheTypedFormForAnotherTryThenTheSavedPersonIsShown)
+{
+	CtInputView* view = open(createCtInputView(nullptr, nullptr));
+	typeName(view, "Zoe Quinn");
+	{
+		ct::db::ScopedWriteFailure full(1);
+		pressDone(view);
+	}
+	EXPECT_EQ(view, m_screen->topView());
+	EXPECT_EQ("Zoe Quinn", view->getData()->getFullName());
+	EXPECT_FALSE(view->isSaved());
+	EXPECT_FALSE(ScreenHarness::isDisabled(view->getDoneButton()));
+	EXPECT_EQ(0, countContactsNamed("Zoe Quinn"));
+	std::vector<std::string> notices = ScreenHarness::notices();
+	ASSERT_FALSE(notices.empty());
+	EXPECT_EQ(tr("IDS_PB_POP_NOT_ENOUGH_MEMORY"), notices.back());
+
+	pressDone(view);
+	ASSERT_TRUE(m_screen->pumpUntil([this] { return dynamic_cast<CtDetailView*>(m_screen->topView()); }));
+	auto* detail = static_cast<CtDetailView*>(m_screen->topView());
+	EXPECT_EQ("Zoe Quinn", ScreenHarness::naviText(detail));
+	EXPECT_EQ(1, countContactsNamed("Zoe Quinn"));
+	EXPECT_EQ(PHONE_ADDRESSBOOK_NAME, preferenceText("input_base_addressbook"));
+	// Back from the new person's screen goes past the form.
+	m_screen->sendBackKey();
+	EXPECT_TRUE(leaves());
+}
+
+TEST_F(CtInputViewTest, AGadgetCallerHearsTheOutcomeOfTheSaveAndIsClosed)
+{
+	// {operation, disk full, reply keys and values}
+	struct Case {
+		const char* operation;
+		bool diskFull;
+		std::map<std::string, std::string> reply;
+	} cases[] = {
+		{nullptr, false, {{"is_success", "1"}}},
+		{APP_CONTROL_OPERATION_DEFAULT, false, {{"is_success", "1"}, {"id", "person"}}},
+		{nullptr, true, {{"is_success", "0"}}},
+		{APP_CONTROL_OPERATION_DEFAULT, true, {{"is_success", "0"}, {"id", ""}}},
+	};
+	int round = 0;
+	for (const Case& c : cases) {
+		SCOPED_TRACE(std::string(c.operation ? c.operation : "none") + (c.diskFull ? " full" : ""));
+		GadgetLaunch launch(c.operation);
+		CtInputView* view = open(createCtInputView(nullptr, &launch.launch));
+		std::string name = "Caller Case " + std::to_string(++round);
+		typeName(view, name.c_str());
+		{
+			std::unique_ptr<ct::db::ScopedWriteFailure> full;
+			if (c.diskFull)
+				full = std::make_unique<ct::db::ScopedWriteFailure>(1);
+			pressDone(view);
+		}
+		ASSERT_EQ(1u, launch.gadget.results().size());
+		for (const auto& [key, value] : c.reply) {
+			std::string got = launch.gadget.resultValue(0, key);
+			if (value == "person")
+				EXPECT_GT(atoi(got.c_str()), 0) << key;
+			else
+				EXPECT_EQ(value, got) << key;
+		}
+		EXPECT_EQ(c.diskFull ? 0 : 1, countContactsNamed(name.c_str()));
+		EXPECT_TRUE(m_screen->pumpUntil([&launch] { return launch.gadget.isDestroyRequested(); }));
+		view->destroy();
+		EXPECT_TRUE(leaves());
+	}
+}
+
+TEST_F(CtInputViewTest, SimFormStaysWhileTheCardInitialisesAndClosesWhenItIsSwitchedOff)
+{
+	std::ofstream(m_dir.file("sim.conf")) << "[SIM1]\n";
+	reopenStore();
+	preference_set_string("input_base_addressbook", CONTACTS_SIM1_ADDRESS_BOOK_NAME);
+	CtInputView* view = open(createCtInputView(nullptr, nullptr));
+	ASSERT_EQ(1, view->getData()->getSimNo());
+	typeName(view, "Sim Sam");
+
+	std::ofstream(m_dir.file("sim.conf")) << "[SIM1]\npresent=0\n";
+	pressDone(view);
+	EXPECT_EQ(view, m_screen->topView());
+	ASSERT_FALSE(ScreenHarness::notices().empty());
+	EXPECT_EQ(tr("IDS_PB_BODY_SIM_CARD_INITIALISING_ING"), ScreenHarness::notices().back());
+	EXPECT_FALSE(view->isSaved());
+
+	vconf_set_int("db/telephony/sim_power_state1", 0);
+	EXPECT_TRUE(leaves());
+	EXPECT_EQ(PHONE_ADDRESSBOOK_NAME, preferenceText("input_base_addressbook"));
+	EXPECT_EQ("", popupTitle());
+}
+
+TEST_F(CtInputViewTest, TheFormOfAContactDeletedElsewhereCloses)
+{
+	int contactId = 0;
+	addSimplePerson("Gone", &contactId);
+	open(createCtInputView(readContact(contactId), nullptr));
+	ASSERT_EQ(CONTACTS_ERROR_NONE, contacts_db_delete_record(_contacts_contact._uri, contactId));
+	EXPECT_TRUE(leaves());
+}
+
+TEST_F(CtInputViewTest, ScreenshotsOfCreateAndEdit)
+{
+	int contactId = 0;
+	addSimplePerson("Anna", &contactId);
+	open(createCtInputView(nullptr, nullptr));
+	m_screen->pumpUntilIdle();
+	EXPECT_TRUE(m_screen->savePng(shotPath("create.png")));
+	m_screen->sendBackKey();
+	ASSERT_TRUE(leaves());
+	open(createCtInputView(readContact(contactId), nullptr));
+	m_screen->pumpUntilIdle();
+	EXPECT_TRUE(m_screen->savePng(shotPath("edit.png")));
 }
 
 } // namespace

@@ -36,6 +36,7 @@
 #include <climits>
 #include <cstdlib>
 #include <cstring>
+#include <mutex>
 #include <string>
 
 namespace {
@@ -217,7 +218,7 @@ CtInputView::~CtInputView()
 		ctCommonUnlinkFile(m_tempFile.c_str());
 	ContactsAppControlLauncher::getInstance()->terminate();
 	m_simThread.reset();
-	CtSimMgr::getInstance()->detach(this);
+	__detachFromSim();
 	if (m_listensToSimPower) {
 		CtRegistryMgr::getInstance()->unRegisterVconfChangedCb(kSimPower1Key, __simPowerChangedCb, this);
 		CtRegistryMgr::getInstance()->unRegisterVconfChangedCb(kSimPower2Key, __simPowerChangedCb, this);
@@ -308,8 +309,7 @@ void CtInputView::onDestroy()
 		evas_object_data_del(m_naviframeObj, kInputNaviItemKey);
 	app_assist::WUiTimer::destroy(m_storageTimer);
 	app_assist::WUiTimer::destroy(m_detailTimer);
-	CtSimMgr::getInstance()->detach(this);
-	m_simAttached = false;
+	__detachFromSim();
 	*m_alive = false;
 }
 
@@ -430,13 +430,26 @@ void CtInputView::__applyStorage(int storageId)
 	destroyPopup();
 }
 
+// The worker may still be attaching when the view goes: the view's
+// detachment and the worker's attachment take the same lock, and the worker
+// attaches nothing once the view has gone.
+struct CtInputView::SimAttachment {
+	std::mutex mutex;
+	bool viewAlive = true;
+};
+
 void CtInputView::__attachToSimInThread()
 {
 	if (m_simThread)
 		return;
-	m_simAttached = true;
-	m_simThread = std::make_unique<CtThread>([this] {
-		CtSimMgr::getInstance()->attach(this);
+	if (!m_simAttachment)
+		m_simAttachment = std::make_shared<SimAttachment>();
+	std::shared_ptr<SimAttachment> attachment = m_simAttachment;
+	CtSimListener* listener = this;
+	m_simThread = std::make_unique<CtThread>([attachment, listener] {
+		std::lock_guard<std::mutex> lock(attachment->mutex);
+		if (attachment->viewAlive)
+			CtSimMgr::getInstance()->attach(listener);
 	}, [this] {
 		m_simThread.reset();
 	});
@@ -445,6 +458,17 @@ void CtInputView::__attachToSimInThread()
 		m_simThread.reset();
 		CtSimMgr::getInstance()->attach(this);
 	}
+}
+
+void CtInputView::__detachFromSim()
+{
+	if (!m_simAttachment) {
+		CtSimMgr::getInstance()->detach(this);
+		return;
+	}
+	std::lock_guard<std::mutex> lock(m_simAttachment->mutex);
+	m_simAttachment->viewAlive = false;
+	CtSimMgr::getInstance()->detach(this);
 }
 
 void CtInputView::__showNumberChangingAlert()

@@ -210,7 +210,8 @@ TEST_F(CtInputViewTest, FailedSaveKeepsTheTypedFormForAnotherTryThenTheSavedPers
 	EXPECT_EQ("Zoe Quinn", ScreenHarness::naviText(detail));
 	EXPECT_EQ(1, countContactsNamed("Zoe Quinn"));
 	EXPECT_EQ(PHONE_ADDRESSBOOK_NAME, preferenceText("input_base_addressbook"));
-	// Back from the new person's screen goes past the form.
+	// The form goes once the new person's screen is in; back then leaves.
+	ASSERT_TRUE(m_screen->pumpUntil([this] { return m_screen->viewCount() == 1; }));
 	m_screen->sendBackKey();
 	EXPECT_TRUE(leaves());
 }
@@ -299,6 +300,49 @@ TEST_F(CtInputViewTest, ScreenshotsOfCreateAndEdit)
 	open(createCtInputView(readContact(contactId), nullptr));
 	m_screen->pumpUntilIdle();
 	EXPECT_TRUE(m_screen->savePng(shotPath("edit.png")));
+}
+
+TEST_F(CtInputViewTest, NewContactsAskWhereToSaveOnceAndSaveRemembersTheAnswer)
+{
+	// {sim.conf, power saving, popup title shown, storage list shown}
+	struct Case {
+		const char* name;
+		const char* sims;
+		int powerSaving;
+		bool asks;
+		bool list;
+	} cases[] = {
+		{"phone only", "", 0, true, false},
+		{"phone only, power saving", "", 1, false, false},
+		{"phone and a SIM", "[SIM1]\n", 0, true, true},
+	};
+	for (const Case& c : cases) {
+		SCOPED_TRACE(c.name);
+		std::ofstream(m_dir.file("sim.conf")) << c.sims;
+		reopenStore();
+		int sim = ctCommonGetAddressBookId(CONTACTS_SIM1_ADDRESS_BOOK_NAME);
+		if (!*c.sims && sim > 0) {
+			ASSERT_EQ(CONTACTS_ERROR_NONE, contacts_db_delete_record(_contacts_address_book._uri, sim));
+		}
+		vconf_set_int(VCONFKEY_SETAPPL_PSMODE, c.powerSaving);
+		preference_set_boolean("hide_storage_popup", false);
+		CtInputView* view = open(createCtInputView(nullptr, nullptr));
+		const std::string question = tr("IDS_PB_HEADER_SAVE_CONTACTS_TO_ABB");
+		bool asked = m_screen->pumpUntil([&] { return popupTitle() == question; }, 2.0);
+		EXPECT_EQ(c.asks, asked);
+		if (asked) {
+			EXPECT_EQ(c.list, m_screen->findWidgets("Elm_Genlist").size() > 1);
+			ASSERT_TRUE(ScreenHarness::click(m_screen->findButton(tr("IDS_PB_BUTTON_SAVE"))));
+			m_screen->pumpUntilIdle();
+			EXPECT_EQ("", popupTitle());
+			bool hide = false;
+			preference_get_boolean("hide_storage_popup", &hide);
+			EXPECT_TRUE(hide);
+			EXPECT_EQ(0, view->getStorageId());
+		}
+		view->destroy();
+		EXPECT_TRUE(leaves());
+	}
 }
 
 } // namespace

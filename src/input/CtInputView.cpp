@@ -1288,7 +1288,11 @@ CtInputViewControl* CtInputView::__control() const
 
 CtInputViewSimControl* CtInputView::__simControl() const
 {
+#if SIM_CONTROL_PENDING
+	return nullptr;
+#else
 	return static_cast<CtInputViewSimControl*>(m_simControl.lock().get());
+#endif
 }
 
 void CtInputView::__createControl(Evas_Object* layout, bool sim)

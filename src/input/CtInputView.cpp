@@ -36,7 +36,7 @@
 #include <climits>
 #include <cstdlib>
 #include <cstring>
-#include <mutex>
+#include <atomic>
 #include <string>
 
 namespace {
@@ -324,8 +324,6 @@ void CtInputView::onPushed(Elm_Object_Item* naviItem)
 	m_isContentMade = true;
 	if (m_isCreateMode && !getPreferenceBool(kHideStoragePopupKey) && m_inputType != kTypeEmergency)
 		__startStorageTimer();
-	if (m_data->checkAddressbookIsSimOrNot(m_storageId))
-		__attachToSimInThread();
 	m_data->attachListener(this);
 	if (m_numberAlert)
 		__showNumberChangingAlert();
@@ -430,26 +428,27 @@ void CtInputView::__applyStorage(int storageId)
 	destroyPopup();
 }
 
-// The worker may still be attaching when the view goes: the view's
-// detachment and the worker's attachment take the same lock, and the worker
-// attaches nothing once the view has gone.
+// The worker may still be attaching when the view goes: the view marks
+// itself gone before it detaches, and a worker that attached and then finds
+// the mark takes the attachment back. (No lock: the attachment may wait for
+// the main loop, which may be in the view's destructor.)
 struct CtInputView::SimAttachment {
-	std::mutex mutex;
-	bool viewAlive = true;
+	std::atomic<bool> viewAlive{true};
 };
 
 void CtInputView::__attachToSimInThread()
 {
-	if (m_simThread)
+	if (m_simThread || m_simAttachment)
 		return;
-	if (!m_simAttachment)
-		m_simAttachment = std::make_shared<SimAttachment>();
+	m_simAttachment = std::make_shared<SimAttachment>();
 	std::shared_ptr<SimAttachment> attachment = m_simAttachment;
 	CtSimListener* listener = this;
 	m_simThread = std::make_unique<CtThread>([attachment, listener] {
-		std::lock_guard<std::mutex> lock(attachment->mutex);
-		if (attachment->viewAlive)
-			CtSimMgr::getInstance()->attach(listener);
+		if (!attachment->viewAlive)
+			return;
+		CtSimMgr::getInstance()->attach(listener);
+		if (!attachment->viewAlive)
+			CtSimMgr::getInstance()->detach(listener);
 	}, [this] {
 		m_simThread.reset();
 	});
@@ -462,12 +461,8 @@ void CtInputView::__attachToSimInThread()
 
 void CtInputView::__detachFromSim()
 {
-	if (!m_simAttachment) {
-		CtSimMgr::getInstance()->detach(this);
-		return;
-	}
-	std::lock_guard<std::mutex> lock(m_simAttachment->mutex);
-	m_simAttachment->viewAlive = false;
+	if (m_simAttachment)
+		m_simAttachment->viewAlive = false;
 	CtSimMgr::getInstance()->detach(this);
 }
 
@@ -499,7 +494,10 @@ void CtInputView::createInputViewControl(Evas_Object* layout, bool sim)
 	}
 	m_control.reset();
 	m_simControl.reset();
+	m_storageId = m_data->getAddressbookId();
 	__createControl(layout, sim);
+	if (sim && isCreated())
+		__attachToSimInThread();
 }
 
 app_assist::WControl* CtInputView::getInputControl() const

@@ -1297,11 +1297,21 @@ void CtInputView::__createControl(Evas_Object* layout, bool sim)
 {
 	app_assist::WControl* control = nullptr;
 	if (sim) {
+#if SIM_CONTROL_PENDING
 		// The SIM form comes with the SIM control; until then a plain list.
 		Evas_Object* genlist = elm_genlist_add(layout);
 		evas_object_size_hint_weight_set(genlist, EVAS_HINT_EXPAND, EVAS_HINT_EXPAND);
 		evas_object_size_hint_align_set(genlist, EVAS_HINT_FILL, EVAS_HINT_FILL);
 		elm_object_part_content_set(layout, "elm.swallow.content", genlist);
+#else
+		control = new CtInputViewSimControl(m_data, this);
+		if (!control->create(layout, nullptr)) {
+			WERROR("SIM control not created");
+			return;
+		}
+		m_simControl = control->getWeakPtr();
+		elm_object_part_content_set(layout, "elm.swallow.content", control->getEvasObj());
+#endif
 		return;
 	}
 	std::weak_ptr<bool> alive = m_alive;
@@ -1362,11 +1372,13 @@ void CtInputView::__controlUpdateNameRecordForSim()
 #endif
 }
 
+// The view waits for the keypad to go down before it leaves: the entry that
+// holds it also gives up the focus, so the keypad cannot stay up.
 void CtInputView::__controlHideInputPanel()
 {
 	if (CtInputViewControl* control = __control())
 		control->hideInputPanel();
-	else if (Evas_Object* focused = elm_object_focused_object_get(m_layout))
+	if (Evas_Object* focused = m_layout ? elm_object_focused_object_get(m_layout) : nullptr)
 		elm_object_focus_set(focused, EINA_FALSE);
 }
 

@@ -12,6 +12,8 @@
 #include "ScreenHarness.h"
 #include "SqliteFaultInjector.h"
 #include "UiGadget.h"
+#include "AppControlRouter.h"
+#include "ContactsAppIds.h"
 
 #include <app_preference.h>
 #include <vconf.h>
@@ -49,6 +51,27 @@ int countContactsNamed(const char* name)
 	contacts_filter_destroy(filter);
 	contacts_query_destroy(query);
 	return count;
+}
+
+int contactIdNamed(const char* name)
+{
+	contacts_query_h query = nullptr;
+	contacts_filter_h filter = nullptr;
+	contacts_list_h list = nullptr;
+	contacts_query_create(_contacts_contact._uri, &query);
+	contacts_filter_create(_contacts_contact._uri, &filter);
+	contacts_filter_add_str(filter, _contacts_contact.display_name, CONTACTS_MATCH_EXACTLY, name);
+	contacts_query_set_filter(query, filter);
+	int id = 0;
+	if (contacts_db_get_records_with_query(query, 0, 1, &list) == CONTACTS_ERROR_NONE) {
+		contacts_record_h first = nullptr;
+		if (contacts_list_get_current_record_p(list, &first) == CONTACTS_ERROR_NONE && first)
+			contacts_record_get_int(first, _contacts_contact.id, &id);
+		contacts_list_destroy(list, true);
+	}
+	contacts_filter_destroy(filter);
+	contacts_query_destroy(query);
+	return id;
 }
 
 std::string preferenceText(const char* key)
@@ -343,6 +366,110 @@ TEST_F(CtInputViewTest, NewContactsAskWhereToSaveOnceAndSaveRemembersTheAnswer)
 		view->destroy();
 		EXPECT_TRUE(leaves());
 	}
+}
+
+// A launch request as another application sends it, with its reply kept.
+struct SentRequest {
+	SentRequest(const char* operation, const std::map<std::string, std::string>& extras)
+	{
+		handler = ct::appcontrol::registerAppHandler("test.form-host", [this](app_control_h request, const ct::appcontrol::Reply&) {
+			app_control_clone(&received, request);
+			return APP_CONTROL_ERROR_NONE;
+		});
+		app_control_h sent = nullptr;
+		app_control_create(&sent);
+		app_control_set_app_id(sent, "test.form-host");
+		app_control_set_operation(sent, operation);
+		for (const auto& [key, value] : extras)
+			app_control_add_extra_data(sent, key.c_str(), value.c_str());
+		app_control_send_launch_request(sent, [](app_control_h, app_control_h reply, app_control_result_e result, void* data) {
+			auto* self = static_cast<SentRequest*>(data);
+			self->result = result;
+			char* id = nullptr;
+			if (reply)
+				app_control_get_extra_data(reply, APP_CONTROL_DATA_ID, &id);
+			self->replyId = id ? id : "";
+			free(id);
+			self->replied = true;
+		}, this);
+		app_control_destroy(sent);
+		launch.appControl = received;
+	}
+	~SentRequest()
+	{
+		ct::appcontrol::ScopedReplyCancel cancel(this);
+		if (received)
+			app_control_destroy(received);
+	}
+	ct::appcontrol::Registration handler;
+	app_control_h received = nullptr;
+	CtLaunchRequest launch;
+	bool replied = false;
+	int result = 99;
+	std::string replyId;
+};
+
+TEST_F(CtInputViewTest, AnApplicationThatAsksToAddHearsTheNewPersonOrTheCancel)
+{
+	for (bool done : {true, false}) {
+		SCOPED_TRACE(done ? "done" : "cancel");
+		SentRequest sent(APP_CONTROL_OPERATION_ADD, {{"type", "not a number"}});
+		ASSERT_TRUE(m_screen->pumpUntil([&sent] { return sent.received != nullptr; }));
+		CtInputView* view = open(createCtInputView(nullptr, &sent.launch));
+		EXPECT_EQ(-1, view->getInputType());
+		const char* name = done ? "Asked For" : "Asked Then Cancelled";
+		typeName(view, name);
+		if (done)
+			pressDone(view);
+		else
+			ASSERT_TRUE(ScreenHarness::click(view->getCancelButton()));
+		ASSERT_TRUE(m_screen->pumpUntil([&sent] { return sent.replied; }));
+		EXPECT_EQ(done ? APP_CONTROL_RESULT_SUCCEEDED : APP_CONTROL_RESULT_CANCELED, sent.result);
+		EXPECT_EQ(done ? 1 : 0, countContactsNamed(name));
+		if (done) {
+			EXPECT_EQ(std::to_string(personOf(contactIdNamed("Asked For"))), sent.replyId);
+		}
+		if (!done && m_screen->findButton(tr("IDS_PB_BUTTON_DISCARD_ABB")))
+			ScreenHarness::click(m_screen->findButton(tr("IDS_PB_BUTTON_DISCARD_ABB")));
+		EXPECT_TRUE(leaves());
+	}
+}
+
+TEST_F(CtInputViewTest, ThePictureCropFlowSetsTheChosenPictureOnTheNewPerson)
+{
+	std::string picture = ContactsCommon::getAppImagePath("contacts_btn_ic_call.png");
+	ASSERT_FALSE(picture.empty());
+	std::vector<std::string> viewerPaths;
+	auto viewer = ct::appcontrol::registerAppHandler(IMAGE_VIEWER_APP_ID,
+		[&](app_control_h request, const ct::appcontrol::Reply& reply) {
+			char* path = nullptr;
+			app_control_get_extra_data(request, "Path", &path);
+			viewerPaths.push_back(path ? path : "");
+			free(path);
+			app_control_h answer = nullptr;
+			app_control_create(&answer);
+			const char* selected[] = {picture.c_str()};
+			app_control_add_extra_data_array(answer, APP_CONTROL_DATA_SELECTED, selected, 1);
+			reply(answer, APP_CONTROL_RESULT_SUCCEEDED);
+			app_control_destroy(answer);
+			return APP_CONTROL_ERROR_NONE;
+		});
+	GadgetLaunch launch(nullptr);
+	app_control_add_extra_data(launch.owned.get(), "type", "41");
+	app_control_add_extra_data(launch.owned.get(), "ct_path", "/tmp/caller-id.png");
+	CtInputView* view = open(createCtInputView(nullptr, &launch.launch));
+	EXPECT_EQ(41, view->getInputType());
+	typeName(view, "Cropped Picture");
+	pressDone(view);
+	ASSERT_TRUE(m_screen->pumpUntil([&launch] { return launch.gadget.isDestroyRequested(); }));
+	EXPECT_EQ(std::vector<std::string>{"/tmp/caller-id.png"}, viewerPaths);
+	EXPECT_EQ("1", launch.gadget.resultValue(0, "is_success"));
+	contacts_record_h stored = readContact(contactIdNamed("Cropped Picture"));
+	ASSERT_TRUE(stored);
+	EXPECT_FALSE(textOf(childAt(stored, _contacts_contact.image, 0), _contacts_image.path).empty());
+	contacts_record_destroy(stored, true);
+	view->destroy();
+	EXPECT_TRUE(leaves());
 }
 
 } // namespace

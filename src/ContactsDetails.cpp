@@ -1,8 +1,9 @@
-// The library's entry points: the detail screen and the share-fields screen.
+// The library's entry points, one per screen.
 #include "ContactsDetails.h"
 
 #include "ContactsDebug.h"
 #include "CtDetailView.h"
+#include "CtMyProfileInputView.h"
 #include "CtShareContactView.h"
 
 app_assist::WView* createCtDetailView(int personId, CtLaunchRequest* request)
@@ -22,4 +23,9 @@ app_assist::WView* createCtDetailViewForGalSearch(void* galData)
 app_assist::WView* createCtShareContactView(int personId, CtLaunchRequest* request)
 {
 	return new CtShareContactView(personId, request);
+}
+
+app_assist::WView* createCtMyProfileInputView(contacts_record_h record, void* hostData)
+{
+	return new CtMyProfileInputView(record, static_cast<CtLaunchRequest*>(hostData));
 }

@@ -2,7 +2,6 @@
 
 #include "ContactsDebug.h"
 #include "CtAddressbookPopup.h"
-#include "CtCommonTextUtil.h"
 #include "CtInputView.h"
 #include "CtInputViewAddrBookItem.h"
 #include "CtInputViewSimEmailItem.h"
@@ -11,8 +10,6 @@
 #include "CtThemeMgr.h"
 #include "WPopup.h"
 #include "WUiTimer.h"
-
-#include <cstdlib>
 
 namespace {
 
@@ -49,7 +46,6 @@ Evas_Object* CtInputViewSimControl::onCreate(Evas_Object* parent, void*)
 	m_genlist = elm_genlist_add(parent);
 	CtThemeMgr::getInstance()->setObjectTheme(m_genlist);
 	elm_genlist_mode_set(m_genlist, ELM_LIST_COMPRESS);
-	elm_genlist_select_mode_set(m_genlist, ELM_OBJECT_SELECT_MODE_ALWAYS);
 	evas_object_size_hint_weight_set(m_genlist, EVAS_HINT_EXPAND, EVAS_HINT_EXPAND);
 	evas_object_size_hint_align_set(m_genlist, EVAS_HINT_FILL, EVAS_HINT_FILL);
 	__addSimAllItems();
@@ -116,6 +112,8 @@ void CtInputViewSimControl::__addSimAllItems()
 	std::string name = m_data->getFullName();
 	m_nameItem = new CtInputViewSimNameItem(m_data, changed, stored ? name.c_str() : nullptr);
 	m_firstItem = __appendRow(m_nameItem);
+	if (!m_firstItem)
+		m_nameItem = nullptr;
 
 	contacts_record_h number = firstOf(m_data->getNumberList());
 	if (!number)

@@ -138,6 +138,13 @@ protected:
 		m_screen->pumpUntilIdle();
 	}
 	static std::string tr(const char* id) { return ContactsCommon::translate(id); }
+	static std::string outputDir()
+	{
+		std::string dir = std::string(getenv("CONTACTS_TEST_BIN_DIR") ? getenv("CONTACTS_TEST_BIN_DIR") : "/tmp")
+			+ "/test-output/input";
+		std::filesystem::create_directories(dir);
+		return dir;
+	}
 
 	std::unique_ptr<ScreenHarness> m_screen;
 	std::weak_ptr<app_assist::WControl> m_ownControl;
@@ -194,6 +201,7 @@ TEST_F(SimControlTest, EmptyAndChangedFollowTypingAndDeletingAndDrivesDone)
 			ScreenHarness::isDisabled(view->getDoneButton()) ? "done off" : "done on"};
 	};
 	EXPECT_EQ((Strings{"empty", "unchanged", "done off"}), state());
+	EXPECT_TRUE(m_screen->savePng(outputDir() + "/sim_form_new.png"));
 	replaceText(number, "+1234");
 	EXPECT_EQ((Strings{"filled", "changed", "done on"}), state());
 	replaceText(number, "");
@@ -290,9 +298,6 @@ TEST_F(SimControlTest, TheCardGetsTheNameAsOneFieldAndTheNumberWithItsPlus)
 	EXPECT_EQ("ada@example.com", textOf(childAt(stored, _contacts_contact.email, 0), _contacts_email.email));
 	contacts_record_destroy(stored, true);
 
-	std::string dir = std::string(getenv("CONTACTS_TEST_BIN_DIR") ? getenv("CONTACTS_TEST_BIN_DIR") : "/tmp")
-		+ "/test-output/input";
-	std::filesystem::create_directories(dir);
-	EXPECT_TRUE(m_screen->savePng(dir + "/sim_form.png"));
+	EXPECT_TRUE(m_screen->savePng(outputDir() + "/sim_form.png"));
 	close();
 }

@@ -123,32 +123,6 @@ TEST_F(SimFieldRowTest, NumberIsCleanedAndALeadingPlusTakesNoRoom)
 	EXPECT_TRUE(emptied.back());
 	EXPECT_TRUE(row->getIsEmpty());
 	EXPECT_FALSE(row->getIsChanged());
-
-	// The cursor stays after the digit it followed once the dash is dropped.
-	replaceText(entry, "12");
-	elm_entry_cursor_pos_set(entry, 1);
-	type(entry, "-");
-	EXPECT_EQ("12", text(entry));
-	EXPECT_EQ(1, elm_entry_cursor_pos_get(entry));
-}
-
-TEST_F(SimFieldRowTest, StoredNameEmptiedIsChangedAndEmptyAndTypedBackIsNeither)
-{
-	contacts_record_h contact = newContact(ctCommonGetAddressBookId(CONTACTS_SIM1_ADDRESS_BOOK_NAME), "Ada");
-	auto data = edit(store(contact));
-	auto* row = new CtInputViewSimNameItem(data, m_calls.callbacks().changed, data->getFullName().c_str());
-	Evas_Object* entry = entryOf(show(row));
-	ASSERT_NE(nullptr, entry);
-	EXPECT_EQ("Ada", text(entry));
-	EXPECT_EQ(std::make_pair(false, false), std::make_pair(row->getIsChanged(), row->getIsEmpty()));
-	EXPECT_EQ(left(11, 14), counter(row));
-
-	replaceText(entry, "");
-	EXPECT_EQ(std::make_pair(true, true), std::make_pair(row->getIsChanged(), row->getIsEmpty()));
-	EXPECT_EQ("", data->getFullName());
-	type(entry, "Ada");
-	EXPECT_EQ(std::make_pair(false, false), std::make_pair(row->getIsChanged(), row->getIsEmpty()));
-	EXPECT_GE(m_calls.changed, 2);
 }
 
 TEST_F(SimFieldRowTest, PastedMegabyteAndBrokenUtf8NeverCrashAndNeverStoreWhatDoesNotFit)

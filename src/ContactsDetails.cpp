@@ -1,8 +1,9 @@
-// The library's entry points: the detail screen and the share-fields screen.
+// The library's entry points: the detail screen, the profile screen and the share-fields screen.
 #include "ContactsDetails.h"
 
 #include "ContactsDebug.h"
 #include "CtDetailView.h"
+#include "CtMyProfileDetailView.h"
 #include "CtShareContactView.h"
 
 app_assist::WView* createCtDetailView(int personId, CtLaunchRequest* request)
@@ -17,6 +18,12 @@ app_assist::WView* createCtDetailViewForGalSearch(void* galData)
 {
 	WENTER();
 	return new CtDetailView(static_cast<const CtGalSearchData*>(galData));
+}
+
+app_assist::WView* createCtMyProfileDetailView()
+{
+	WENTER();
+	return new CtMyProfileDetailView(false);
 }
 
 app_assist::WView* createCtShareContactView(int personId, CtLaunchRequest* request)

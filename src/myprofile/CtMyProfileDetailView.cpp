@@ -168,6 +168,7 @@ void CtMyProfileDetailView::__addAllItems()
 {
 	m_profileSharingItem = nullptr;
 	m_statusItem = nullptr;
+	m_shownProfileId = m_detailData->getPersonRecord() ? m_detailData->getPersonId() : 0;
 	for (int index = ROW_IMAGE; index < ROW_COUNT; ++index)
 		__addItem(index);
 }
@@ -317,7 +318,8 @@ void CtMyProfileDetailView::onDbChanged(const char* viewUri)
 	WDEBUG("changed : %s", viewUri ? viewUri : "");
 	if (m_isClosing)
 		return;
-	if (!m_detailData->getPersonRecord()) {
+	// A screen opened before any profile was stored stays for the one to come.
+	if (!m_detailData->getPersonRecord() && m_shownProfileId > 0) {
 		m_isClosing = true;
 		m_detailData->detachListener();
 		popOut();

@@ -112,6 +112,8 @@ private:
 	app_assist::WUiTimerHandle m_changeTimer;
 	std::unique_ptr<CtDbChangeSubscription> m_changeCounter;
 	int m_pendingChangeCount = 0;
+	// The profile the rows show; 0 while none is stored.
+	int m_shownProfileId = 0;
 	bool m_isClosing = false;
 	int m_rebuildCount = 0;
 };

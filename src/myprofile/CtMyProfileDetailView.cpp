@@ -116,6 +116,14 @@ Evas_Object* CtMyProfileDetailView::onCreate(Evas_Object* parent, void*)
 	ctDetailAddExtensionThemes();
 	CtThemeMgr::getInstance()->setObjectTheme(layout);
 
+	__createGenlist(layout);
+	return layout;
+}
+
+// A fresh list for every build: rows of another height in a list that kept
+// the sizes of the rows it showed before are drawn out of place.
+void CtMyProfileDetailView::__createGenlist(Evas_Object* layout)
+{
 	m_genlist = elm_genlist_add(layout);
 	evas_object_size_hint_weight_set(m_genlist, EVAS_HINT_EXPAND, EVAS_HINT_EXPAND);
 	evas_object_size_hint_align_set(m_genlist, EVAS_HINT_FILL, EVAS_HINT_FILL);
@@ -123,7 +131,6 @@ Evas_Object* CtMyProfileDetailView::onCreate(Evas_Object* parent, void*)
 	__applyHomogeneity();
 	evas_object_show(m_genlist);
 	elm_object_part_content_set(layout, "elm.swallow.content", m_genlist);
-	return layout;
 }
 
 void CtMyProfileDetailView::onCreated()
@@ -297,8 +304,8 @@ void CtMyProfileDetailView::__updateGenlist()
 {
 	WENTER();
 	WPRET_M(!m_genlist, "__genlist is nullptr");
-	elm_genlist_clear(m_genlist);
-	__applyHomogeneity();
+	evas_object_del(m_genlist);
+	__createGenlist(getEvasObj());
 	++m_rebuildCount;
 	__updateTitle();
 	__addAllItems();

@@ -64,6 +64,7 @@ protected:
 
 private:
 	Evas_Object* __getWindow();
+	void __createGenlist(Evas_Object* layout);
 	void __updateBottomButton();
 	void __updateTitle();
 	void __addAllItems();

@@ -215,8 +215,11 @@ TEST_F(CtMyProfileDetailViewTest, RowsFollowTheFixedOrderForEachSharingState)
 				ScreenHarness::itemText(view->getProfileSharingItem(), "elm.text.main.left.bottom"));
 		}
 		EXPECT_FALSE(ScreenHarness::isDisabled(view->getShareButton()));
-		if (c.sharing)
+		if (c.sharing) {
+			// After the rebuild the store's change notice brings.
+			m_screen->pumpUntil([view] { return view->getRebuildCount() > 0; }, 1.0);
 			shotOf("profile-sharing-on");
+		}
 		close(view);
 	}
 

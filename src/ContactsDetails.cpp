@@ -1,9 +1,10 @@
-// The library's entry points: the detail screen, the profile screen and the share-fields screen.
+// The library's entry points, one per screen.
 #include "ContactsDetails.h"
 
 #include "ContactsDebug.h"
 #include "CtDetailView.h"
 #include "CtMyProfileDetailView.h"
+#include "CtMyProfileInputView.h"
 #include "CtShareContactView.h"
 
 app_assist::WView* createCtDetailView(int personId, CtLaunchRequest* request)
@@ -29,4 +30,9 @@ app_assist::WView* createCtMyProfileDetailView()
 app_assist::WView* createCtShareContactView(int personId, CtLaunchRequest* request)
 {
 	return new CtShareContactView(personId, request);
+}
+
+app_assist::WView* createCtMyProfileInputView(contacts_record_h record, void* hostData)
+{
+	return new CtMyProfileInputView(record, static_cast<CtLaunchRequest*>(hostData));
 }

@@ -21,6 +21,7 @@
 #include "CtDetailViewWebsiteItem.h"
 #include "CtEsuAgentMgr.h"
 #include "CtMyProfileDetailData.h"
+#include "CtMyProfileInputView.h"
 #include "CtProfileSharingView.h"
 #include "CtRegistryMgr.h"
 #include "CtThemeMgr.h"
@@ -442,7 +443,9 @@ void CtMyProfileDetailView::__showMoreMenu()
 void CtMyProfileDetailView::__pushEditView()
 {
 	ctCommonInsertUsageLog("CT12", "Edit");
-	WWARNING("the profile edit form is not part of this build");
+	app_assist::WNaviframe* naviframe = getNaviframe();
+	WPRET_M(!naviframe, "naviframe is nullptr");
+	naviframe->push(new CtMyProfileInputView(nullptr, nullptr));
 }
 
 void CtMyProfileDetailView::__openProfileSharing()

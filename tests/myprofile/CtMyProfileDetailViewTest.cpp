@@ -10,6 +10,7 @@
 #include "CtEsuAgentMgr.h"
 #include "CtMyProfileDetailData.h"
 #include "CtMyProfileDetailView.h"
+#include "CtMyProfileInputView.h"
 #include "CtProfileSettingKeys.h"
 #include "CtProfileSharingView.h"
 #include "CtRegistryMgr.h"
@@ -408,11 +409,15 @@ TEST_F(CtMyProfileDetailViewTest, MoreMenuWorksWithTheKeypadUpAndReachesProfileS
 		EXPECT_EQ("Profile sharing", record.extra);
 	}
 
-	// The edit entry is offered and counted.
+	// The edit entry opens the profile's edit form.
 	m_screen->sendMoreKey();
 	ASSERT_NE(nullptr, openMenu(*m_screen));
-	elm_ctxpopup_item_selected_set(menuItem(openMenu(*m_screen), tr("IDS_PB_OPT_EDIT")), EINA_TRUE);
-	m_screen->pumpUntilIdle();
+	EXPECT_TRUE(pushedBy([&] {
+		elm_ctxpopup_item_selected_set(menuItem(openMenu(*m_screen), tr("IDS_PB_OPT_EDIT")), EINA_TRUE);
+	}));
+	auto* editor = dynamic_cast<CtMyProfileInputView*>(m_screen->topView());
+	ASSERT_NE(nullptr, editor);
+	EXPECT_FALSE(editor->isNewProfile());
 	ASSERT_EQ(4u, usage("CT12").size());
 	EXPECT_EQ("Edit", usage("CT12").back().extra);
 }

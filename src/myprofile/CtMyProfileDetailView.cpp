@@ -194,7 +194,7 @@ void CtMyProfileDetailView::__addItem(int index)
 			m_profileSharingItem = __appendItem(new CtDetailViewProfileSharingItem(data));
 		break;
 	case ROW_STATUS:
-		if (esu->getProfileSharingStatus() && data->getStatus())
+		if (esu->getProfileSharingStatus() && data->getStatus() && *data->getStatus())
 			m_statusItem = __appendItem(new CtDetailViewStatusItem(data));
 		break;
 	case ROW_DEFAULT_NUMBER:

@@ -215,7 +215,16 @@ TEST_F(CtMyProfileDetailViewTest, RowsFollowTheFixedOrderForEachSharingState)
 			EXPECT_EQ(tr(c.sharingText.c_str()),
 				ScreenHarness::itemText(view->getProfileSharingItem(), "elm.text.main.left.bottom"));
 		}
-		EXPECT_FALSE(ScreenHarness::isDisabled(view->getShareButton()));
+		// Share sends the profile as a contact.
+		appcontrol::clearLaunches();
+		ASSERT_TRUE(ScreenHarness::click(view->getShareButton()));
+		m_screen->pumpUntilIdle();
+		auto launches = appcontrol::launches();
+		ASSERT_EQ(1u, launches.size());
+		EXPECT_EQ(APP_CONTROL_OPERATION_SHARE, launches[0].operation);
+		EXPECT_EQ("application/vnd.velmora.contact", launches[0].mime);
+		EXPECT_EQ(std::to_string(id), launches[0].extra(APP_CONTROL_DATA_ID));
+		EXPECT_EQ("my_profile", launches[0].extra(APP_CONTROL_DATA_TYPE));
 		if (c.sharing) {
 			// After the rebuild the store's change notice brings.
 			m_screen->pumpUntil([view] { return view->getRebuildCount() > 0; }, 1.0);
@@ -232,6 +241,7 @@ TEST_F(CtMyProfileDetailViewTest, RowsFollowTheFixedOrderForEachSharingState)
 	EXPECT_EQ(std::vector<int>{DETAIL_ITEM_PROFILE_MULTI_IMAGE}, kinds(empty));
 	EXPECT_EQ(tr("IDS_LOGS_MBODY_UNKNOWN"), ScreenHarness::naviText(empty));
 	EXPECT_TRUE(ScreenHarness::isDisabled(empty->getShareButton()));
+	EXPECT_EQ(3u, usage("CT16").size());
 	shotOf("profile-none");
 	// It stays open for the profile that is stored next.
 	storeRichProfile();
@@ -245,18 +255,19 @@ TEST_F(CtMyProfileDetailViewTest, OnlyASingleSmallPictureUsesTheLowStyleAndTappi
 	std::string small = writePicture("small.png", 200, 80, 60, 120);
 	std::string large = writePicture("large.png", 60, 120, 200, 400);
 	struct Case {
-		const char* name;
 		std::vector<std::pair<std::string, int>> pictures;
 		std::string style;
 	};
 	const Case cases[] = {
-		{"one small", {{small, 1}}, "detail.multi.image/low"},
-		{"one large", {{large, 1}}, "detail.multi.image"},
-		{"two small", {{small, 1}, {small, 2}}, "detail.multi.image"},
-		{"none", {}, "detail.multi.image"},
+		{{{large, 1}}, "detail.multi.image"},
+		{{{small, 1}, {small, 2}}, "detail.multi.image"},
+		{{}, "detail.multi.image"},
+		{{{small, 1}}, "detail.multi.image/low"},
 	};
+	CtDetailViewGenlistItem* picture = nullptr;
 	for (const Case& c : cases) {
-		SCOPED_TRACE(c.name);
+		SCOPED_TRACE(c.pictures.size());
+		m_screen->pumpUntil([this] { return m_screen->viewCount() == 0; });
 		removeProfiles();
 		contacts_record_h profile = newProfile("Pia");
 		addProfilePictures(profile, c.pictures);
@@ -264,21 +275,16 @@ TEST_F(CtMyProfileDetailViewTest, OnlyASingleSmallPictureUsesTheLowStyleAndTappi
 		CtMyProfileDetailView* view = show();
 		auto pictures = rowsOfKind(view, DETAIL_ITEM_PROFILE_MULTI_IMAGE);
 		ASSERT_EQ(1u, pictures.size());
-		EXPECT_EQ(c.style, ScreenHarness::itemStyle(pictures[0]->getElmObjectItem()));
-		ASSERT_TRUE(pushedBy([&] { ScreenHarness::selectItem(pictures[0]->getElmObjectItem()); }));
-		auto* pictureView = dynamic_cast<CtDetailImageView*>(m_screen->topView());
-		ASSERT_NE(nullptr, pictureView);
-		EXPECT_TRUE(pictureView->isMyProfile());
-		if (c.pictures.size() == 1 && c.pictures[0].first == small) {
-			m_screen->topView()->popOut();
-			ASSERT_TRUE(m_screen->pumpUntil([this] { return m_screen->viewCount() == 1; }));
-			shotOf("profile-small-picture");
-		}
-		while (m_screen->viewCount() > 0) {
-			m_screen->topView()->popOut();
-			m_screen->pumpUntilIdle();
-		}
+		picture = pictures[0];
+		EXPECT_EQ(c.style, ScreenHarness::itemStyle(picture->getElmObjectItem()));
+		if (c.style != "detail.multi.image/low")
+			view->popOut();
 	}
+	shotOf("profile-small-picture");
+	ASSERT_TRUE(pushedBy([&] { ScreenHarness::selectItem(picture->getElmObjectItem()); }));
+	auto* pictureView = dynamic_cast<CtDetailImageView*>(m_screen->topView());
+	ASSERT_NE(nullptr, pictureView);
+	EXPECT_TRUE(pictureView->isMyProfile());
 }
 
 TEST_F(CtMyProfileDetailViewTest, PowerSavingGreysEmailAndAddressRowsAndTheSharingEntry)
@@ -420,23 +426,4 @@ TEST_F(CtMyProfileDetailViewTest, MoreMenuWorksWithTheKeypadUpAndReachesProfileS
 	EXPECT_FALSE(editor->isNewProfile());
 	ASSERT_EQ(4u, usage("CT12").size());
 	EXPECT_EQ("Edit", usage("CT12").back().extra);
-}
-
-TEST_F(CtMyProfileDetailViewTest, TheShareButtonSendsTheProfileAsAContact)
-{
-	int id = storeRichProfile();
-	CtMyProfileDetailView* view = show();
-	ASSERT_TRUE(ScreenHarness::click(view->getShareButton()));
-	m_screen->pumpUntilIdle();
-	std::vector<appcontrol::LaunchRecord> shares;
-	for (const appcontrol::LaunchRecord& launch : appcontrol::launches()) {
-		if (launch.operation == APP_CONTROL_OPERATION_SHARE)
-			shares.push_back(launch);
-	}
-	ASSERT_EQ(1u, shares.size());
-	EXPECT_EQ("application/vnd.velmora.contact", shares[0].mime);
-	EXPECT_EQ(APP_CONTROL_LAUNCH_MODE_GROUP, shares[0].launchMode);
-	EXPECT_EQ(std::to_string(id), shares[0].extra(APP_CONTROL_DATA_ID));
-	EXPECT_EQ("my_profile", shares[0].extra(APP_CONTROL_DATA_TYPE));
-	EXPECT_EQ(1u, usage("CT16").size());
 }

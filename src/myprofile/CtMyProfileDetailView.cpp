@@ -64,12 +64,6 @@ bool readPowerSaving()
 	return value != 0;
 }
 
-// Multi-line rows (addresses, notes) make rows of different heights.
-bool isHomogeneous(CtMyProfileDetailData* data)
-{
-	return ctDetailHasCompactRows(data);
-}
-
 } // namespace
 
 CtMyProfileDetailView::CtMyProfileDetailView(bool mode)
@@ -316,7 +310,8 @@ void CtMyProfileDetailView::__updateGenlist()
 
 void CtMyProfileDetailView::__applyHomogeneity()
 {
-	elm_genlist_homogeneous_set(m_genlist, isHomogeneous(m_detailData.get()) ? EINA_TRUE : EINA_FALSE);
+	// Several addresses or notes, the rows that wrap, make rows of different heights.
+	elm_genlist_homogeneous_set(m_genlist, ctDetailHasCompactRows(m_detailData.get()) ? EINA_TRUE : EINA_FALSE);
 }
 
 // Called after the data reloaded itself: the rows borrow records that are

@@ -33,9 +33,11 @@
 #include "CtThemeMgr.h"
 #include "WNaviframe.h"
 
+#include <glib.h>
 #include "WPopup.h"
 
 #include <app_control.h>
+#include <csc_feature.h>
 #include <ui_extension.h>
 
 #include <cerrno>

@@ -12,6 +12,9 @@
 #include "CtContactsAgentMgr.h"
 #include "CtDetailView.h"
 #include "CtDllViewFactory.h"
+#if __has_include("CtEditTabView.h")
+#include "CtEditTabView.h"
+#endif
 #include "CtEsuAgentMgr.h"
 #include "CtInputData.h"
 #include "CtInputViewControl.h"
@@ -1281,8 +1284,14 @@ CtInputViewControl* CtInputView::__control() const
 	return static_cast<CtInputViewControl*>(m_control.lock().get());
 }
 
-// SIM_CONTROL_PENDING: the SIM control is not built yet.
+// The SIM control and the edit tab view come from neighbouring work: until
+// their implementations are in the tree the SIM form is a plain list and a
+// tab page has no Save button to drive.
+#if __has_include("CtInputViewSimNameItem.h")
+#define SIM_CONTROL_PENDING 0
+#else
 #define SIM_CONTROL_PENDING 1
+#endif
 
 CtInputViewSimControl* CtInputView::__simControl() const
 {
@@ -1422,5 +1431,9 @@ void CtInputView::__controlUpdateRealizedItems()
 
 void CtInputView::__updateTabHostSaveBtn(bool disabled)
 {
+#if __has_include("CtEditTabView.h")
+	m_tabHost->updateSaveBtn(disabled);
+#else
 	(void)disabled;
+#endif
 }

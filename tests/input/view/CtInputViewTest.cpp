@@ -8,6 +8,7 @@
 #include "CtData.h"
 #include "CtDetailView.h"
 #include "CtInputView.h"
+#include "CtInputViewNumberItem.h"
 #include "CtView.h"
 #include "ScreenHarness.h"
 #include "SqliteFaultInjector.h"
@@ -151,6 +152,43 @@ protected:
 	bool leaves()
 	{
 		return m_screen->pumpUntil([this] { return m_screen->viewCount() == 0; });
+	}
+
+	// Types at the end of the form's first number row, as a person would:
+	// the entry takes the focus, and with it the keypad comes up.
+	static std::vector<CtInputViewNumberItem*> numberRows(CtInputView* view)
+	{
+		Evas_Object* genlist = elm_object_part_content_get(view->getLayout(), "elm.swallow.content");
+		return ScreenHarness::rowsOf<CtInputViewNumberItem>(genlist);
+	}
+
+	// Whether the form lists rows (the list control may not be built yet).
+	bool formHasRows()
+	{
+		CtInputView* view = open(createCtInputView(nullptr, nullptr));
+		bool rows = !numberRows(view).empty();
+		view->destroy();
+		leaves();
+		return rows;
+	}
+
+	void typeNumber(CtInputView* view, const char* text)
+	{
+		auto numbers = numberRows(view);
+		ASSERT_FALSE(numbers.empty());
+		Evas_Object* entry = numbers.front()->getEntry();
+		ASSERT_TRUE(entry);
+		elm_object_focus_set(entry, EINA_TRUE);
+		elm_entry_cursor_end_set(entry);
+		elm_entry_entry_insert(entry, text);
+		m_screen->pumpUntilIdle();
+	}
+
+	static int storePersonWithNumber(const char* name, const char* number)
+	{
+		contacts_record_h contact = newContact(0, name);
+		addNumber(contact, number, CONTACTS_NUMBER_TYPE_CELL);
+		return store(contact);
 	}
 
 	std::unique_ptr<ScreenHarness> m_screen;
@@ -470,6 +508,82 @@ TEST_F(CtInputViewTest, ThePictureCropFlowSetsTheChosenPictureOnTheNewPerson)
 	contacts_record_destroy(stored, true);
 	view->destroy();
 	EXPECT_TRUE(leaves());
+}
+
+TEST_F(CtInputViewTest, LeavingAsksOnlyWhenSomethingWouldBeLost)
+{
+	if (!formHasRows())
+		GTEST_SKIP() << "the form lists no rows yet";
+	int contactId = storePersonWithNumber("Anna", "010");
+	struct Case {
+		const char* name;
+		bool edit;
+		const char* typed;
+		bool asks;
+	} cases[] = {
+		{"create, nothing typed", false, nullptr, false},
+		{"create, a digit typed", false, "5", true},
+		{"edit, unchanged", true, nullptr, false},
+		{"edit, a number added", true, "5", true},
+	};
+	for (const Case& c : cases) {
+		SCOPED_TRACE(c.name);
+		CtInputView* view = open(createCtInputView(c.edit ? readContact(contactId) : nullptr, nullptr));
+		m_screen->pumpUntilIdle();
+		if (c.typed)
+			typeNumber(view, c.typed);
+		m_screen->lowerKeypad();
+		m_screen->sendBackKey();
+		m_screen->pumpUntilIdle();
+		EXPECT_EQ(c.asks ? tr("IDS_PB_HEADER_DISCARD_CHANGES_ABB") : "", popupTitle());
+		if (c.asks) {
+			ASSERT_TRUE(ScreenHarness::click(m_screen->findButton(tr("IDS_PB_BUTTON_CANCEL"))));
+			m_screen->pumpUntilIdle();
+			EXPECT_EQ(view, m_screen->topView());
+			m_screen->sendBackKey();
+			m_screen->pumpUntilIdle();
+			ASSERT_TRUE(ScreenHarness::click(m_screen->findButton(tr("IDS_PB_BUTTON_DISCARD_ABB"))));
+		}
+		EXPECT_TRUE(leaves());
+	}
+	EXPECT_EQ(1, countContactsNamed("Anna"));
+}
+
+// Back with the keypad up first takes the keypad down (the view lets go of
+// the entry); the question comes once it is down.
+TEST_F(CtInputViewTest, WithTheKeypadUpTheDiscardQuestionWaitsForItToGoDown)
+{
+	if (!formHasRows())
+		GTEST_SKIP() << "the form lists no rows yet";
+	CtInputView* view = open(createCtInputView(nullptr, nullptr));
+	typeNumber(view, "0102");
+	ASSERT_TRUE(view->isSipShown());
+	view->popOut();   // what the back key does, without running the loop after it
+	EXPECT_EQ("", popupTitle());
+	EXPECT_TRUE(view->isDiscardPending());
+
+	m_screen->pumpUntilIdle();
+	EXPECT_FALSE(m_screen->isKeypadShown());
+	EXPECT_EQ(tr("IDS_PB_HEADER_DISCARD_CHANGES_ABB"), popupTitle());
+	EXPECT_FALSE(view->isDiscardPending());
+	EXPECT_EQ(view, m_screen->topView());
+}
+
+TEST_F(CtInputViewTest, DoneWithTheKeypadUpSavesAndLeavesOnceTheKeypadIsDown)
+{
+	if (!formHasRows())
+		GTEST_SKIP() << "the form lists no rows yet";
+	int contactId = storePersonWithNumber("Kim", "010");
+	CtInputView* view = open(createCtInputView(readContact(contactId), nullptr));
+	m_screen->pumpUntilIdle();
+	typeNumber(view, "7");
+	ASSERT_TRUE(view->isSipShown());
+	ASSERT_TRUE(pressDone(view));
+	EXPECT_TRUE(leaves());
+	contacts_record_h stored = readContact(contactId);
+	ASSERT_TRUE(stored);
+	EXPECT_EQ("0107", textOf(childAt(stored, _contacts_contact.number, 0), _contacts_number.number));
+	contacts_record_destroy(stored, true);
 }
 
 } // namespace

@@ -26,10 +26,14 @@ contacts_record_h firstContactOf(int personId)
 	contacts_filter_add_int(filter, _contacts_contact.person_id, CONTACTS_MATCH_EQUAL, personId);
 	contacts_query_set_filter(query, filter);
 	if (contacts_db_get_records_with_query(query, 0, 1, &list) == CONTACTS_ERROR_NONE) {
+		// A listed record holds no child records: the contact is read whole.
 		contacts_record_h first = nullptr;
+		int contactId = 0;
 		if (contacts_list_get_current_record_p(list, &first) == CONTACTS_ERROR_NONE && first)
-			contacts_record_clone(first, &contact);
+			contacts_record_get_int(first, _contacts_contact.id, &contactId);
 		contacts_list_destroy(list, true);
+		if (contactId > 0 && contacts_db_get_record(_contacts_contact._uri, contactId, &contact) != CONTACTS_ERROR_NONE)
+			contact = nullptr;
 	}
 	contacts_filter_destroy(filter);
 	contacts_query_destroy(query);

@@ -169,6 +169,8 @@ protected:
 		bool rows = !numberRows(view).empty();
 		view->destroy();
 		leaves();
+		// The new contact's name entry took the keypad; the next form starts without it.
+		m_screen->lowerKeypad();
 		return rows;
 	}
 

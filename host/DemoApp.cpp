@@ -137,8 +137,8 @@ bool DemoApp::__start()
 	}
 	addThemes();
 	applyLightLook();
-	std::vector<std::string> pictures = DemoPictures::ensure();
-	m_handlers = std::make_unique<DemoAppControlHandlers>(pictures.empty() ? "" : pictures.front());
+	// The gallery, camera and editor stand-ins offer the demo pictures.
+	DemoPictures::ensure();
 
 	m_window = std::make_unique<app_assist::WWindow>("Contacts", kWidth, kHeight);
 	Evas_Object* win = m_window->getEvasObj();
@@ -153,6 +153,7 @@ bool DemoApp::__start()
 	if (!m_naviframe->create(m_window->getBaseLayoutEvasObj(), nullptr))
 		return false;
 	m_naviframeAlive = m_naviframe->getWeakPtr();
+	m_handlers = std::make_unique<DemoAppControlHandlers>(m_naviframe, DemoAppControlHandlers::Folders::defaults());
 	evas_object_smart_callback_add(m_naviframe->getEvasObj(), "transition,finished", transitionFinishedCb, &m_pushing);
 	m_window->setContent(m_naviframe->getEvasObj());
 	m_naviframe->setOnLastViewBack([](bool* popOut) {

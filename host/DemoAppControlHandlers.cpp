@@ -84,6 +84,11 @@ std::string detailOf(app_control_h request)
 	std::string uri = textFrom([request](char** text) { return app_control_get_uri(request, text); });
 	if (!uri.empty())
 		return uri;
+	// The message composer's "number/index" is the number, a slash and its record id.
+	std::string numberIndex =
+		textFrom([request](char** text) { return app_control_get_extra_data(request, "number/index", text); });
+	if (!numberIndex.empty())
+		return numberIndex.substr(0, numberIndex.rfind('/'));
 	for (const char* key : {APP_CONTROL_DATA_TEXT, APP_CONTROL_DATA_PHONE, APP_CONTROL_DATA_EMAIL, APP_CONTROL_DATA_URL,
 			 "path", "type"}) {
 		std::string value =
@@ -224,7 +229,7 @@ int DemoAppControlHandlers::__open(Screen& screen, app_control_h request, const 
 	WINFO("demo handler: %s", describe(request).c_str());
 	app_assist::WView* view = screen.make(request, reply);
 	if (!view || !m_naviframe->push(view)) {
-		WERROR("* Critical * the stand-in for \"%s\" did not open", describe(request).c_str());
+		WERROR("the stand-in for \"%s\" did not open", describe(request).c_str());
 		return APP_CONTROL_ERROR_LAUNCH_FAILED;
 	}
 	screen.open = view->getWeakPtr();

@@ -99,7 +99,7 @@ Evas_Object* StandInGroupPickerView::createContent(Evas_Object* parent)
 	std::string selectedText = getExtra("selected_group_id_list");
 	std::vector<int> selected = decodeIds(selectedText);
 	if (selected.empty() && !selectedText.empty())
-		WERROR("* Critical * selected_group_id_list is not a list of ids: %s", selectedText.c_str());
+		WERROR("selected_group_id_list is not a list of ids: %s", selectedText.c_str());
 	std::vector<Group> groups = loadGroups();
 	if (groups.empty())
 		setCaption("There are no groups in the contacts store.");

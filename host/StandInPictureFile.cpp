@@ -53,7 +53,7 @@ bool savePixels(Evas* evas, const uint32_t* pixels, int w, int h, const std::str
 	bool saved = evas_object_image_save(out, path.c_str(), nullptr, "compress=6");
 	evas_object_del(out);
 	if (!saved)
-		WERROR("* Critical * cannot write %s", path.c_str());
+		WERROR("cannot write %s", path.c_str());
 	return saved;
 }
 
@@ -102,7 +102,7 @@ bool StandInPictureFile::writeTinted(const std::string& source, uint32_t rgb, do
 	WPRET_VM(!canvas.ee, false, "ecore_evas_buffer_new() failed");
 	int w = 0, h = 0;
 	Evas_Object* image = loadImage(canvas.evas(), source, w, h);
-	WPRET_VM(!image, false, "* Critical * not a picture: %s", source.c_str());
+	WPRET_VM(!image, false, "not a picture: %s", source.c_str());
 	auto* data = static_cast<const uint32_t*>(evas_object_image_data_get(image, EINA_FALSE));
 	int stride = evas_object_image_stride_get(image) / 4;
 	std::vector<uint32_t> pixels(static_cast<size_t>(w) * h);
@@ -117,12 +117,12 @@ bool StandInPictureFile::writeTinted(const std::string& source, uint32_t rgb, do
 
 bool StandInPictureFile::writeSquareCrop(const std::string& source, int size, const std::string& target)
 {
-	WPRET_VM(size <= 0 || size > kMaxSide, false, "* Critical * crop size %d", size);
+	WPRET_VM(size <= 0 || size > kMaxSide, false, "crop size %d", size);
 	Canvas canvas(size, size);
 	WPRET_VM(!canvas.ee, false, "ecore_evas_buffer_new() failed");
 	int w = 0, h = 0;
 	Evas_Object* image = loadImage(canvas.evas(), source, w, h);
-	WPRET_VM(!image, false, "* Critical * not a picture: %s", source.c_str());
+	WPRET_VM(!image, false, "not a picture: %s", source.c_str());
 	double scale = double(size) / std::min(w, h);
 	int scaledW = static_cast<int>(w * scale + 0.5), scaledH = static_cast<int>(h * scale + 0.5);
 	evas_object_image_filled_set(image, EINA_TRUE);

@@ -95,7 +95,7 @@ void StandInPresetEditorView::__doneClickedCb(void* data, Evas_Object*, void*)
 	std::string styled = self->getStyledPath();
 	std::error_code ec;
 	if (styled.empty() || !std::filesystem::is_regular_file(styled, ec)) {
-		WERROR("* Critical * no styled picture to return");
+		WERROR("no styled picture to return");
 		return;
 	}
 	self->answerText("path", styled);

@@ -112,7 +112,7 @@ void StandInShareView::__saveClickedCb(void* data, Evas_Object*, void*)
 	saved = saved && !ec;
 	if (!saved) {
 		std::filesystem::remove(part, ec);
-		WERROR("* Critical * cannot write %s", path.c_str());
+		WERROR("cannot write %s", path.c_str());
 	}
 	std::string notice = saved ? "Saved to " + path : "Could not save " + path;
 	self->setCaption(notice);

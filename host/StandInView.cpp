@@ -156,7 +156,7 @@ void StandInView::answerSelected(const std::string& path)
 
 Evas_Object* StandInView::addButton(const char* label, Evas_Smart_Cb onClick)
 {
-	WPRET_VM(!m_buttonRow, nullptr, "* Critical * %s: buttons are added while the content is made", label);
+	WPRET_VM(!m_buttonRow, nullptr, "%s: buttons are added while the content is made", label);
 	Evas_Object* button = elm_button_add(m_buttonRow);
 	elm_object_text_set(button, label);
 	evas_object_size_hint_weight_set(button, EVAS_HINT_EXPAND, 0.0);

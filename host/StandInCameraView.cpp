@@ -25,7 +25,7 @@ Evas_Object* StandInCameraView::createContent(Evas_Object* parent)
 	evas_object_size_hint_align_set(m_viewfinder, EVAS_HINT_FILL, EVAS_HINT_FILL);
 	__showFrame();
 	addButton("Turn", __turnClickedCb);
-	Evas_Object* shutter = addButton("Shutter", __shutterClickedCb);
+	Evas_Object* shutter = addButton("Shutter", __shutterClickedCb, true);
 	elm_object_disabled_set(shutter, m_pictures.empty() ? EINA_TRUE : EINA_FALSE);
 	return m_viewfinder;
 }

@@ -50,7 +50,7 @@ Evas_Object* StandInCropView::createContent(Evas_Object* parent)
 	evas_object_size_hint_align_set(image, EVAS_HINT_FILL, EVAS_HINT_FILL);
 	addButton("Cancel", __cancelClickedCb);
 	if (!m_source.empty())
-		addButton("Set", __setClickedCb);
+		addButton("Set", __setClickedCb, true);
 	return image;
 }
 

@@ -112,7 +112,7 @@ Evas_Object* StandInGroupPickerView::createContent(Evas_Object* parent)
 		m_rows.push_back(row);
 	}
 	addButton("Cancel", __cancelClickedCb);
-	addButton("Done", __doneClickedCb);
+	addButton("Done", __doneClickedCb, true);
 	return list;
 }
 

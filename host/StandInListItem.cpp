@@ -7,7 +7,7 @@ namespace ct::demo {
 
 namespace {
 
-constexpr int kPictureSize = 56;
+constexpr int kPictureSize = 44;
 
 Elm_Genlist_Item_Class makeClass(const char* style, Elm_Gen_Item_Text_Get_Cb text, Elm_Gen_Item_Content_Get_Cb content)
 {
@@ -46,8 +46,8 @@ void StandInListItem::setMark(Mark mark, bool marked)
 
 Elm_Genlist_Item_Class* StandInListItem::getItemClassStatic()
 {
-	static Elm_Genlist_Item_Class oneLine = makeClass("default", __getTextCb, __getContentCb);
-	static Elm_Genlist_Item_Class twoLines = makeClass("double_label", __getTextCb, __getContentCb);
+	static Elm_Genlist_Item_Class oneLine = makeClass("1line", __getTextCb, __getContentCb);
+	static Elm_Genlist_Item_Class twoLines = makeClass("2line.top", __getTextCb, __getContentCb);
 	return m_subText.empty() ? &oneLine : &twoLines;
 }
 
@@ -63,9 +63,9 @@ void StandInListItem::onSelect(Elm_Object_Item* item)
 char* StandInListItem::__getTextCb(void* data, Evas_Object*, const char* part)
 {
 	auto* self = static_cast<StandInListItem*>(data);
-	if (strcmp(part, "elm.text") == 0)
+	if (strcmp(part, "elm.text") == 0 || strcmp(part, "elm.text.main.left.top") == 0)
 		return lineMarkup(self->m_text);
-	if (strcmp(part, "elm.text.sub") == 0 && !self->m_subText.empty())
+	if (strcmp(part, "elm.text.sub.left.bottom") == 0 && !self->m_subText.empty())
 		return lineMarkup(self->m_subText);
 	return nullptr;
 }

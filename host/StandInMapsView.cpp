@@ -83,7 +83,7 @@ Evas_Object* StandInMapsView::createContent(Evas_Object* parent)
 	evas_object_size_hint_align_set(m_entry, EVAS_HINT_FILL, EVAS_HINT_FILL);
 	evas_object_size_hint_padding_set(m_entry, 12, 12, 0, 0);
 	addButton("Cancel", __cancelClickedCb);
-	addButton("Done", __doneClickedCb);
+	addButton("Done", __doneClickedCb, true);
 	return m_entry;
 }
 

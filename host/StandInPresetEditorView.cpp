@@ -63,7 +63,7 @@ Evas_Object* StandInPresetEditorView::createContent(Evas_Object* parent)
 		m_styleRows.push_back(row);
 	}
 	addButton("Picture", __pictureClickedCb);
-	Evas_Object* done = addButton("Done", __doneClickedCb);
+	Evas_Object* done = addButton("Done", __doneClickedCb, true);
 	elm_object_disabled_set(done, m_pictures.empty() ? EINA_TRUE : EINA_FALSE);
 	__showPreview();
 	return box;

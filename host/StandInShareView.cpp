@@ -89,9 +89,9 @@ Evas_Object* StandInShareView::createContent(Evas_Object* parent)
 	evas_object_size_hint_weight_set(entry, EVAS_HINT_EXPAND, EVAS_HINT_EXPAND);
 	evas_object_size_hint_align_set(entry, EVAS_HINT_FILL, EVAS_HINT_FILL);
 	evas_object_size_hint_padding_set(entry, 12, 12, 0, 0);
-	if (m_isVcard && !m_shared.empty())
-		addButton("Save", __saveClickedCb);
 	addButton("Close", __closeClickedCb);
+	if (m_isVcard && !m_shared.empty())
+		addButton("Save", __saveClickedCb, true);
 	return entry;
 }
 

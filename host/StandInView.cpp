@@ -13,7 +13,7 @@ constexpr int kPadding = 12;
 std::string captionMarkup(const std::string& caption)
 {
 	char* escaped = elm_entry_utf8_to_markup(caption.c_str());
-	std::string markup = std::string("<font_size=17><color=#4B5563>") + (escaped ? escaped : "") + "</color></font_size>";
+	std::string markup = std::string("<font_size=15><color=#4B5563>") + (escaped ? escaped : "") + "</color></font_size>";
 	free(escaped);
 	return markup;
 }
@@ -154,10 +154,11 @@ void StandInView::answerSelected(const std::string& path)
 	app_control_destroy(reply);
 }
 
-Evas_Object* StandInView::addButton(const char* label, Evas_Smart_Cb onClick)
+Evas_Object* StandInView::addButton(const char* label, Evas_Smart_Cb onClick, bool main)
 {
 	WPRET_VM(!m_buttonRow, nullptr, "%s: buttons are added while the content is made", label);
 	Evas_Object* button = elm_button_add(m_buttonRow);
+	elm_object_style_set(button, main ? "bottom" : "popup");
 	elm_object_text_set(button, label);
 	evas_object_size_hint_weight_set(button, EVAS_HINT_EXPAND, 0.0);
 	evas_object_size_hint_align_set(button, EVAS_HINT_FILL, 0.5);

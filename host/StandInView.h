@@ -45,7 +45,8 @@ protected:
 	void answerSelected(const std::string& path);
 
 	// A button at the bottom (call from createContent); `onClick` gets this view as data.
-	Evas_Object* addButton(const char* label, Evas_Smart_Cb onClick);
+	// The main action is drawn filled.
+	Evas_Object* addButton(const char* label, Evas_Smart_Cb onClick, bool main = false);
 	void setCaption(const std::string& caption);
 	// A list filling the middle of the screen, and its rows (owned by it).
 	Evas_Object* createList(Evas_Object* parent);

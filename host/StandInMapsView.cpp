@@ -1,5 +1,7 @@
 #include "StandInMapsView.h"
 
+#include "ContactsCommon.h"
+
 #include <cstdlib>
 
 namespace ct::demo {
@@ -7,6 +9,7 @@ namespace ct::demo {
 namespace {
 
 constexpr size_t kMaxAddressBytes = 1024;
+constexpr int kPinSize = 96;
 
 int hexValue(char c)
 {
@@ -72,19 +75,31 @@ Evas_Object* StandInMapsView::createContent(Evas_Object* parent)
 			--cut;
 		place.resize(cut);
 	}
-	m_entry = elm_entry_add(parent);
-	elm_entry_scrollable_set(m_entry, EINA_TRUE);
-	elm_entry_line_wrap_set(m_entry, ELM_WRAP_MIXED);
+	Evas_Object* box = elm_box_add(parent);
+	evas_object_size_hint_weight_set(box, EVAS_HINT_EXPAND, EVAS_HINT_EXPAND);
+	evas_object_size_hint_align_set(box, EVAS_HINT_FILL, EVAS_HINT_FILL);
+	m_entry = createEntry(box, true);
 	char* markup = elm_entry_utf8_to_markup(place.c_str());
 	elm_object_text_set(m_entry, markup);
 	free(markup);
 	elm_object_part_text_set(m_entry, "elm.guide", "Address");
-	evas_object_size_hint_weight_set(m_entry, EVAS_HINT_EXPAND, EVAS_HINT_EXPAND);
-	evas_object_size_hint_align_set(m_entry, EVAS_HINT_FILL, EVAS_HINT_FILL);
-	evas_object_size_hint_padding_set(m_entry, 12, 12, 0, 0);
+	// Not scrolling: the entry grows with the address it holds.
+	elm_entry_scrollable_set(m_entry, EINA_FALSE);
+	evas_object_size_hint_weight_set(m_entry, EVAS_HINT_EXPAND, 0.0);
+	evas_object_size_hint_align_set(m_entry, EVAS_HINT_FILL, 0.0);
+	evas_object_show(m_entry);
+	elm_box_pack_end(box, m_entry);
+	// Where the map would be.
+	Evas_Object* pin = elm_image_add(box);
+	elm_image_file_set(pin, ContactsCommon::getAppImagePath("contacts_btn_ic_map.png").c_str(), nullptr);
+	elm_image_resizable_set(pin, EINA_FALSE, EINA_FALSE);
+	evas_object_size_hint_weight_set(pin, EVAS_HINT_EXPAND, EVAS_HINT_EXPAND);
+	evas_object_size_hint_min_set(pin, ELM_SCALE_SIZE(kPinSize), ELM_SCALE_SIZE(kPinSize));
+	evas_object_show(pin);
+	elm_box_pack_end(box, pin);
 	addButton("Cancel", __cancelClickedCb);
 	addButton("Done", __doneClickedCb, true);
-	return m_entry;
+	return box;
 }
 
 void StandInMapsView::__doneClickedCb(void* data, Evas_Object*, void*)

@@ -79,16 +79,10 @@ std::string StandInShareView::getSavePath() const
 
 Evas_Object* StandInShareView::createContent(Evas_Object* parent)
 {
-	Evas_Object* entry = elm_entry_add(parent);
-	elm_entry_editable_set(entry, EINA_FALSE);
-	elm_entry_scrollable_set(entry, EINA_TRUE);
-	elm_entry_line_wrap_set(entry, ELM_WRAP_MIXED);
+	Evas_Object* entry = createEntry(parent, false);
 	char* markup = elm_entry_utf8_to_markup(clipped(m_shared, kMaxShownBytes).c_str());
 	elm_object_text_set(entry, markup);
 	free(markup);
-	evas_object_size_hint_weight_set(entry, EVAS_HINT_EXPAND, EVAS_HINT_EXPAND);
-	evas_object_size_hint_align_set(entry, EVAS_HINT_FILL, EVAS_HINT_FILL);
-	evas_object_size_hint_padding_set(entry, 12, 12, 0, 0);
 	addButton("Close", __closeClickedCb);
 	if (m_isVcard && !m_shared.empty())
 		addButton("Save", __saveClickedCb, true);

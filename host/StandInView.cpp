@@ -170,6 +170,19 @@ Evas_Object* StandInView::addButton(const char* label, Evas_Smart_Cb onClick, bo
 	return button;
 }
 
+Evas_Object* StandInView::createEntry(Evas_Object* parent, bool editable)
+{
+	Evas_Object* entry = elm_entry_add(parent);
+	elm_entry_editable_set(entry, editable ? EINA_TRUE : EINA_FALSE);
+	elm_entry_scrollable_set(entry, EINA_TRUE);
+	elm_entry_line_wrap_set(entry, ELM_WRAP_MIXED);
+	elm_entry_text_style_user_push(entry, "DEFAULT='font_size=15 color=#1F2328'");
+	evas_object_size_hint_weight_set(entry, EVAS_HINT_EXPAND, EVAS_HINT_EXPAND);
+	evas_object_size_hint_align_set(entry, EVAS_HINT_FILL, EVAS_HINT_FILL);
+	evas_object_size_hint_padding_set(entry, kPadding, kPadding, 0, 0);
+	return entry;
+}
+
 Evas_Object* StandInView::createList(Evas_Object* parent)
 {
 	m_list = elm_genlist_add(parent);

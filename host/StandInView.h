@@ -48,6 +48,8 @@ protected:
 	// The main action is drawn filled.
 	Evas_Object* addButton(const char* label, Evas_Smart_Cb onClick, bool main = false);
 	void setCaption(const std::string& caption);
+	// A text entry in the screen's type size (editable or read-only).
+	static Evas_Object* createEntry(Evas_Object* parent, bool editable);
 	// A list filling the middle of the screen, and its rows (owned by it).
 	Evas_Object* createList(Evas_Object* parent);
 	StandInListItem* appendRow(StandInListItem* row);

@@ -8,6 +8,7 @@
 #include "ContactsAppIds.h"
 #include "ContactsCommon.h"
 #include "CtContactPickerView.h"
+#include "CtView.h"
 #include "DataDir.h"
 #include "DemoAppControlHandlers.h"
 #include "DemoLook.h"
@@ -123,6 +124,7 @@ protected:
 	void SetUp() override
 	{
 		ASSERT_EQ(CONTACTS_ERROR_NONE, contacts_connect());
+		CtView::changeLanguage("en_US.UTF-8");
 		demo::DemoLook::apply();
 		m_pictures = demo::DemoPictures::ensure();
 		m_screen = std::make_unique<ScreenHarness>(360, 640);

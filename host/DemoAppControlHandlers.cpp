@@ -5,6 +5,7 @@
 #include "ContactsData.h"
 #include "ContactsDebug.h"
 #include "CtDllViewFactory.h"
+#include "CtEsuAgentMgr.h"
 #include "DataDir.h"
 #include "StandInCameraView.h"
 #include "StandInCropView.h"
@@ -37,6 +38,7 @@ std::string roleOf(const std::string& appId, const std::string& operation)
 		{IMAGE_EDITOR_APP_ID, "Image editor"}, {RINGTONE_PICKER_APP_ID, "Ringtone picker"},
 		{MESSAGE_COMPOSER_APP_ID, "Message"}, {CONTACTS_LIST_APP_ID, "Contact picker"},
 		{FACEBOOK_APP_ID, "Facebook"}, {CONTACTS_APP_ID, "Contacts"}, {ACCOUNT_SETTINGS_APP_ID, "Accounts"},
+		{CtEsuAgentMgr::kSignUpAppId, "Sign-up"},
 	};
 	static const std::map<std::string, std::string> operations = {
 		{APP_CONTROL_OPERATION_CALL, "Call"}, {APP_CONTROL_OPERATION_DIAL, "Dial"},
@@ -131,6 +133,8 @@ DemoAppControlHandlers::DemoAppControlHandlers(app_assist::WNaviframe* naviframe
 		__noticeByOperation(op);
 	for (const char* app : {MESSAGE_COMPOSER_APP_ID, FACEBOOK_APP_ID, ACCOUNT_SETTINGS_APP_ID})
 		__noticeByApp(app);
+	// Signing up for profile sharing always succeeds on the demo device.
+	__noticeByApp(CtEsuAgentMgr::kSignUpAppId);
 
 	const Folders& f = m_folders;
 	__screenByApp(GALLERY_APP_ID, [f](app_control_h request, const ct::appcontrol::Reply& reply) {

@@ -37,7 +37,13 @@ std::string StandInCropView::getCropPath() const
 {
 	if (m_source.empty())
 		return "";
-	return m_outputFolder + "/" + std::filesystem::path(m_source).stem().string() + "-crop.png";
+	// A new file each time: the caller may store the path as it is.
+	std::string stem = m_outputFolder + "/" + std::filesystem::path(m_source).stem().string() + "-crop";
+	std::error_code ec;
+	std::string path = stem + ".png";
+	for (int n = 2; std::filesystem::exists(path, ec); ++n)
+		path = stem + "-" + std::to_string(n) + ".png";
+	return path;
 }
 
 Evas_Object* StandInCropView::createContent(Evas_Object* parent)

@@ -1,6 +1,6 @@
 // The image viewer's caller-id crop ("View Mode" "SETAS"): shows the picture
 // of "Path"; "Set" writes its centred square, at the side length of
-// "Resolution" ("480x480"), into the output folder and replies that path in
+// "Resolution" ("480x480"), into a new file of the output folder and replies that path in
 // APP_CONTROL_DATA_SELECTED (a one-element array). Without a readable
 // picture only Cancel is offered.
 #pragma once
@@ -14,7 +14,7 @@ public:
 	StandInCropView(app_control_h request, ct::appcontrol::Reply reply, std::string outputFolder);
 
 	const char* getClassName() override { return "StandInCropView"; }
-	// Where "Set" writes the crop ("" without a picture).
+	// Where "Set" writes the crop: a file not there yet ("" without a picture).
 	std::string getCropPath() const;
 
 protected:

@@ -235,6 +235,7 @@ TEST_F(StandInRoutesTest, EachPickerAnswersTheLibrarysRequestWithWhatWasChosenOr
 	int work = addGroup(0, "Work");
 	std::string picture = m_pictures.at(0);
 	std::string crop = ct::platform::dataPath("stand-ins/crops/portrait-1-crop.png");
+	std::filesystem::remove(crop);
 	const Request gallery{GALLERY_APP_ID, APP_CONTROL_OPERATION_PICK, "",
 		{{"hide-personal", "true"}, {"launch-type", "select-setas"}, {"View Mode", "SETAS"}, {"Resolution", "720x720"}}};
 	const Request ringtones{RINGTONE_PICKER_APP_ID, nullptr, "",
@@ -265,6 +266,9 @@ TEST_F(StandInRoutesTest, EachPickerAnswersTheLibrarysRequestWithWhatWasChosenOr
 			{{"path", ct::platform::dataPath("stand-ins/styles/portrait-1-Mint.png")}}},
 		{"crop", {IMAGE_VIEWER_APP_ID, nullptr, "", {{"Path", picture}, {"View Mode", "SETAS"}, {"Resolution", "480x480"}}},
 			[this] { press("Set"); }, APP_CONTROL_RESULT_SUCCEEDED, {{APP_CONTROL_DATA_SELECTED, "[" + crop + "]"}}},
+		{"crop-again", {IMAGE_VIEWER_APP_ID, nullptr, "", {{"Path", picture}, {"Resolution", "480x480"}}},
+			[this] { press("Set"); }, APP_CONTROL_RESULT_SUCCEEDED,
+			{{APP_CONTROL_DATA_SELECTED, "[" + crop.substr(0, crop.size() - 4) + "-2.png]"}}},
 		{"crop-no-picture", {IMAGE_VIEWER_APP_ID, nullptr, "", {{"Path", "/nowhere/x.png"}}},
 			[this] { EXPECT_EQ(nullptr, button("Set")); press("Cancel"); }, APP_CONTROL_RESULT_CANCELED, {}},
 		{"ringtones", ringtones, [this] { tap("Soft chime"); }, APP_CONTROL_RESULT_SUCCEEDED,

@@ -279,6 +279,29 @@ TEST_F(CtInputViewTest, FailedSaveKeepsTheTypedFormForAnotherTryThenTheSavedPers
 	EXPECT_TRUE(leaves());
 }
 
+TEST_F(CtInputViewTest, AFailedEditKeepsTheFormAndTheStoredContactAsTheyWere)
+{
+	int contactId = 0;
+	addSimplePerson("Before", &contactId);
+	CtInputView* view = open(createCtInputView(readContact(contactId), nullptr));
+	view->getData()->setFullName("After");
+	{
+		ct::db::ScopedWriteFailure full(1);
+		pressDone(view);
+	}
+	EXPECT_EQ(view, m_screen->topView());
+	EXPECT_FALSE(view->isSaved());
+	EXPECT_EQ("After", view->getData()->getFullName());
+	EXPECT_EQ(1, countContactsNamed("Before"));
+	ASSERT_FALSE(ScreenHarness::notices().empty());
+	EXPECT_EQ(tr("IDS_PB_POP_NOT_ENOUGH_MEMORY"), ScreenHarness::notices().back());
+
+	pressDone(view);
+	EXPECT_TRUE(leaves());
+	EXPECT_EQ(0, countContactsNamed("Before"));
+	EXPECT_EQ(1, countContactsNamed("After"));
+}
+
 TEST_F(CtInputViewTest, AGadgetCallerHearsTheOutcomeOfTheSaveAndIsClosed)
 {
 	// {operation, disk full, reply keys and values}

@@ -4,6 +4,7 @@
 #include "ContactsDebug.h"
 #include "CtDetailView.h"
 #include "CtMyProfileInputView.h"
+#include "CtProfileWizardView.h"
 #include "CtShareContactView.h"
 
 app_assist::WView* createCtDetailView(int personId, CtLaunchRequest* request)
@@ -28,4 +29,9 @@ app_assist::WView* createCtShareContactView(int personId, CtLaunchRequest* reque
 app_assist::WView* createCtMyProfileInputView(contacts_record_h record, void* hostData)
 {
 	return new CtMyProfileInputView(record, static_cast<CtLaunchRequest*>(hostData));
+}
+
+app_assist::WView* createCtProfileWizardView()
+{
+	return new CtProfileWizardView();
 }

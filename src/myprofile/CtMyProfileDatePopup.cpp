@@ -4,27 +4,20 @@
 #include "CtCommonWidgetUtil.h"
 
 #include <ui_extension.h>
-#include <vconf.h>
-
-#include <cstdlib>
-#include <ctime>
-#include <string>
-
-// The datetime is a clock that keeps showing the current time unless paused
-// (a beta interface of the toolkit, declared here).
-extern "C" EAPI void efl_ui_clock_pause_set(Eo* obj, Eina_Bool paused);
 
 namespace {
 
-std::string readVconf(const char* key)
+constexpr int kFirstYear = 1902;
+constexpr int kLastYear = 2037;
+constexpr int kSpinnerWidth = 84;
+
+int daysInMonth(int year, int month)
 {
-	char* value = vconf_get_str(key);
-	std::string out(value ? value : "");
-	free(value);
-	return out;
+	static const int days[] = {31, 28, 31, 30, 31, 30, 31, 31, 30, 31, 30, 31};
+	bool leap = (year % 4 == 0 && year % 100 != 0) || year % 400 == 0;
+	return month == 2 && leap ? 29 : days[month - 1];
 }
 
-// The datetime only takes a date whose week and year days are filled in.
 struct tm withWeekDays(struct tm tm)
 {
 	tm.tm_hour = 12;
@@ -42,16 +35,16 @@ struct tm today()
 	return withWeekDays(tm);
 }
 
-void followRegionFormat(Evas_Object* datetime)
+// The month's name in the user's language ("Jan", ...).
+std::string monthName(int month)
 {
-	std::string region = readVconf(VCONFKEY_REGIONFORMAT);
-	int time1224 = 0;
-	if (vconf_get_int(VCONFKEY_REGIONFORMAT_TIME1224, &time1224) < 0)
-		WERROR("ret < 0");
-	else if (region.empty())
-		WERROR("regionFmt is NULL");
-	else
-		uxt_date_time_set_format_by_locale(datetime, region.c_str());
+	struct tm tm = {};
+	tm.tm_year = 100;
+	tm.tm_mon = month - 1;
+	tm.tm_mday = 1;
+	char name[64] = {0};
+	strftime(name, sizeof(name), "%b", &tm);
+	return name;
 }
 
 } // namespace
@@ -68,7 +61,7 @@ CtMyProfileDatePopup::CtMyProfileDatePopup(bool lunarAllowed, SetCallback onSet)
 
 CtMyProfileDatePopup::~CtMyProfileDatePopup()
 {
-	for (Evas_Object* part : {m_datetime, m_calendarButton})
+	for (Evas_Object* part : {m_day, m_month, m_year, m_calendarButton})
 		if (part)
 			evas_object_event_callback_del_full(part, EVAS_CALLBACK_DEL, __partDelCb, this);
 }
@@ -76,8 +69,8 @@ CtMyProfileDatePopup::~CtMyProfileDatePopup()
 Evas_Object* CtMyProfileDatePopup::__createContent(Evas_Object* parent)
 {
 	Evas_Object* layout = ctCommonCreateLayout(parent, "contacts/contacts.edj", "popup_input_date");
-	WPRET_VM(!layout, __createDatetime(parent), "ctCommonCreateLayout() is fail");
-	elm_object_part_content_set(layout, "elm.swallow.content", __createDatetime(layout));
+	WPRET_VM(!layout, __createPicker(parent), "ctCommonCreateLayout() is fail");
+	elm_object_part_content_set(layout, "elm.swallow.content", __createPicker(layout));
 	if (!m_lunarAllowed)
 		return layout;
 	m_calendarButton = uxt_button_add(layout, "on_gradient_bg");
@@ -88,20 +81,81 @@ Evas_Object* CtMyProfileDatePopup::__createContent(Evas_Object* parent)
 	return layout;
 }
 
-Evas_Object* CtMyProfileDatePopup::__createDatetime(Evas_Object* parent)
+Evas_Object* CtMyProfileDatePopup::__createPicker(Evas_Object* parent)
 {
-	m_datetime = elm_datetime_add(parent);
-	efl_ui_clock_pause_set(m_datetime, EINA_TRUE);
-	elm_datetime_field_visible_set(m_datetime, ELM_DATETIME_HOUR, EINA_FALSE);
-	elm_datetime_field_visible_set(m_datetime, ELM_DATETIME_MINUTE, EINA_FALSE);
-	elm_datetime_field_visible_set(m_datetime, ELM_DATETIME_AMPM, EINA_FALSE);
-	followRegionFormat(m_datetime);
-	uxt_theme_object_replace_color(m_datetime, "B0211", "transparent");
+	Evas_Object* box = elm_box_add(parent);
+	elm_box_horizontal_set(box, EINA_TRUE);
+	elm_box_padding_set(box, ELM_SCALE_SIZE(8), 0);
+	evas_object_size_hint_weight_set(box, EVAS_HINT_EXPAND, EVAS_HINT_EXPAND);
+	evas_object_size_hint_align_set(box, EVAS_HINT_FILL, EVAS_HINT_FILL);
 	struct tm start = today();
-	elm_datetime_value_set(m_datetime, &start);
-	evas_object_smart_callback_add(m_datetime, "changed", __datetimeChangedCb, this);
-	evas_object_event_callback_add(m_datetime, EVAS_CALLBACK_DEL, __partDelCb, this);
-	return m_datetime;
+	m_day = __addSpinner(box, 1, 31, start.tm_mday);
+	m_month = __addSpinner(box, 1, 12, start.tm_mon + 1);
+	for (int month = 1; month <= 12; ++month)
+		elm_spinner_special_value_add(m_month, month, monthName(month).c_str());
+	m_year = __addSpinner(box, kFirstYear, kLastYear, start.tm_year + 1900);
+	evas_object_show(box);
+	return box;
+}
+
+Evas_Object* CtMyProfileDatePopup::__addSpinner(Evas_Object* box, int min, int max, int value)
+{
+	Evas_Object* spinner = elm_spinner_add(box);
+	elm_spinner_min_max_set(spinner, min, max);
+	elm_spinner_step_set(spinner, 1);
+	elm_spinner_wrap_set(spinner, EINA_TRUE);
+	elm_spinner_label_format_set(spinner, "%.0f");
+	elm_spinner_value_set(spinner, value);
+	evas_object_size_hint_min_set(spinner, ELM_SCALE_SIZE(kSpinnerWidth), 0);
+	evas_object_size_hint_weight_set(spinner, EVAS_HINT_EXPAND, 0.0);
+	evas_object_size_hint_align_set(spinner, EVAS_HINT_FILL, 0.5);
+	evas_object_smart_callback_add(spinner, "changed", __spinnerChangedCb, this);
+	evas_object_event_callback_add(spinner, EVAS_CALLBACK_DEL, __partDelCb, this);
+	elm_box_pack_end(box, spinner);
+	evas_object_show(spinner);
+	return spinner;
+}
+
+int CtMyProfileDatePopup::getDate() const
+{
+	struct tm date = __shownDate();
+	return (date.tm_year + 1900) * 10000 + (date.tm_mon + 1) * 100 + date.tm_mday;
+}
+
+struct tm CtMyProfileDatePopup::__shownDate() const
+{
+	struct tm date = {};
+	if (!m_day || !m_month || !m_year)
+		return today();
+	date.tm_year = static_cast<int>(elm_spinner_value_get(m_year)) - 1900;
+	date.tm_mon = static_cast<int>(elm_spinner_value_get(m_month)) - 1;
+	date.tm_mday = static_cast<int>(elm_spinner_value_get(m_day));
+	return date;
+}
+
+void CtMyProfileDatePopup::__showDate(const struct tm& date)
+{
+	WPRET_M(!m_day || !m_month || !m_year, "picker is NULL");
+	for (Evas_Object* spinner : {m_day, m_month, m_year})
+		evas_object_smart_callback_del_full(spinner, "changed", __spinnerChangedCb, this);
+	elm_spinner_value_set(m_year, date.tm_year + 1900);
+	elm_spinner_value_set(m_month, date.tm_mon + 1);
+	elm_spinner_value_set(m_day, date.tm_mday);
+	for (Evas_Object* spinner : {m_day, m_month, m_year})
+		evas_object_smart_callback_add(spinner, "changed", __spinnerChangedCb, this);
+}
+
+// No 31 February: the day follows the month; a lunar month may be a leap one.
+void CtMyProfileDatePopup::__dateChanged()
+{
+	struct tm date = __shownDate();
+	int lastDay = daysInMonth(date.tm_year + 1900, date.tm_mon + 1);
+	if (date.tm_mday > lastDay) {
+		date.tm_mday = lastDay;
+		__showDate(date);
+	}
+	if (!m_isSolar)
+		m_isLeapMonth = uxt_util_is_leap_month_possible(UXT_CALENDAR_LUNAR_CHINESE, &date) == 1;
 }
 
 // The button names the calendar the picker shows.
@@ -114,9 +168,7 @@ void CtMyProfileDatePopup::__updateCalendarButton()
 
 void CtMyProfileDatePopup::__toggleCalendar()
 {
-	WPRET_M(!m_datetime, "datetime is NULL");
-	struct tm shown = {};
-	elm_datetime_value_get(m_datetime, &shown);
+	struct tm shown = withWeekDays(__shownDate());
 	struct tm converted = {};
 	int err;
 	if (m_isSolar) {
@@ -134,20 +186,14 @@ void CtMyProfileDatePopup::__toggleCalendar()
 		return;
 	}
 	m_isSolar = !m_isSolar;
-	evas_object_smart_callback_del_full(m_datetime, "changed", __datetimeChangedCb, this);
-	converted = withWeekDays(converted);
-	elm_datetime_value_set(m_datetime, &converted);
-	evas_object_smart_callback_add(m_datetime, "changed", __datetimeChangedCb, this);
+	__showDate(converted);
 	__updateCalendarButton();
 }
 
 void CtMyProfileDatePopup::__set()
 {
-	WPRET_M(!m_datetime || !m_onSet, "datetime is NULL");
-	struct tm value = {};
-	elm_datetime_value_get(m_datetime, &value);
-	int date = (value.tm_year + 1900) * 10000 + (value.tm_mon + 1) * 100 + value.tm_mday;
-	m_onSet(date, m_isSolar ? 0 : 1, !m_isSolar && m_isLeapMonth);
+	WPRET_M(!m_onSet, "data is NULL");
+	m_onSet(getDate(), m_isSolar ? 0 : 1, !m_isSolar && m_isLeapMonth);
 }
 
 void CtMyProfileDatePopup::__calendarBtnClickedCb(void* data, Evas_Object*, void*)
@@ -155,21 +201,15 @@ void CtMyProfileDatePopup::__calendarBtnClickedCb(void* data, Evas_Object*, void
 	static_cast<CtMyProfileDatePopup*>(data)->__toggleCalendar();
 }
 
-void CtMyProfileDatePopup::__datetimeChangedCb(void* data, Evas_Object* obj, void*)
+void CtMyProfileDatePopup::__spinnerChangedCb(void* data, Evas_Object*, void*)
 {
-	auto* self = static_cast<CtMyProfileDatePopup*>(data);
-	if (self->m_isSolar)
-		return;
-	struct tm value = {};
-	elm_datetime_value_get(obj, &value);
-	self->m_isLeapMonth = uxt_util_is_leap_month_possible(UXT_CALENDAR_LUNAR_CHINESE, &value) == 1;
+	static_cast<CtMyProfileDatePopup*>(data)->__dateChanged();
 }
 
 void CtMyProfileDatePopup::__partDelCb(void* data, Evas*, Evas_Object* obj, void*)
 {
 	auto* self = static_cast<CtMyProfileDatePopup*>(data);
-	if (self->m_datetime == obj)
-		self->m_datetime = nullptr;
-	if (self->m_calendarButton == obj)
-		self->m_calendarButton = nullptr;
+	for (Evas_Object** part : {&self->m_day, &self->m_month, &self->m_year, &self->m_calendarButton})
+		if (*part == obj)
+			*part = nullptr;
 }

@@ -579,10 +579,7 @@ void CtMyProfileInputView::__itemDeleted(RowKind kind, bool, contacts_record_h r
 void CtMyProfileInputView::__basicInfoItemDeleted(int group)
 {
 	WPRET_M(!m_basicInfoRow, "data is NULL");
-	auto deleted = static_cast<CtInputViewBasicInfoItem::ITEM_DELETED>(group);
-	if (m_basicInfoRow->groupHasText(deleted))
-		m_basicInfoRow->setIsChanged(true);
-	m_basicInfoRow->removeGroup(deleted);
+	m_basicInfoRow->removeGroup(static_cast<CtInputViewBasicInfoItem::ITEM_DELETED>(group));
 	m_rowsAddedOrDeleted = true;
 	__updateSaveBtn();
 }
@@ -669,13 +666,10 @@ void CtMyProfileInputView::__addNoteClickedCb()
 void CtMyProfileInputView::__addMoreClickedCb()
 {
 	WHIT();
-	if (!m_keypadUp) {
+	if (m_keypadUp)
+		m_morePending = true;
+	else
 		__showMorePopup();
-		return;
-	}
-	m_morePending = true;
-	if (m_genlist)
-		elm_object_focus_set(m_genlist, EINA_FALSE);
 }
 
 void CtMyProfileInputView::__showMorePopup()

@@ -39,6 +39,7 @@
 
 #include <cstdio>
 #include <cstring>
+#include <vector>
 
 namespace {
 
@@ -244,6 +245,8 @@ Elm_Object_Item* CtMyProfileInputView::getFirstItem(RowKind kind) const
 Evas_Object* CtMyProfileInputView::onCreate(Evas_Object* parent, void*)
 {
 	WENTER();
+	// The toolkit translates the texts of this screen with the catalogue bound here.
+	ContactsCommon::bindTextDomain();
 	setTitle(ContactsCommon::translate(m_isNew || m_wizardMode ? kCreateTitleId : kEditTitleId));
 	Evas_Object* layout = createBaseLayout(parent, nullptr, nullptr);
 	WPRET_VM(!layout, nullptr, "ctCommonCreateLayout() is fail");
@@ -977,6 +980,7 @@ void CtMyProfileInputView::__save()
 	if (m_cancelButton)
 		elm_object_disabled_set(m_cancelButton, EINA_TRUE);
 	__closeHoversel();
+	__removeEmptyItems();
 	// Unlike a write that is only logged, a failed one keeps the form and
 	// what was typed, so that nothing is lost and the user can try again.
 	if (!__writeProfile()) {
@@ -1002,6 +1006,25 @@ void CtMyProfileInputView::__save()
 	if (err != PREFERENCE_ERROR_NONE)
 		WWARNING("preference_set_boolean() Failed(%d)", err);
 	__requestPop();
+}
+
+// Rows left empty would be stored as empty e-mails, addresses or dates.
+void CtMyProfileInputView::__removeEmptyItems()
+{
+	std::vector<CtInputViewGenlistItem*> empty;
+	for (Elm_Object_Item* item = m_genlist ? elm_genlist_first_item_get(m_genlist) : nullptr; item;
+			item = elm_genlist_item_next_get(item)) {
+		int kind = rowKindOf(item);
+		CtInputViewGenlistItem* row = rowOf(item);
+		if (kind >= MYPROFILE_INPUT_NUMBER && kind <= MYPROFILE_INPUT_MESSENGER && row && row->getIsEmpty())
+			empty.push_back(row);
+	}
+	for (CtInputViewGenlistItem* row : empty) {
+		if (auto* field = dynamic_cast<CtInputViewFieldItem*>(row))
+			field->deleteRow();
+		else if (auto* event = dynamic_cast<CtInputViewEventItem*>(row))
+			event->deleteRow();
+	}
 }
 
 bool CtMyProfileInputView::__writeProfile()

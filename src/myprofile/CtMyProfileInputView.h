@@ -123,6 +123,7 @@ private:
 	void __launchMapsApp(contacts_record_h address);
 
 	void __save();
+	void __removeEmptyItems();
 	bool __writeProfile();
 	void __writeUsageLogs();
 	void __requestPop();

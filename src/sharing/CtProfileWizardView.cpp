@@ -53,13 +53,16 @@ CtProfileWizardView::~CtProfileWizardView()
 
 const char* CtProfileWizardView::getTitleAreaText() const
 {
-	const char* text = m_titleLayout ? elm_object_part_text_get(m_titleLayout, "elm.text.title") : nullptr;
+	Evas_Object* edje = m_titleLayout ? elm_layout_edje_get(m_titleLayout) : nullptr;
+	const char* text = edje ? edje_object_part_text_get(edje, "elm.text.title") : nullptr;
 	return text ? text : "";
 }
 
 Evas_Object* CtProfileWizardView::onCreate(Evas_Object* parent, void*)
 {
 	WENTER();
+	// The toolkit translates the texts of this screen with the catalogue bound here.
+	ContactsCommon::bindTextDomain();
 	for (const char* edj : {"contacts/contacts.edj", kDetailEdj}) {
 		std::string path;
 		ContactsCommon::getAppEdjePath(edj, path, true);

@@ -200,6 +200,7 @@ TEST_F(CtMyProfileInputViewTest, MoreWhileTheKeypadIsUpOpensOnceItCloses)
 	EXPECT_EQ(nullptr, view->getPopup());
 	auto basic = ScreenHarness::rowsOf<CtInputViewBasicInfoItem>(view->getGenlist());
 	EXPECT_TRUE(basic[0]->getNicknameShown());
+	EXPECT_TRUE(m_screen->pumpUntil([&] { return m_screen->isKeypadShown(); })) << "the nickname takes the focus";
 	m_screen->lowerKeypad();
 	EXPECT_TRUE(ScreenHarness::click(addFieldButton(view, CtInputViewImportantFieldsItem::MORE)));
 	m_screen->pumpUntilIdle();

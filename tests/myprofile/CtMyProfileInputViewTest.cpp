@@ -9,10 +9,12 @@
 #include "CtInputViewBasicInfoItem.h"
 #include "CtInputViewEventItem.h"
 #include "CtInputViewImportantFieldsItem.h"
+#include "CtInputViewMultiImageItem.h"
 #include "CtMyProfileDatePopup.h"
 #include "CtMyProfileInputView.h"
 
 #include <sqlite3.h>
+#include <velmora_log_manager.h>
 
 using namespace ct::test;
 
@@ -292,4 +294,59 @@ TEST_F(CtMyProfileInputViewTest, FailedSaveKeepsTheFormAndTheTypedText)
 		EXPECT_TRUE(hasInfo);
 		EXPECT_EQ(updates + 1, usage("CT13").size());
 	}
+}
+
+TEST_F(CtMyProfileInputViewTest, PicturesGoToTheTappedPlaceAndCanBeRemoved)
+{
+	std::vector<std::string> replies = {writePicture("red.png", 220, 40, 40), writePicture("blue.png", 40, 60, 220)};
+	size_t next = 0;
+	ct::appcontrol::Registration gallery = ct::appcontrol::registerAppHandler(GALLERY_APP_ID,
+		[&](app_control_h, const ct::appcontrol::Reply& reply) {
+			app_control_h data = nullptr;
+			app_control_create(&data);
+			const char* selected[] = {replies[next++ % replies.size()].c_str()};
+			app_control_add_extra_data_array(data, APP_CONTROL_DATA_SELECTED, selected, 1);
+			reply(data, APP_CONTROL_RESULT_SUCCEEDED);
+			app_control_destroy(data);
+			return 0;
+		});
+	CtMyProfileInputView* view = showEditor();
+	auto tap = [&](int order, size_t action) {
+		auto rows = ScreenHarness::rowsOf<CtInputViewMultiImageItem>(view->getGenlist());
+		ASSERT_EQ(1u, rows.size());
+		rows[0]->tapPicture(order);
+		m_screen->pumpUntilIdle();
+		std::vector<std::string> actions = popupRows();
+		EXPECT_EQ(view->getInputData()->getImagePath(order) ? 4u : 3u, actions.size()) << order;
+		ASSERT_LT(action, actions.size());
+		choosePopupRow(action);
+		m_screen->pumpUntil([&] { return view->getPopup() == nullptr; });
+	};
+	const std::vector<std::string> withRemove = {"From Gallery", "Take picture", "From preset styles", "Remove"};
+	tap(1, 0);
+	EXPECT_EQ(1, view->getInputData()->getImageCount());
+	EXPECT_FALSE(ScreenHarness::isDisabled(view->getDoneButton())) << "a picture alone can be saved";
+	tap(2, 0);
+	EXPECT_EQ(replies[1], view->getInputData()->getImagePath(2));
+	auto rows = ScreenHarness::rowsOf<CtInputViewMultiImageItem>(view->getGenlist());
+	rows[0]->tapPicture(1);
+	m_screen->pumpUntilIdle();
+	EXPECT_EQ(withRemove, popupRows());
+	shot("editor-pictures-popup");
+	choosePopupRow(3);
+	EXPECT_EQ(1, view->getInputData()->getImageCount());
+	EXPECT_EQ(replies[1], view->getInputData()->getImagePath(1)) << "the pictures after a removed one move up";
+	shot("editor-pictures");
+
+	EXPECT_TRUE(ScreenHarness::click(view->getDoneButton()));
+	m_screen->pumpUntilIdle();
+	EXPECT_EQ(0, m_screen->viewCount());
+	std::vector<std::string> extras;
+	for (const ct::usagelog::Record& record : usage("CT13"))
+		extras.push_back(record.extra);
+	EXPECT_EQ((std::vector<std::string>{"Update", "Update multi image"}), extras);
+	auto status = usage("CT23");
+	ASSERT_EQ(1u, status.size());
+	EXPECT_EQ("1 image", status[0].extra);
+	EXPECT_EQ(USAGE_LOG_STATUS_URI, status[0].uri);
 }

@@ -3,6 +3,7 @@
 
 #include "ContactsDebug.h"
 #include "CtDetailView.h"
+#include "CtInputView.h"
 #include "CtMyProfileInputView.h"
 #include "CtProfileWizardView.h"
 #include "CtShareContactView.h"
@@ -19,6 +20,20 @@ app_assist::WView* createCtDetailViewForGalSearch(void* galData)
 {
 	WENTER();
 	return new CtDetailView(static_cast<const CtGalSearchData*>(galData));
+}
+
+// The input view's framework base is not its first base: the pointer handed
+// out is that of the framework base, which the host deletes through.
+app_assist::WView* createCtInputView(contacts_record_h record, CtLaunchRequest* request)
+{
+	WENTER();
+	return new CtInputView(record, request);
+}
+
+app_assist::WView* createCtInputViewForEditAppControl(CtLaunchRequest* request)
+{
+	WENTER();
+	return new CtInputView(request);
 }
 
 app_assist::WView* createCtShareContactView(int personId, CtLaunchRequest* request)

@@ -9,7 +9,11 @@
 #include "CtInputViewBasicInfoItem.h"
 #include "CtInputViewEventItem.h"
 #include "CtInputViewImportantFieldsItem.h"
+#include "CtInputViewMsisdnItem.h"
 #include "CtInputViewMultiImageItem.h"
+#include "CtInputViewNumberItem.h"
+#include "CtInputViewStatusItem.h"
+#include "CtProfileSettingKeys.h"
 #include "CtMyProfileDatePopup.h"
 #include "CtMyProfileInputView.h"
 
@@ -353,4 +357,43 @@ TEST_F(CtMyProfileInputViewTest, PicturesGoToTheTappedPlaceAndCanBeRemoved)
 	ASSERT_EQ(1u, status.size());
 	EXPECT_EQ("1 image", status[0].extra);
 	EXPECT_EQ(USAGE_LOG_STATUS_URI, status[0].uri);
+}
+
+TEST_F(CtMyProfileInputViewTest, StatusRowAndSyncFollowEasySignUpAndTheOwnNumberStandsApart)
+{
+	contacts_record_h profile = newProfile("Ann");
+	addProfileNumber(profile, "01012345678", true, "sim_card_number");
+	addProfileNumber(profile, "0209999");
+	storeProfile(profile);
+	struct Case {
+		bool signUp;
+		bool statusRow;
+		size_t syncs;
+	};
+	for (const Case& c : {Case{false, false, 0}, Case{true, true, 2}}) {
+		SCOPED_TRACE(c.signUp);
+		if (c.signUp)
+			setenv("CONTACTS_FEATURES", "13", 1);
+		preference_set_int(CT_PREF_EASY_SIGNUP_STATUS, c.signUp ? 1 : 0);
+		CtContactsAgentMgr::getInstance()->clearSyncRequests();
+		CtMyProfileInputView* view = showEditor();
+		EXPECT_EQ(1u, ScreenHarness::rowsOf<CtInputViewMsisdnItem>(view->getGenlist()).size());
+		auto numbers = ScreenHarness::rowsOf<CtInputViewNumberItem>(view->getGenlist());
+		ASSERT_EQ(1u, numbers.size()) << "the own number is not among the numbers";
+		EXPECT_EQ("0209999", CtInputViewGenlistItem::getEntryUtf8(numbers[0]->getEntry()));
+		auto status = ScreenHarness::rowsOf<CtInputViewStatusItem>(view->getGenlist());
+		ASSERT_EQ(c.statusRow ? 1u : 0u, status.size());
+		if (c.statusRow) {
+			shot("editor-status");
+			type(status[0]->getEntry(), "On holiday");
+		}
+		EXPECT_TRUE(ScreenHarness::click(view->getDoneButton()));
+		m_screen->pumpUntilIdle();
+		EXPECT_EQ(0, m_screen->viewCount());
+		EXPECT_EQ(c.syncs, CtContactsAgentMgr::getInstance()->getSyncRequests().size());
+		auto updates = usage("CT13");
+		EXPECT_EQ(c.statusRow ? 1 : 0, std::count_if(updates.begin(), updates.end(),
+			[](const ct::usagelog::Record& r) { return r.extra == "Update status message"; }));
+		unsetenv("CONTACTS_FEATURES");
+	}
 }

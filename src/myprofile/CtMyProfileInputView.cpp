@@ -259,6 +259,9 @@ Evas_Object* CtMyProfileInputView::onCreate(Evas_Object* parent, void*)
 	m_genlist = elm_genlist_add(layout);
 	WPRET_VM(!m_genlist, layout, "elm_genlist_add() is failed");
 	elm_genlist_mode_set(m_genlist, ELM_LIST_COMPRESS);
+	// Every row only displays; set once for the list, as a change per row
+	// makes the list measure that row again.
+	elm_genlist_select_mode_set(m_genlist, ELM_OBJECT_SELECT_MODE_DISPLAY_ONLY);
 	evas_object_size_hint_weight_set(m_genlist, EVAS_HINT_EXPAND, EVAS_HINT_EXPAND);
 	evas_object_size_hint_align_set(m_genlist, EVAS_HINT_FILL, EVAS_HINT_FILL);
 	elm_object_part_content_set(layout, "elm.swallow.content", m_genlist);
@@ -465,7 +468,6 @@ Elm_Object_Item* CtMyProfileInputView::__insertRow(RowKind kind, CtInputViewGenl
 	}
 	row->setElmObjectItem(item);
 	row->attachToView(this);
-	elm_genlist_item_select_mode_set(item, ELM_OBJECT_SELECT_MODE_DISPLAY_ONLY);
 	return item;
 }
 

@@ -157,6 +157,7 @@ private:
 
 	// Picture.
 	void __basicInfoItemImageClicked();
+	void __onPictureChoice(int index);
 	void __launchGallery();
 	void __launchCamera();
 	void __launchDecorateContactImage();
@@ -175,7 +176,7 @@ private:
 	// Groups.
 	void __launchGroupsUG();
 	void __onGroupsReply(app_control_h reply);
-	int __createGroup(const std::string& name, const std::string& systemId, int addressbookId);
+	int __createGroup(const std::string& name, int addressbookId);
 	void __addGroupsItem();
 
 	// Event date popup.
@@ -253,11 +254,14 @@ private:
 	Elm_Object_Item* m_addressItem = nullptr;
 	contacts_record_h m_addressRecord = nullptr;
 	std::string m_copiedImagePath;
+	bool m_isImageChanged = false;
 
 	std::unique_ptr<CtPredictionListTrigger> m_prediction;
 	std::weak_ptr<app_assist::WControl> m_morePopup;
 	std::weak_ptr<app_assist::WControl> m_picturePopup;
 	std::weak_ptr<app_assist::WControl> m_changeLocationPopup;
+	std::weak_ptr<app_assist::WControl> m_storagePopup;
+	std::weak_ptr<app_assist::WControl> m_datePopup;
 	int m_registryListenerId = 0;
 	// Handed to late callbacks: false once the control is gone.
 	std::shared_ptr<bool> m_alive;

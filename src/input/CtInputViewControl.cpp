@@ -1895,6 +1895,7 @@ void CtInputViewControl::__onRelationshipPersonPicked(int personId)
 	}
 	if (name.empty())
 		name = ContactsCommon::translate("IDS_LOGS_MBODY_UNKNOWN");
+	m_inputData->setRelationshipRelationship(m_relationRecord, name.c_str());
 	row->setRelationName(name.c_str());
 	elm_genlist_item_fields_update(item, "elm.icon.entry", ELM_GENLIST_ITEM_FIELD_CONTENT);
 	__updateSaveBtn();

@@ -6,6 +6,7 @@
 
 #include "CtInputViewBasicInfoItem.h"
 #include "CtInputViewImportantFieldsItem.h"
+#include "CtRegistryMgr.h"
 
 #include <Edje.h>
 #include <glib.h>
@@ -65,8 +66,7 @@ protected:
 	}
 	void chooseFromMore(const char* textId)
 	{
-		ASSERT_TRUE(ScreenHarness::click(addButton(CtInputViewImportantFieldsItem::MORE)));
-		m_screen->pumpUntilIdle();
+		openMorePopup();
 		ASSERT_TRUE(choosePopupRow(tr(textId)));
 	}
 	std::string imagePath() const
@@ -248,4 +248,63 @@ TEST_F(ControlPickersTest, AnswersArrivingAfterTheFormClosedChangeNothing)
 	contacts_record_h stored = readContact(id);
 	EXPECT_EQ("", textOf(stored, _contacts_contact.ringtone_path));
 	contacts_record_destroy(stored, true);
+}
+
+TEST_F(ControlPickersTest, RelationshipPersonAndMapAddressAreWrittenIntoTheirRows)
+{
+	standIn(MAPS_APP_ID);
+	int annabella = store(newContact(0, "Annabella"));
+	contacts_record_h contact = newContact(0, "Ada");
+	addText(contact, _contacts_contact.relationship, _contacts_relationship._uri, _contacts_relationship.name, "Mother");
+	addText(contact, _contacts_contact.address, _contacts_address._uri, _contacts_address.street, "St James's Square");
+	open(store(contact));
+
+	ASSERT_TRUE(ScreenHarness::click(elm_object_item_part_content_get(itemAt("relationship"), "elm.icon.3")));
+	m_screen->pumpUntilIdle();
+	// The picker the form pushed tells the person and closes.
+	CtRegistryMgr::getInstance()->raiseChangeSignal(CT_REGISTRY_KEY_RELATIONSHIP_PERSON, personOf(annabella));
+	if (m_screen->topView() != m_view)
+		m_screen->topView()->destroy();
+	m_screen->pumpUntilIdle();
+	contacts_record_h relation = static_cast<contacts_record_h>(eina_list_data_get(m_view->getData()->getRelationshipList()));
+	EXPECT_EQ("Annabella", textOf(relation, _contacts_relationship.name));
+	CtRegistryMgr::getInstance()->raiseChangeSignal(CT_REGISTRY_KEY_RELATIONSHIP_PERSON, personOf(annabella) + 1000);
+	EXPECT_EQ("Annabella", textOf(relation, _contacts_relationship.name)) << "no row waits for a person any more";
+
+	elm_genlist_item_show(itemAt("address"), ELM_GENLIST_ITEM_SCROLLTO_TOP);
+	m_screen->pumpUntilIdle();
+	ASSERT_TRUE(ScreenHarness::click(elm_object_item_part_content_get(itemAt("address"), "elm.icon.3")));
+	m_screen->pumpUntilIdle();
+	EXPECT_EQ("St James&apos;s Square", lastExtra("searchByName"));
+	answer(MAPS_APP_ID, {});
+	char address[256] = {};
+	contacts_record_h record = static_cast<contacts_record_h>(eina_list_data_get(m_view->getData()->getAddressList()));
+	m_view->getData()->getAddressAddress(record, address, sizeof(address));
+	EXPECT_STREQ("St James's Square", address) << "an empty answer";
+	ASSERT_TRUE(ScreenHarness::click(elm_object_item_part_content_get(itemAt("address"), "elm.icon.3")));
+	m_screen->pumpUntilIdle();
+	answer(MAPS_APP_ID, { { APP_CONTROL_DATA_SELECTED, "10 Downing Street" } }, { APP_CONTROL_DATA_SELECTED });
+	m_view->getData()->getAddressAddress(record, address, sizeof(address));
+	EXPECT_STREQ("10 Downing Street", address);
+	EXPECT_TRUE(control()->getIsChanged());
+}
+
+TEST_F(ControlPickersTest, PowerSavingEndsTheRingtonePickerAndDisablesTheRow)
+{
+	bool terminated = false;
+	m_registrations.push_back(ct::appcontrol::registerAppHandler(RINGTONE_PICKER_APP_ID,
+			[](app_control_h, const ct::appcontrol::Reply&) { return 0; }, [&terminated] { terminated = true; }));
+	contacts_record_h contact = newContact(0, "Ada");
+	contacts_record_set_str(contact, _contacts_contact.ringtone_path, "/usr/share/sounds/ringtones/a.ogg");
+	open(store(contact));
+	ScreenHarness::selectItem(itemAt("ringtone"));
+	m_screen->pumpUntilIdle();
+	EXPECT_FALSE(elm_object_item_disabled_get(itemAt("ringtone")));
+	vconf_set_int(VCONFKEY_SETAPPL_PSMODE, 1);
+	m_screen->pumpUntilIdle();
+	EXPECT_TRUE(terminated);
+	EXPECT_TRUE(elm_object_item_disabled_get(itemAt("ringtone")));
+	vconf_set_int(VCONFKEY_SETAPPL_PSMODE, 0);
+	m_screen->pumpUntilIdle();
+	EXPECT_FALSE(elm_object_item_disabled_get(itemAt("ringtone")));
 }

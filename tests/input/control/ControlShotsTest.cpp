@@ -26,14 +26,6 @@ protected:
 		std::filesystem::create_directories(dir);
 		EXPECT_TRUE(m_screen->savePng(dir + "/" + name + ".png")) << name;
 	}
-	void more()
-	{
-		m_screen->pumpFor(0.2);
-		control()->hideInputPanel();
-		m_screen->lowerKeypad();
-		ASSERT_TRUE(ScreenHarness::click(addButton(CtInputViewImportantFieldsItem::MORE)));
-		m_screen->pumpUntilIdle();
-	}
 };
 
 int storeEveryKind()
@@ -61,7 +53,7 @@ TEST_F(ControlShotsTest, FormAndPopups)
 {
 	open(0);
 	shoot("new_contact");
-	more();
+	openMorePopup();
 	shoot("add_field_popup");
 	ASSERT_TRUE(choosePopupRow(tr("IDS_PB_OPT_EVENT_HEG_BIRTHDAY_ABB")));
 	shoot("event_date_popup");
@@ -69,7 +61,7 @@ TEST_F(ControlShotsTest, FormAndPopups)
 
 	vconf_set_str(VCONFKEY_CSC_COUNTRY_ISO, "KR");
 	open(0);
-	more();
+	openMorePopup();
 	ASSERT_TRUE(choosePopupRow(tr("IDS_PB_OPT_EVENT_HEG_BIRTHDAY_ABB")));
 	shoot("event_date_popup_lunar");
 	close();
@@ -88,7 +80,7 @@ TEST_F(ControlShotsTest, FormAndPopups)
 
 	addAddressbook("mail", 0, 7, "Mail");
 	open(0);
-	more();
+	openMorePopup();
 	ASSERT_TRUE(choosePopupRow(tr("IDS_PB_HEADER_SAVE_CONTACTS_TO_ABB")));
 	shoot("storage_popup");
 	ASSERT_TRUE(choosePopupRow("Mail"));

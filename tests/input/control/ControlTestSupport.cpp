@@ -125,6 +125,16 @@ Evas_Object* InputControlTest::addButton(int button) const
 	return row ? row->getButton(static_cast<CtInputViewImportantFieldsItem::Button>(button)) : nullptr;
 }
 
+void InputControlTest::openMorePopup()
+{
+	// A new contact's form focuses its name entry shortly after it is shown.
+	m_screen->pumpFor(0.2);
+	control()->hideInputPanel();
+	m_screen->lowerKeypad();
+	ASSERT_TRUE(ScreenHarness::click(addButton(3)));
+	m_screen->pumpUntilIdle();
+}
+
 Evas_Object* InputControlTest::popupList() const
 {
 	for (Evas_Object* list : m_screen->findWidgets("Elm_Genlist"))

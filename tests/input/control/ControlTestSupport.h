@@ -45,6 +45,9 @@ protected:
 	CtInputViewGenlistItem* rowAt(const std::string& kind, int index = 0) const;
 	Elm_Object_Item* itemAt(const std::string& kind, int index = 0) const;
 
+	// Taps the more button as a person would (the tap takes the focus from
+	// the name entry, so the keypad goes down) and pumps.
+	void openMorePopup();
 	// The add buttons of the important-fields row (0 number, 1 e-mail, 2 note, 3 more).
 	Evas_Object* addButton(int button) const;
 	// The shown popup list other than the form (null when none).

@@ -48,16 +48,6 @@ protected:
 			labels.push_back(row.first + (row.second ? " (off)" : ""));
 		return labels;
 	}
-	void openMorePopup()
-	{
-		// A tap on the button takes the focus from the name entry (which a
-		// new contact's form focuses shortly after it is shown).
-		m_screen->pumpFor(0.2);
-		control()->hideInputPanel();
-		m_screen->lowerKeypad();
-		ASSERT_TRUE(ScreenHarness::click(addButton(CtInputViewImportantFieldsItem::MORE)));
-		m_screen->pumpUntilIdle();
-	}
 	static std::vector<std::string> allEntries()
 	{
 		std::vector<std::string> labels;

@@ -272,6 +272,29 @@ Evas_Object* createPopupList(Evas_Object* parent, Evas_Object** genlistOut)
 	return box;
 }
 
+// Whether a stored contact's picture is the file at `path`.
+bool isStoredPicture(const std::string& path)
+{
+	contacts_query_h query = nullptr;
+	contacts_filter_h filter = nullptr;
+	int count = 1; // when the store cannot tell, the file is kept
+	if (contacts_query_create(_contacts_image._uri, &query) == CONTACTS_ERROR_NONE
+			&& contacts_filter_create(_contacts_image._uri, &filter) == CONTACTS_ERROR_NONE
+			&& contacts_filter_add_str(filter, _contacts_image.path, CONTACTS_MATCH_EXACTLY, path.c_str()) == CONTACTS_ERROR_NONE
+			&& contacts_query_set_filter(query, filter) == CONTACTS_ERROR_NONE) {
+		int err = contacts_db_get_count_with_query(query, &count);
+		if (err != CONTACTS_ERROR_NONE) {
+			WFAILED("contacts_db_get_count_with_query", err);
+			count = 1;
+		}
+	}
+	if (filter)
+		contacts_filter_destroy(filter);
+	if (query)
+		contacts_query_destroy(query);
+	return count > 0;
+}
+
 void fitPopupList(Evas_Object* genlist)
 {
 	int rows = std::min<int>(elm_genlist_items_count(genlist), kPopupVisibleRows);
@@ -292,6 +315,7 @@ CtInputViewControl::CtInputViewControl(std::shared_ptr<CtData> inputData, CtInpu
 	CtRegistryMgr::getInstance()->registerVconfChangedCb(kRegionFormatKey, __regionFormatChangedCb, this);
 	CtRegistryMgr::getInstance()->registerVconfChangedCb(kPsmodeKey, __powerSavingChangedCb, this);
 	m_isLunarSupported = CtInputViewEventItem::isLunarSupported();
+	m_isPowerSaving = __isPowerSaving();
 	if (!m_inputData)
 		return;
 	const char* name = m_inputData->getAddressbookName();
@@ -382,6 +406,9 @@ void CtInputViewControl::onDestroy()
 		if (auto open = popup->lock())
 			open->destroy();
 	m_prediction.reset();
+	// A picture copied for a form that closes unsaved is not left behind.
+	if (!m_copiedImagePath.empty() && (!m_view || m_view->isDestroying()) && !isStoredPicture(m_copiedImagePath))
+		ctCommonUnlinkFile(m_copiedImagePath.c_str());
 	if (m_genlist) {
 		evas_object_smart_callback_del_full(m_genlist, "realized", __genlistRealizedCb, this);
 		evas_object_event_callback_del_full(m_genlist, EVAS_CALLBACK_RESIZE, __genlistResizeCb, this);
@@ -1975,13 +2002,15 @@ void CtInputViewControl::__powerSavingChangedCb(keynode_t*, void* data)
 void CtInputViewControl::__onPowerSavingChanged()
 {
 	WHIT();
-	if (!m_genlist)
+	bool on = __isPowerSaving();
+	// A notice without a change must not close what the person has open.
+	if (!m_genlist || on == m_isPowerSaving)
 		return;
+	m_isPowerSaving = on;
 	destroyPopup();
 	if (m_view)
 		m_view->destroyPopup();
 	__updateBasicInfoItem();
-	bool on = __isPowerSaving();
 	if (m_isRingtonePickerLaunched && on) {
 		ContactsAppControlLauncher::getInstance()->terminate();
 		m_isRingtonePickerLaunched = false;

@@ -234,6 +234,7 @@ private:
 	int m_addedKind = 0;
 	bool m_isRingtonePickerLaunched = false;
 	bool m_isLunarSupported = false;
+	bool m_isPowerSaving = false;
 
 	std::vector<RemainingItem> m_remainingItems;
 	size_t m_remainingIndex = 0;

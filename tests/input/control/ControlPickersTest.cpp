@@ -132,6 +132,26 @@ TEST_F(ControlPickersTest, EachPickedPictureReplacesTheCopyOfTheOneBeforeAndBadA
 	ASSERT_TRUE(choosePopupRow(tr("IDS_PB_OPT_REMOVE")));
 	EXPECT_EQ("", imagePath());
 	EXPECT_TRUE(filesIn(folder).empty()) << "the removed copy is not left behind";
+
+	// A form closed without saving leaves no copy; a saved one keeps it.
+	for (bool save : { false, true }) {
+		SCOPED_TRACE(save);
+		tapPicture();
+		ASSERT_TRUE(choosePopupRow(tr("IDS_PB_OPT_FROM_GALLERY_ABB2")));
+		answer(GALLERY_APP_ID, { { APP_CONTROL_DATA_SELECTED, m_pictures[0] } }, { APP_CONTROL_DATA_SELECTED });
+		std::string copy = imagePath();
+		if (save) {
+			auto* basic = static_cast<CtInputViewBasicInfoItem*>(rowAt("basic"));
+			elm_entry_entry_insert(basic->getFieldEntry(CtInputViewBasicInfoItem::NAME), "Ada");
+			m_screen->pumpUntilIdle();
+			ASSERT_TRUE(ScreenHarness::click(m_view->getDoneButton()));
+			m_screen->pumpUntilIdle();
+		}
+		close();
+		EXPECT_EQ(save, fs::exists(copy));
+		if (!save)
+			open(0);
+	}
 }
 
 TEST_F(ControlPickersTest, RingtoneAnswersSetOrClearTheRingtoneAndKeepTheRow)

@@ -70,6 +70,7 @@ protected:
 
 	std::unique_ptr<ScreenHarness> m_screen;
 	CtInputView* m_view = nullptr;
+	std::weak_ptr<app_assist::WControl> m_viewAlive;
 	std::map<std::string, std::vector<Received>> m_received;
 	std::vector<appcontrol::Registration> m_registrations;
 	std::string m_previousLocale;

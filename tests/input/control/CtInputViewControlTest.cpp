@@ -92,6 +92,7 @@ TEST_F(CtInputViewControlTest, StoredContactsOfMoreThanTenRecordsAreListedOneRow
 			m_screen->pumpFrames(2);
 			EXPECT_LT(listed, kinds().size()) << "a row per frame";
 		}
+		m_screen->pumpUntil([this] { return !control()->isAppending(); }, 20.0);
 		m_screen->pumpUntilIdle();
 		Kinds expected{ "basic" };
 		expected.insert(expected.end(), count, "number");

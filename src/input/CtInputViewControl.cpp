@@ -312,6 +312,8 @@ CtInputViewControl::CtInputViewControl(std::shared_ptr<CtData> inputData, CtInpu
 	  m_hasBirthday(std::make_shared<bool>(false)), m_alive(std::make_shared<bool>(true))
 {
 	WENTER();
+	if (m_view)
+		m_viewRef = m_view->getWeakPtr();
 	CtRegistryMgr::getInstance()->registerVconfChangedCb(kRegionFormatKey, __regionFormatChangedCb, this);
 	CtRegistryMgr::getInstance()->registerVconfChangedCb(kPsmodeKey, __powerSavingChangedCb, this);
 	m_isLunarSupported = CtInputViewEventItem::isLunarSupported();
@@ -407,7 +409,8 @@ void CtInputViewControl::onDestroy()
 			open->destroy();
 	m_prediction.reset();
 	// A picture copied for a form that closes unsaved is not left behind.
-	if (!m_copiedImagePath.empty() && (!m_view || m_view->isDestroying()) && !isStoredPicture(m_copiedImagePath))
+	auto view = m_viewRef.lock();
+	if (!m_copiedImagePath.empty() && (!view || view->isDestroying()) && !isStoredPicture(m_copiedImagePath))
 		ctCommonUnlinkFile(m_copiedImagePath.c_str());
 	if (m_genlist) {
 		evas_object_smart_callback_del_full(m_genlist, "realized", __genlistRealizedCb, this);

@@ -216,6 +216,8 @@ private:
 
 	std::shared_ptr<CtData> m_inputData;
 	CtInputView* m_view;
+	// Expires with the view (which may be gone before this control's onDestroy).
+	std::weak_ptr<app_assist::WControl> m_viewRef;
 	ExistingContactCallback m_onExistingContact;
 	std::function<void()> m_onSelectRelationContact;
 	std::function<void()> m_onKeypadDown;

@@ -1284,35 +1284,15 @@ CtInputViewControl* CtInputView::__control() const
 	return static_cast<CtInputViewControl*>(m_control.lock().get());
 }
 
-// The SIM control and the edit tab view come from neighbouring work: until
-// their implementations are in the tree the SIM form is a plain list and a
-// tab page has no Save button to drive.
-#if __has_include("CtInputViewSimNameItem.h")
-#define SIM_CONTROL_PENDING 0
-#else
-#define SIM_CONTROL_PENDING 1
-#endif
-
 CtInputViewSimControl* CtInputView::__simControl() const
 {
-#if SIM_CONTROL_PENDING
-	return nullptr;
-#else
 	return static_cast<CtInputViewSimControl*>(m_simControl.lock().get());
-#endif
 }
 
 void CtInputView::__createControl(Evas_Object* layout, bool sim)
 {
 	app_assist::WControl* control = nullptr;
 	if (sim) {
-#if SIM_CONTROL_PENDING
-		// The SIM form comes with the SIM control; until then a plain list.
-		Evas_Object* genlist = elm_genlist_add(layout);
-		evas_object_size_hint_weight_set(genlist, EVAS_HINT_EXPAND, EVAS_HINT_EXPAND);
-		evas_object_size_hint_align_set(genlist, EVAS_HINT_FILL, EVAS_HINT_FILL);
-		elm_object_part_content_set(layout, "elm.swallow.content", genlist);
-#else
 		control = new CtInputViewSimControl(m_data, this);
 		if (!control->create(layout, nullptr)) {
 			WERROR("SIM control not created");
@@ -1320,7 +1300,6 @@ void CtInputView::__createControl(Evas_Object* layout, bool sim)
 		}
 		m_simControl = control->getWeakPtr();
 		elm_object_part_content_set(layout, "elm.swallow.content", control->getEvasObj());
-#endif
 		return;
 	}
 	std::weak_ptr<bool> alive = m_alive;
@@ -1349,10 +1328,8 @@ bool CtInputView::__controlIsEmpty()
 {
 	if (CtInputViewControl* control = __control())
 		return control->__checkIsEmpty();
-#if !SIM_CONTROL_PENDING
 	if (CtInputViewSimControl* control = __simControl())
 		return control->getIsEmpty();
-#endif
 	return true;
 }
 
@@ -1360,10 +1337,8 @@ bool CtInputView::__controlIsChanged()
 {
 	if (CtInputViewControl* control = __control())
 		return control->getIsChanged();
-#if !SIM_CONTROL_PENDING
 	if (CtInputViewSimControl* control = __simControl())
 		return control->getIsChanged();
-#endif
 	return false;
 }
 
@@ -1375,10 +1350,8 @@ bool CtInputView::__controlCheckEmergencyGroup()
 
 void CtInputView::__controlUpdateNameRecordForSim()
 {
-#if !SIM_CONTROL_PENDING
 	if (CtInputViewSimControl* control = __simControl())
 		control->updateNameRecordForSim();
-#endif
 }
 
 // The view waits for the keypad to go down before it leaves: the entry that
@@ -1401,10 +1374,8 @@ void CtInputView::__controlFocusForRename()
 {
 	if (CtInputViewControl* control = __control())
 		control->focusForRename();
-#if !SIM_CONTROL_PENDING
 	else if (CtInputViewSimControl* control = __simControl())
 		control->focusForRename();
-#endif
 }
 
 void CtInputView::__controlCloseHoversel()
@@ -1415,10 +1386,8 @@ void CtInputView::__controlCloseHoversel()
 
 void CtInputView::__controlUpdateStorageRow()
 {
-#if !SIM_CONTROL_PENDING
 	if (CtInputViewSimControl* control = __simControl())
 		control->updateAddrBookItem();
-#endif
 }
 
 void CtInputView::__controlUpdateRealizedItems()

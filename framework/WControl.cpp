@@ -1,6 +1,7 @@
 #include "WControl.h"
 
 #include "ContactsDebug.h"
+#include "WClippedSmartData.h"
 #include "WUiTimer.h"
 
 #include <algorithm>
@@ -104,8 +105,9 @@ Evas_Object* WControl::getPopupParent()
 	return m_evasObj;
 }
 
-void WControl::__evasObjDelCb(void* data, Evas*, Evas_Object*, void*)
+void WControl::__evasObjDelCb(void* data, Evas*, Evas_Object* obj, void*)
 {
+	WClippedSmartData::reclaimOnDelete(obj);
 	auto* self = static_cast<WControl*>(data);
 	self->m_ending = true;
 	self->__finish();

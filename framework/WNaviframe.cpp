@@ -1,6 +1,7 @@
 #include "WNaviframe.h"
 
 #include "ContactsDebug.h"
+#include "WClippedSmartData.h"
 #include "efl_extension.h"
 
 namespace app_assist {
@@ -17,6 +18,17 @@ WView* viewOf(Elm_Object_Item* item)
 {
 	auto* link = item ? static_cast<ItemLink*>(elm_object_item_data_get(item)) : nullptr;
 	return link ? static_cast<WView*>(link->view.lock().get()) : nullptr;
+}
+
+// The naviframe's page that holds `content` with the title's buttons, or
+// null when `content` is not on a page of `naviframe`.
+Evas_Object* pageOf(Evas_Object* content, Evas_Object* naviframe)
+{
+	for (Evas_Object* obj = content; obj; obj = evas_object_smart_parent_get(obj)) {
+		if (evas_object_smart_parent_get(obj) == naviframe)
+			return obj;
+	}
+	return nullptr;
 }
 
 } // namespace
@@ -86,6 +98,7 @@ bool WNaviframe::push(WView* view, const char* name, void* param)
 		return false;
 	}
 	__adopt(view, item);
+	WClippedSmartData::reclaimWhenDeleted(pageOf(view->getEvasObj(), naviframe));
 	std::weak_ptr<WControl> alive = view->getWeakPtr();
 	view->onPushed(item);
 	if (!alive.expired() && elm_naviframe_bottom_item_get(naviframe) == item)

@@ -12,6 +12,22 @@
 
 namespace ct::test {
 
+// A new record of the contact shown for `personId`, for a factory that takes
+// it over; null when there is no such person.
+inline contacts_record_h contactOfPerson(int personId)
+{
+	contacts_record_h person = nullptr;
+	if (personId < 1 || contacts_db_get_record(_contacts_person._uri, personId, &person) != CONTACTS_ERROR_NONE)
+		return nullptr;
+	int contactId = 0;
+	contacts_record_get_int(person, _contacts_person.display_contact_id, &contactId);
+	contacts_record_destroy(person, true);
+	contacts_record_h contact = nullptr;
+	if (contacts_db_get_record(_contacts_contact._uri, contactId, &contact) != CONTACTS_ERROR_NONE)
+		return nullptr;
+	return contact;
+}
+
 // What a factory may be given; each line takes what its factory needs.
 struct ScreenInputs {
 	int personId = 0;
@@ -32,6 +48,12 @@ inline const std::vector<LibraryScreen>& libraryScreens()
 		{ "createCtDetailViewForGalSearch",
 			[](const ScreenInputs& in) { return createCtDetailViewForGalSearch(const_cast<CtGalSearchData*>(in.galData)); } },
 		{ "createCtShareContactView", [](const ScreenInputs& in) { return createCtShareContactView(in.personId, in.request); } },
+		// The person's contact in the edit form (a new contact without one).
+		{ "createCtInputView",
+			[](const ScreenInputs& in) { return createCtInputView(contactOfPerson(in.personId), in.request); } },
+		{ "createCtInputViewForEditAppControl",
+			[](const ScreenInputs& in) { return createCtInputViewForEditAppControl(in.request); } },
+		{ "createCtMyProfileInputView", [](const ScreenInputs& in) { return createCtMyProfileInputView(nullptr, in.request); } },
 	};
 	return screens;
 }

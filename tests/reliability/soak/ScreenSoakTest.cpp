@@ -1,7 +1,7 @@
 // Opening and closing each screen many times in one process: memory stays
 // flat after a warm-up, and nothing the screens register on the main loop
 // or in the stores is left behind.
-#include "../../data/detail/DetailTestStore.h"
+#include "../../data/myprofile/MyProfileTestStore.h"
 #include "../SoakScreens.h"
 #include "../WriterProcess.h"
 #include "HandleCensus.h"
@@ -97,6 +97,9 @@ protected:
 		ASSERT_EQ(CONTACTS_ERROR_NONE, contacts_connect());
 		vconf_set_int(VCONFKEY_SETAPPL_PSMODE, 0);
 		m_inputs.personId = addRichPerson();
+		contacts_record_h profile = newProfile("Me");
+		addProfileNumber(profile, "+15550150", true);
+		storeProfile(profile);
 		m_gal = { nullptr, nullptr, "Gal Person", "+15550199", "+15550198", nullptr, "gal@example.com", "Gal Inc" };
 		m_inputs.galData = &m_gal;
 	}

@@ -53,6 +53,7 @@ inline const std::vector<LibraryScreen>& libraryScreens()
 			[](const ScreenInputs& in) { return createCtInputView(contactOfPerson(in.personId), in.request); } },
 		{ "createCtInputViewForEditAppControl",
 			[](const ScreenInputs& in) { return createCtInputViewForEditAppControl(in.request); } },
+		{ "createCtMyProfileDetailView", [](const ScreenInputs&) { return createCtMyProfileDetailView(); } },
 		{ "createCtMyProfileInputView", [](const ScreenInputs& in) { return createCtMyProfileInputView(nullptr, in.request); } },
 	};
 	return screens;

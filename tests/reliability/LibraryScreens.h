@@ -54,6 +54,7 @@ inline const std::vector<LibraryScreen>& libraryScreens()
 		{ "createCtInputViewForEditAppControl",
 			[](const ScreenInputs& in) { return createCtInputViewForEditAppControl(in.request); } },
 		{ "createCtMyProfileDetailView", [](const ScreenInputs&) { return createCtMyProfileDetailView(); } },
+		{ "createCtProfileWizardView", [](const ScreenInputs&) { return createCtProfileWizardView(); } },
 		{ "createCtMyProfileInputView", [](const ScreenInputs& in) { return createCtMyProfileInputView(nullptr, in.request); } },
 	};
 	return screens;

@@ -10,7 +10,6 @@
 #include "CtUnlinkContactView.h"
 #include "LogSink.h"
 #include "SqliteFaultInjector.h"
-#include "UsageLog.h"
 
 using namespace ct::test;
 
@@ -23,15 +22,6 @@ std::vector<int> sharedWith()
 	std::vector<int> list(ids, ids + std::max(count, 0));
 	free(ids);
 	return list;
-}
-
-Strings usageExtras(const std::string& feature)
-{
-	Strings extras;
-	for (const ct::usagelog::Record& record : ct::usagelog::records())
-		if (record.feature == feature)
-			extras.push_back(record.extra);
-	return extras;
 }
 
 bool personExists(int personId)

@@ -13,6 +13,7 @@
 #include "CtDetailData.h"
 #include "CtDetailView.h"
 #include "ScreenHarness.h"
+#include "UsageLog.h"
 
 #include <vconf.h>
 
@@ -39,6 +40,16 @@ inline Strings translated(const Strings& ids)
 	for (const std::string& id : ids)
 		texts.push_back(ContactsCommon::translate(id.c_str()));
 	return texts;
+}
+
+// The extras of the usage-log records of `feature`, oldest first.
+inline Strings usageExtras(const std::string& feature)
+{
+	Strings extras;
+	for (const ct::usagelog::Record& record : ct::usagelog::records())
+		if (record.feature == feature)
+			extras.push_back(record.extra);
+	return extras;
 }
 
 class DetailActionsTest : public ::testing::Test {

@@ -1,10 +1,14 @@
 #include "DemoScreens.h"
 
+#include "ContactsCommon.h"
 #include "ContactsDebug.h"
 #include "ShareFieldsRequest.h"
 
 #include <Ecore.h>
+#include <Elementary.h>
 #include <contacts.h>
+
+#include <cstring>
 
 namespace ct::demo {
 
@@ -52,6 +56,41 @@ void pressKey(Evas_Object* win, const char* key)
 	evas_event_feed_key_up(canvas, key, key, nullptr, nullptr, stamp + 1, nullptr);
 }
 
+Evas_Object* findCtxpopup(Evas_Object* obj)
+{
+	if (!strcmp(evas_object_type_get(obj), "elm_ctxpopup") && evas_object_visible_get(obj))
+		return obj;
+	Eina_List* members = evas_object_smart_members_get(obj);
+	Evas_Object* found = nullptr;
+	void* member = nullptr;
+	EINA_LIST_FREE(members, member) {
+		if (!found)
+			found = findCtxpopup(static_cast<Evas_Object*>(member));
+	}
+	return found;
+}
+
+// Opens the more menu with the more key and chooses the entry `textId`.
+void chooseMenuEntry(Evas_Object* win, const char* textId)
+{
+	pressKey(win, "Menu");
+	for (int i = 0; i < 10; ++i)
+		ecore_main_loop_iterate();
+	Evas_Object* menu = nullptr;
+	Evas* canvas = evas_object_evas_get(win);
+	for (Evas_Object* obj = evas_object_top_get(canvas); obj && !menu; obj = evas_object_below_get(obj))
+		menu = findCtxpopup(obj);
+	const char* wanted = ContactsCommon::translate(textId);
+	for (Elm_Object_Item* it = menu ? elm_ctxpopup_first_item_get(menu) : nullptr; it; it = elm_ctxpopup_item_next_get(it)) {
+		const char* label = elm_object_item_text_get(it);
+		if (label && !strcmp(label, wanted)) {
+			elm_ctxpopup_item_selected_set(it, EINA_TRUE);
+			return;
+		}
+	}
+	WERROR("no menu entry %s", textId);
+}
+
 template <typename Fn, typename... Args>
 app_assist::WView* make(const DetailsLibrary& library, const char* exportName, Args... args)
 {
@@ -88,7 +127,10 @@ const std::vector<DemoScreen>& demoScreens()
 				evas_object_geometry_get(win, nullptr, nullptr, &w, nullptr);
 				tapAt(win, w / 2, 160);
 			}},
-		{"mark-as-default", true, "the choice of a linked person's name and picture (the detail screen's more key)",
+		{"mark-as-default", true, "the choice of a linked person's name and picture (the detail screen's more menu)",
+			[](DemoScreenContext& c) { return make<CreateDetailViewFn>(c.library, "createCtDetailView", c.personId, nullptr); },
+			[](Evas_Object* win) { chooseMenuEntry(win, "IDS_PB_OPT_SET_DEFAULT_CONTACT_INFO_ABB"); }},
+		{"more-menu", true, "the detail screen's more menu",
 			[](DemoScreenContext& c) { return make<CreateDetailViewFn>(c.library, "createCtDetailView", c.personId, nullptr); },
 			[](Evas_Object* win) { pressKey(win, "Menu"); }},
 		{"wizard", false, "the profile set-up wizard",

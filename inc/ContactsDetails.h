@@ -30,8 +30,9 @@ app_assist::WView* createCtInputView(contacts_record_h record, CtLaunchRequest* 
 app_assist::WView* createCtInputViewForEditAppControl(CtLaunchRequest* request);
 // The detail screen of the user's own profile.
 app_assist::WView* createCtMyProfileDetailView();
-// The edit form of the user's own profile, seeded from `record` (null: the
-// stored profile); `hostData` is kept by the view for its caller.
+// The edit form of the user's own profile: the stored one, else a new one
+// seeded from `record` (may be null; the view takes it over). `hostData` is
+// the host's CtLaunchRequest or null, kept by the view.
 app_assist::WView* createCtMyProfileInputView(contacts_record_h record, void* hostData);
 // The first-time profile set-up wizard, at its first step.
 app_assist::WView* createCtProfileWizardView();

@@ -1,8 +1,10 @@
-// The library's entry points: the detail screen and the share-fields screen.
+// The library's entry points, one per screen.
 #include "ContactsDetails.h"
 
 #include "ContactsDebug.h"
 #include "CtDetailView.h"
+#include "CtInputView.h"
+#include "CtMyProfileInputView.h"
 #include "CtShareContactView.h"
 
 app_assist::WView* createCtDetailView(int personId, CtLaunchRequest* request)
@@ -19,7 +21,26 @@ app_assist::WView* createCtDetailViewForGalSearch(void* galData)
 	return new CtDetailView(static_cast<const CtGalSearchData*>(galData));
 }
 
+// The input view's framework base is not its first base: the pointer handed
+// out is that of the framework base, which the host deletes through.
+app_assist::WView* createCtInputView(contacts_record_h record, CtLaunchRequest* request)
+{
+	WENTER();
+	return new CtInputView(record, request);
+}
+
+app_assist::WView* createCtInputViewForEditAppControl(CtLaunchRequest* request)
+{
+	WENTER();
+	return new CtInputView(request);
+}
+
 app_assist::WView* createCtShareContactView(int personId, CtLaunchRequest* request)
 {
 	return new CtShareContactView(personId, request);
+}
+
+app_assist::WView* createCtMyProfileInputView(contacts_record_h record, void* hostData)
+{
+	return new CtMyProfileInputView(record, static_cast<CtLaunchRequest*>(hostData));
 }

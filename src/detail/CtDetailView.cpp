@@ -29,7 +29,9 @@
 #include "CtDetailViewVideoCallItem.h"
 #include "CtDetailViewWebsiteItem.h"
 #include "CtDllViewFactory.h"
+#include "CtEditTabView.h"
 #include "CtEsuAgentMgr.h"
+#include "CtInputView.h"
 #include "CtRegistryMgr.h"
 #include "CtSimMgr.h"
 #include "CtThemeMgr.h"
@@ -1098,6 +1100,16 @@ void CtDetailView::__onEditCb()
 	Eina_List* contacts = m_detailData->getContactsWithoutFacebook();
 	int count = eina_list_count(contacts);
 	WERROR("count : %d", count);
+	if (count > 1) {
+		__pushView(new CtEditTabView(contacts));
+	} else if (count == 1) {
+		contacts_record_h clone = nullptr;
+		int err = contacts_record_clone(static_cast<contacts_record_h>(eina_list_data_get(contacts)), &clone);
+		if (err != CONTACTS_ERROR_NONE)
+			WWARNING("contacts_record_clone() Failed(%d)", err);
+		else
+			__pushView(new CtInputView(clone));
+	}
 	ctCommonDestroyRecordList(contacts);
 }
 

@@ -15,6 +15,8 @@
 #include "ScreenHarness.h"
 #include "UsageLog.h"
 
+#include <sys/wait.h>
+#include <unistd.h>
 #include <vconf.h>
 
 #include <filesystem>
@@ -50,6 +52,23 @@ inline Strings usageExtras(const std::string& feature)
 		if (record.feature == feature)
 			extras.push_back(record.extra);
 	return extras;
+}
+
+// Runs `change` in a child process with its own store connection, as another
+// application would; true when it succeeded.
+template <typename Change>
+bool changeFromAnotherProcess(Change change)
+{
+	pid_t child = fork();
+	if (child == 0) {
+		int rc = contacts_connect();
+		if (rc == CONTACTS_ERROR_NONE)
+			rc = change();
+		_exit(rc == CONTACTS_ERROR_NONE ? 0 : 1);
+	}
+	int status = 0;
+	waitpid(child, &status, 0);
+	return child > 0 && WIFEXITED(status) && WEXITSTATUS(status) == 0;
 }
 
 class DetailActionsTest : public ::testing::Test {

@@ -107,7 +107,9 @@ Evas_Object* CtEditTabView::onCreate(Evas_Object* parent, void*)
 	setOnInitScroller([this](Evas_Object* scroller) {
 		elm_scroller_policy_set(scroller, ELM_SCROLLER_POLICY_OFF, ELM_SCROLLER_POLICY_OFF);
 		uxt_scroller_set_auto_scroll_enabled(scroller, EINA_FALSE);
+		evas_object_smart_callback_add(scroller, "scroll,anim,start", __pageScrollAnimStartCb, this);
 		evas_object_smart_callback_add(scroller, "scroll,anim,stop", __pageScrollStopCb, this);
+		evas_object_smart_callback_add(scroller, "scroll", __pageScrolledCb, this);
 		evas_object_smart_callback_add(scroller, "scroll,drag,start", __pageScrollStartCb, this);
 	});
 	Evas_Object* content = createPageSlideContent(layout);
@@ -121,7 +123,9 @@ void CtEditTabView::onDestroy()
 	app_assist::WUiTimer::destroy(m_restIdler);
 	app_assist::WUiTimer::destroy(m_restTimer);
 	if (Evas_Object* scroller = getScroller()) {
+		evas_object_smart_callback_del_full(scroller, "scroll,anim,start", __pageScrollAnimStartCb, this);
 		evas_object_smart_callback_del_full(scroller, "scroll,anim,stop", __pageScrollStopCb, this);
+		evas_object_smart_callback_del_full(scroller, "scroll", __pageScrolledCb, this);
 		evas_object_smart_callback_del_full(scroller, "scroll,drag,start", __pageScrollStartCb, this);
 	}
 }
@@ -185,8 +189,19 @@ void CtEditTabView::__buildPage(int index)
 	m_contentMade[index] = true;
 	m_pages[index] = nullptr;
 	// A page that cannot be placed is destroyed by the page slide view.
-	if (setPageContent(index, page))
-		page->createEditSubViewContent();
+	if (!setPageContent(index, page))
+		return;
+	__allowFocus(index, index == m_currentPage);
+	page->createEditSubViewContent();
+}
+
+// A page out of sight takes no focus: the page scroller would follow the
+// focus there, away from the chosen tab.
+void CtEditTabView::__allowFocus(int index, bool allowed)
+{
+	CtInputView* page = isPageBuilt(index) ? getPage(index) : nullptr;
+	if (page && page->getEvasObj())
+		elm_object_tree_focus_allow_set(page->getEvasObj(), allowed ? EINA_TRUE : EINA_FALSE);
 }
 
 void CtEditTabView::__createRestViews()
@@ -207,10 +222,12 @@ void CtEditTabView::__tabChanged(Elm_Object_Item* toolbarItem)
 	if (CtInputView* current = isPageBuilt(m_currentPage) ? getPage(m_currentPage) : nullptr)
 		current->onTabUnselect(getNaviItem());
 	int index = static_cast<int>(found - m_tabItems);
-	__buildPage(index);
-	if (CtInputView* page = getPage(index))
-		page->onTabSelect(getNaviItem());
+	__allowFocus(m_currentPage, false);
 	m_currentPage = index;
+	__buildPage(index);
+	__allowFocus(index, true);
+	if (CtInputView* page = isPageBuilt(index) ? getPage(index) : nullptr)
+		page->onTabSelect(getNaviItem());
 	showPage(index, true);
 }
 
@@ -218,12 +235,23 @@ void CtEditTabView::__tabChanged(Elm_Object_Item* toolbarItem)
 // tab started may stop on its way, over another page.
 void CtEditTabView::__onPageScrollStopped()
 {
-	if (!m_dragged)
-		return;
-	m_dragged = false;
+	m_animating = false;
 	int shown = getCurrentPage();
+	if (!m_dragged) {
+		__keepCurrentPage();
+		return;
+	}
+	m_dragged = false;
 	if (shown >= 0 && shown < m_pageCount && shown != m_currentPage && m_tabItems[shown])
 		elm_toolbar_item_selected_set(m_tabItems[shown], EINA_TRUE);
+}
+
+// An entry or row of a page asks its scrollers to show it (a cursor moved,
+// a row was realized); the page scroller must not follow it to another page.
+void CtEditTabView::__keepCurrentPage()
+{
+	if (!m_animating && !m_dragged && getCurrentPage() != m_currentPage)
+		showPage(m_currentPage, false);
 }
 
 // The pages beside the shown one come into view while dragging.
@@ -359,6 +387,18 @@ void CtEditTabView::__pageScrollStopCb(void* data, Evas_Object*, void*)
 {
 	WPRET_M(!data, "Invalid param : data");
 	static_cast<CtEditTabView*>(data)->__onPageScrollStopped();
+}
+
+void CtEditTabView::__pageScrollAnimStartCb(void* data, Evas_Object*, void*)
+{
+	WPRET_M(!data, "Invalid param : data");
+	static_cast<CtEditTabView*>(data)->m_animating = true;
+}
+
+void CtEditTabView::__pageScrolledCb(void* data, Evas_Object*, void*)
+{
+	WPRET_M(!data, "Invalid param : data");
+	static_cast<CtEditTabView*>(data)->__keepCurrentPage();
 }
 
 void CtEditTabView::__pageScrollStartCb(void* data, Evas_Object*, void*)

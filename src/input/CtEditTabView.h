@@ -52,9 +52,11 @@ protected:
 private:
 	void __createTitleButtons(Elm_Object_Item* naviItem);
 	void __buildPage(int index);
+	void __allowFocus(int index, bool allowed);
 	void __createRestViews();
 	void __tabChanged(Elm_Object_Item* toolbarItem);
 	void __onPageScrollStopped();
+	void __keepCurrentPage();
 	void __onPageScrollStarted();
 	void __save();
 	void __cancel();
@@ -65,6 +67,8 @@ private:
 
 	static void __tabSelectedCb(void* data, Evas_Object* obj, void* eventInfo);
 	static void __pageScrollStopCb(void* data, Evas_Object* obj, void* eventInfo);
+	static void __pageScrollAnimStartCb(void* data, Evas_Object* obj, void* eventInfo);
+	static void __pageScrolledCb(void* data, Evas_Object* obj, void* eventInfo);
 	static void __pageScrollStartCb(void* data, Evas_Object* obj, void* eventInfo);
 	static void __saveCb(void* data, Evas_Object* obj, void* eventInfo);
 	static void __cancelCb(void* data, Evas_Object* obj, void* eventInfo);
@@ -83,6 +87,7 @@ private:
 	Eina_List* m_records = nullptr;
 	bool m_closing = false;
 	bool m_dragged = false;
+	bool m_animating = false;
 };
 
 #endif

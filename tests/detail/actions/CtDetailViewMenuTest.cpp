@@ -263,6 +263,7 @@ TEST_F(DetailActionsTest, ManyLinkedContactsOpenTheUnlinkListAndTheChoiceOfDefau
 	ASSERT_NE(nullptr, unlink);
 	EXPECT_EQ(id, unlink->getPersonId());
 	m_screen->naviframe()->pop();
+	ASSERT_TRUE(m_screen->pumpUntil([this] { return m_screen->viewCount() == 1; }));
 	m_screen->pumpUntilIdle();
 
 	ASSERT_TRUE(choose(SET_DEFAULT));

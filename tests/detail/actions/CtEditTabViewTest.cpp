@@ -110,6 +110,8 @@ TEST_F(EditFromDetailTest, BackOrCancelWithoutChangesLeavesAtOnce)
 		CtEditTabView* tabs = openTabs(id);
 		ASSERT_NE(nullptr, tabs);
 		const int below = m_screen->viewCount() - 1;
+		// The back key first takes down the keypad the form may have raised.
+		m_screen->lowerKeypad();
 		if (useCancel)
 			ASSERT_TRUE(clickPopupButton("IDS_TPLATFORM_ACBUTTON_CANCEL_ABB"));
 		else

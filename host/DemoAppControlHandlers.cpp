@@ -2,6 +2,7 @@
 
 #include "ContactsAppIds.h"
 #include "ContactsDebug.h"
+#include "CtEsuAgentMgr.h"
 
 #include <notification.h>
 
@@ -24,6 +25,7 @@ std::string roleOf(const std::string& appId, const std::string& operation)
 		{IMAGE_EDITOR_APP_ID, "Image editor"}, {RINGTONE_PICKER_APP_ID, "Ringtone picker"},
 		{MESSAGE_COMPOSER_APP_ID, "Message"}, {CONTACTS_LIST_APP_ID, "Contact picker"},
 		{FACEBOOK_APP_ID, "Facebook"}, {CONTACTS_APP_ID, "Contacts"}, {ACCOUNT_SETTINGS_APP_ID, "Accounts"},
+		{CtEsuAgentMgr::kSignUpAppId, "Sign-up"},
 	};
 	static const std::map<std::string, std::string> operations = {
 		{APP_CONTROL_OPERATION_CALL, "Call"}, {APP_CONTROL_OPERATION_DIAL, "Dial"},
@@ -95,6 +97,8 @@ DemoAppControlHandlers::DemoAppControlHandlers(std::string picturePath)
 	__byApp(RINGTONE_PICKER_APP_ID, Answer::Ringtone);
 	for (const char* app : {MAPS_APP_ID, MESSAGE_COMPOSER_APP_ID, FACEBOOK_APP_ID, ACCOUNT_SETTINGS_APP_ID})
 		__byApp(app, Answer::Done);
+	// Signing up for profile sharing always succeeds on the demo device.
+	__byApp(CtEsuAgentMgr::kSignUpAppId, Answer::Done);
 	// The demo has no contact or group picker to choose with.
 	__byApp(CONTACTS_LIST_APP_ID, Answer::None);
 }

@@ -2,6 +2,7 @@
 
 #include "ContactsDebug.h"
 #include "DemoPeople.h"
+#include "DemoProfile.h"
 #include "DemoPictures.h"
 
 #include <contacts.h>
@@ -57,7 +58,11 @@ int DemoDatabase::open()
 int DemoDatabase::__fill()
 {
 	WINFO("creating the demo persons");
-	int err = DemoPeople::fill(DemoPictures::ensure());
+	std::vector<std::string> pictures = DemoPictures::ensure();
+	int err = DemoPeople::fill(pictures);
+	int profileErr = DemoProfile::ensure(pictures);
+	if (err == CONTACTS_ERROR_NONE)
+		err = profileErr;
 	m_created = true;
 	int blockErr = blockDemoNumbers();
 	return err != CONTACTS_ERROR_NONE ? err : blockErr;

@@ -116,6 +116,14 @@ const std::vector<DemoScreen>& demoScreens()
 			}},
 		{"my-profile", false, "the user's own profile",
 			[](DemoScreenContext& c) { return make<CreateMyProfileDetailViewFn>(c.library, "createCtMyProfileDetailView"); }},
+		{"profile-sharing", false, "the profile sharing settings (the profile screen's more menu)",
+			[](DemoScreenContext& c) { return make<CreateMyProfileDetailViewFn>(c.library, "createCtMyProfileDetailView"); },
+			[](Evas_Object* win) {
+				chooseMenuEntry(win, "IDS_PB_OPT_PROFILE_SHARING_ABB");
+				// The first time, the sign-up step answers on the main loop before the screen comes.
+				for (int i = 0; i < 10; ++i)
+					ecore_main_loop_iterate();
+			}},
 		{"my-profile-edit", false, "the edit form of the user's own profile",
 			[](DemoScreenContext& c) {
 				return make<CreateMyProfileInputViewFn>(c.library, "createCtMyProfileInputView", contacts_record_h(nullptr), nullptr);

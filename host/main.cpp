@@ -40,6 +40,13 @@ void quietToolkit()
 	setenv("ECORE_NO_SYSTEM_MODULES", "1", 0);
 }
 
+// The demo device has the easy sign-up feature, so the profile screen offers
+// profile sharing ($CONTACTS_FEATURES set by the caller wins).
+void offerProfileSharing()
+{
+	setenv("CONTACTS_FEATURES", "13", 0);
+}
+
 } // namespace
 
 int main(int argc, char** argv)
@@ -65,6 +72,7 @@ int main(int argc, char** argv)
 		setenv("ECORE_EVAS_ENGINE", "buffer", 1);
 	}
 	quietToolkit();
+	offerProfileSharing();
 	setlocale(LC_ALL, "");
 	useEnglishTextsOnPlainLocale();
 	elm_init(argc, argv);

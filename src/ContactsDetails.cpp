@@ -4,6 +4,7 @@
 #include "ContactsDebug.h"
 #include "CtDetailView.h"
 #include "CtInputView.h"
+#include "CtMyProfileDetailView.h"
 #include "CtMyProfileInputView.h"
 #include "CtShareContactView.h"
 
@@ -33,6 +34,12 @@ app_assist::WView* createCtInputViewForEditAppControl(CtLaunchRequest* request)
 {
 	WENTER();
 	return new CtInputView(request);
+}
+
+app_assist::WView* createCtMyProfileDetailView()
+{
+	WENTER();
+	return new CtMyProfileDetailView(false);
 }
 
 app_assist::WView* createCtShareContactView(int personId, CtLaunchRequest* request)

@@ -157,8 +157,11 @@ int checkSimContact(ContactsConnection& conn, const contacts_record_s& contact, 
 	ContactsSim::Slot s = ContactsSim::slot(*slotNo);
 	WPRET_VM(!fits(firstText(contact, "name", "first"), s.nameMax), CONTACTS_ERROR_INVALID_PARAMETER,
 		"name too long for the SIM");
-	WPRET_VM(!fits(firstText(contact, "number", "number"), s.numberMax), CONTACTS_ERROR_INVALID_PARAMETER,
-		"number too long for the SIM");
+	// A leading '+' is kept in the number's type of number, not among its digits.
+	const char* number = firstText(contact, "number", "number");
+	if (number && *number == '+')
+		++number;
+	WPRET_VM(!fits(number, s.numberMax), CONTACTS_ERROR_INVALID_PARAMETER, "number too long for the SIM");
 	WPRET_VM(!fits(firstText(contact, "email", "email"), s.emailMax), CONTACTS_ERROR_INVALID_PARAMETER,
 		"e-mail too long for the SIM");
 	return CONTACTS_ERROR_NONE;

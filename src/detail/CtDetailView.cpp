@@ -26,6 +26,7 @@
 #include "CtDetailViewRelationItem.h"
 #include "CtDetailViewRingtoneItem.h"
 #include "CtDetailViewStatusItem.h"
+#include "CtDetailViewUtil.h"
 #include "CtDetailViewVideoCallItem.h"
 #include "CtDetailViewWebsiteItem.h"
 #include "CtDllViewFactory.h"
@@ -77,9 +78,7 @@ enum RowKind {
 constexpr int kFirstFrameRows = 6;
 constexpr double kChangeCoalescingSeconds = 2.0;
 constexpr double kFavoriteSettleSeconds = 0.7;
-constexpr const char* kEdjFiles[] = {"contacts/contacts.edj", "contacts/detail_layout.edj"};
 constexpr const char* kInputNaviItemKey = "input_navi_item";
-constexpr int kMaxAddressBytes = 1024;
 constexpr const char* kSelectedPersonIdKey = "selected_personid";
 
 // Base-10 strtol as the request gives it; a value outside int is no id.
@@ -107,37 +106,6 @@ int readExtraId(app_control_h request, const char* key, bool* present = nullptr)
 	return id;
 }
 
-// The toolkit composes title texts in fixed buffers and aborts on very long
-// ones; no one reads past the first few lines of a title anyway.
-constexpr glong kTitleMostCharacters = 256;
-
-std::string titleMarkup(const char* text)
-{
-	if (!text || !*text)
-		return "";
-	gchar* valid = g_utf8_make_valid(text, -1);
-	gchar* shortened = g_utf8_substring(valid, 0, std::min(g_utf8_strlen(valid, -1), kTitleMostCharacters));
-	std::string markup = ctCommonUtf8ToMarkup(shortened);
-	g_free(shortened);
-	g_free(valid);
-	return markup;
-}
-
-void appendNonEmpty(std::string& joined, const char* part)
-{
-	if (!part || !*part)
-		return;
-	if (!joined.empty())
-		joined += ",";
-	joined += part;
-}
-
-CtDetailViewGenlistItem* rowOf(Elm_Object_Item* item)
-{
-	auto* base = static_cast<app_assist::WGenlistItem*>(elm_object_item_data_get(item));
-	return dynamic_cast<CtDetailViewGenlistItem*>(base);
-}
-
 bool isListKind(int kind)
 {
 	switch (kind) {
@@ -155,28 +123,9 @@ bool isListKind(int kind)
 	}
 }
 
-// Rows of one height: at most one address and one note, the rows that wrap.
-bool hasCompactRows(CtDetailData* data)
-{
-	return eina_list_count(data->getAddressList()) <= 1 && eina_list_count(data->getNoteList()) <= 1;
-}
-
 bool hasText(const char* text)
 {
 	return text && *text;
-}
-
-const char* powerSavingIconPart(int itemType)
-{
-	switch (itemType) {
-	case DETAIL_ITEM_VIDEO_CALL:
-	case DETAIL_ITEM_EMAIL:
-		return "elm.icon.2";
-	case DETAIL_ITEM_ADDRESS:
-		return "elm.icon.right";
-	default:
-		return nullptr;
-	}
 }
 
 // A person of several contacts chooses which one gives the name or picture.
@@ -315,7 +264,7 @@ void CtDetailView::__createData(int personId)
 		WERROR("no person to show : %d", personId);
 	m_detailData.reset(new CtDetailData(personId));
 	m_isSimContact = m_detailData->isSimContact();
-	m_isCompactLayout = hasCompactRows(m_detailData.get());
+	m_isCompactLayout = ctDetailHasCompactRows(m_detailData.get());
 }
 
 Evas_Object* CtDetailView::onCreate(Evas_Object* parent, void*)
@@ -323,7 +272,7 @@ Evas_Object* CtDetailView::onCreate(Evas_Object* parent, void*)
 	WENTER();
 	Evas_Object* layout = createBaseLayout(parent, nullptr, nullptr);
 	WPRET_VM(!layout, nullptr, "createBaseLayout() failed");
-	__addExtensionThemes();
+	ctDetailAddExtensionThemes();
 	CtThemeMgr::getInstance()->setObjectTheme(layout);
 
 	m_genlist = elm_genlist_add(layout);
@@ -339,15 +288,6 @@ Evas_Object* CtDetailView::onCreate(Evas_Object* parent, void*)
 	evas_object_smart_callback_add(m_genlist, "pressed", __genlistPressedCb, this);
 	evas_object_smart_callback_add(m_genlist, "released", __genlistReleasedCb, this);
 	return layout;
-}
-
-void CtDetailView::__addExtensionThemes()
-{
-	for (const char* edj : kEdjFiles) {
-		std::string path;
-		ContactsCommon::getAppEdjePath(edj, path, true);
-		CtThemeMgr::getInstance()->addExtensionTheme(path.c_str());
-	}
 }
 
 void CtDetailView::__connectCallBlock()
@@ -521,7 +461,7 @@ CtDetailViewGenlistItem* CtDetailView::__makeSingleItem(int kind)
 	CtDetailData* data = m_detailData.get();
 	switch (kind) {
 	case KIND_PICTURE:
-		return m_isSimContact ? nullptr : new CtDetailViewMultiImageItem(this, data, __isLowSizePicture());
+		return m_isSimContact ? nullptr : new CtDetailViewMultiImageItem(this, data, ctDetailIsLowSizePicture(data, getEvasObj()));
 	case KIND_STATUS:
 		return CtEsuAgentMgr::getInstance()->getEasySignUpCscFeatureEnabled() && hasText(data->getStatus())
 			? new CtDetailViewStatusItem(data) : nullptr;
@@ -574,7 +514,7 @@ Elm_Object_Item* CtDetailView::__appendItem(CtDetailViewGenlistItem* row)
 			m_firstNumberItem = item;
 		m_lastNumberItem = item;
 	}
-	if (powerSavingIconPart(row->getItemType()))
+	if (ctDetailPowerSavingIconPart(row->getItemType()))
 		elm_object_item_disabled_set(item, m_isPowerSaving ? EINA_TRUE : EINA_FALSE);
 	return item;
 }
@@ -621,16 +561,6 @@ CtDetailViewGenlistItem* CtDetailView::__makeNoteItem(contacts_record_h record)
 	return new CtDetailViewNoteItem(m_detailData.get(), record);
 }
 
-bool CtDetailView::__isLowSizePicture()
-{
-	char* first = m_detailData->getImagePath(1);
-	char* second = m_detailData->getImagePath(2);
-	bool lowSize = first && *first && !(second && *second) && ctCommonIsLowSizeImage(getEvasObj(), first);
-	free(first);
-	free(second);
-	return lowSize;
-}
-
 bool CtDetailView::__getNumberCallBlockStatus(contacts_record_h number)
 {
 	WPRET_VM(!number, false, "paramter(number) is nullptr");
@@ -648,18 +578,7 @@ bool CtDetailView::__getNumberCallBlockStatus(contacts_record_h number)
 
 void CtDetailView::__updateTitle()
 {
-	Elm_Object_Item* naviItem = getNaviItem();
-	WPRET_M(!naviItem, "naviItem is nullptr");
-	std::string title = titleMarkup(m_detailData->getDisplayName());
-	if (title.empty())
-		title = ContactsCommon::translate("IDS_LOGS_MBODY_UNKNOWN");
-	elm_object_item_part_text_set(naviItem, "elm.text.title", title.c_str());
-
-	std::string subtitle;
-	appendNonEmpty(subtitle, m_detailData->getExtraName1Second());
-	appendNonEmpty(subtitle, m_detailData->getExtraName1First());
-	appendNonEmpty(subtitle, m_detailData->getCompany());
-	elm_object_item_part_text_set(naviItem, "subtitle", subtitle.empty() ? nullptr : titleMarkup(subtitle.c_str()).c_str());
+	ctDetailUpdateTitle(getNaviItem(), m_detailData.get());
 }
 
 // After every rebuild the star shows the stored state: the person may have
@@ -719,7 +638,7 @@ void CtDetailView::onDbChanged(const char* viewUri)
 		return;
 	}
 	// Re-themed only when rebuilt: a counted change redraws nothing.
-	__addExtensionThemes();
+	ctDetailAddExtensionThemes();
 	CtThemeMgr::getInstance()->setObjectTheme(getEvasObj());
 	__startChangeTimer();
 	__closePopup();
@@ -777,7 +696,7 @@ void CtDetailView::__updateGenlist()
 
 void CtDetailView::__applyCompactLayout()
 {
-	m_isCompactLayout = hasCompactRows(m_detailData.get());
+	m_isCompactLayout = ctDetailHasCompactRows(m_detailData.get());
 	elm_genlist_homogeneous_set(m_genlist, m_isCompactLayout ? EINA_TRUE : EINA_FALSE);
 }
 
@@ -809,7 +728,7 @@ void CtDetailView::__refreshRows()
 	if (!m_genlist)
 		return;
 	for (Elm_Object_Item* item = elm_genlist_first_item_get(m_genlist); item; item = elm_genlist_item_next_get(item)) {
-		if (CtDetailViewGenlistItem* row = rowOf(item))
+		if (CtDetailViewGenlistItem* row = ctDetailRowOf(item))
 			row->invalidateContent();
 	}
 	elm_genlist_realized_items_update(m_genlist);
@@ -821,7 +740,7 @@ void CtDetailView::__onBlockListChanged()
 	if (!m_firstNumberItem || !m_lastNumberItem)
 		return;
 	for (Elm_Object_Item* item = m_firstNumberItem; item; item = elm_genlist_item_next_get(item)) {
-		if (auto* row = dynamic_cast<CtDetailViewNumberItem*>(rowOf(item))) {
+		if (auto* row = dynamic_cast<CtDetailViewNumberItem*>(ctDetailRowOf(item))) {
 			row->setBlocked(__getNumberCallBlockStatus(row->getRecord()));
 			elm_genlist_item_fields_update(item, "elm.icon.left.bottom", ELM_GENLIST_ITEM_FIELD_CONTENT);
 		}
@@ -833,16 +752,7 @@ void CtDetailView::__onBlockListChanged()
 void CtDetailView::__onPowerSavingChanged(bool on)
 {
 	m_isPowerSaving = on;
-	WPRET_M(!m_genlist, "__genlist is nullptr");
-	for (Elm_Object_Item* item = elm_genlist_first_item_get(m_genlist); item; item = elm_genlist_item_next_get(item)) {
-		CtDetailViewGenlistItem* row = rowOf(item);
-		const char* part = row ? powerSavingIconPart(row->getItemType()) : nullptr;
-		if (!part)
-			continue;
-		row->setPowerSaving(on);
-		elm_object_item_disabled_set(item, on ? EINA_TRUE : EINA_FALSE);
-		elm_genlist_item_fields_update(item, part, ELM_GENLIST_ITEM_FIELD_CONTENT);
-	}
+	ctDetailApplyPowerSaving(m_genlist, on);
 }
 
 void CtDetailView::__startFavoriteSettleTimer()
@@ -934,34 +844,7 @@ void CtDetailView::__showVideoCallPopup()
 void CtDetailView::onAddressSelected(contacts_record_h address)
 {
 	WHIT();
-	WPRET_M(!address, "address is nullptr");
-	if (csc_feature_get_bool(CSC_FEATURE_CONTACTS_HIDE_ADDRESS_ROW))
-		return;
-	std::string mapsAppId;
-	ctCommontGetMapsAppId(mapsAppId);
-	WPRET_M(mapsAppId.empty(), "mapsAppId is empty");
-	char text[kMaxAddressBytes] = {0};
-	m_detailData->getAddress(address, text, sizeof(text));
-	std::string markup = ctCommonUtf8ToMarkup(text);
-
-	app_control_h request = nullptr;
-	int err = app_control_create(&request);
-	WPRET_M(err != APP_CONTROL_ERROR_NONE, "app_control_create() Failed(%d)", err);
-	app_control_set_launch_mode(request, APP_CONTROL_LAUNCH_MODE_GROUP);
-	if (mapsAppId == MAPS_APP_ID) {
-		app_control_set_app_id(request, MAPS_APP_ID);
-		app_control_add_extra_data(request, "searchByName", markup.c_str());
-	} else {
-		std::string encoded;
-		ctCommontEncodeAddress(markup.c_str(), encoded);
-		char uri[kMaxAddressBytes] = {0};
-		snprintf(uri, sizeof(uri), "geo:0,0?q=\"%s\"", encoded.c_str());
-		app_control_set_operation(request, APP_CONTROL_OPERATION_VIEW);
-		app_control_set_uri(request, uri);
-	}
-	if (!ContactsAppControlLauncher::getInstance()->sendLaunchRequest(request))
-		WERROR("launch Failed");
-	app_control_destroy(request);
+	ctDetailOpenAddressInMaps(m_detailData.get(), address);
 }
 
 void CtDetailView::onImageSelected(int page)

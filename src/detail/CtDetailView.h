@@ -80,7 +80,6 @@ private:
 	void __initialize(CtLaunchRequest* request);
 	void __listenToPowerSaving();
 	void __createData(int personId);
-	void __addExtensionThemes();
 	void __connectCallBlock();
 	void __disconnectCallBlock();
 	void __addAllItems();
@@ -101,7 +100,6 @@ private:
 	CtDetailViewGenlistItem* __makeRelationItem(contacts_record_h record);
 	CtDetailViewGenlistItem* __makeEventItem(contacts_record_h record);
 	CtDetailViewGenlistItem* __makeNoteItem(contacts_record_h record);
-	bool __isLowSizePicture();
 	bool __getNumberCallBlockStatus(contacts_record_h number);
 	void __updateTitle();
 	void __updateFavoriteBtn();

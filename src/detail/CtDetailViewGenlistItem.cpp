@@ -52,10 +52,22 @@ void recolorIcon(Evas_Object* layout, const char* touchPart, const std::string& 
 		ctCommonSetImageColor(image, code.c_str());
 }
 
+unsigned nextContentGeneration()
+{
+	static unsigned generation = 0;
+	return ++generation;
+}
+
 } // namespace
 
-CtDetailViewGenlistItem::CtDetailViewGenlistItem(CtDetailDataBase* data) : m_data(data)
+CtDetailViewGenlistItem::CtDetailViewGenlistItem(CtDetailDataBase* data)
+	: m_data(data), m_contentGeneration(nextContentGeneration())
 {
+}
+
+void CtDetailViewGenlistItem::invalidateContent()
+{
+	m_contentGeneration = nextContentGeneration();
 }
 
 CtDetailViewGenlistItem::~CtDetailViewGenlistItem() = default;

@@ -52,7 +52,7 @@ public:
 
 	// Contents made so far are not reused when the item is realized or its
 	// parts updated again; call it when what the contents show has changed.
-	void invalidateContent() { ++m_contentGeneration; }
+	void invalidateContent();
 
 	void setHighlighted(bool on) { highlighted = on; }
 	bool isHighlighted() const { return highlighted; }
@@ -105,7 +105,9 @@ private:
 	static void __iconReleasedCb(void* data, Evas_Object* obj, const char* emission, const char* source);
 
 	CtDetailDataBase* m_data;
-	unsigned m_contentGeneration = 1;
+	// Unique over all rows: the list keeps contents of deleted rows for reuse,
+	// and a new row may be given the address of a deleted one.
+	unsigned m_contentGeneration;
 	std::string m_iconColor;
 	unsigned m_iconColorGeneration = 0;
 };

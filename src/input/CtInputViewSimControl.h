@@ -3,12 +3,14 @@
 
 #include "CtData.h"
 #include "WControl.h"
+#include "WGenlistItem.h"
 
 #include <memory>
+#include <vector>
 
 class CtInputView;
 class CtInputViewAddrBookItem;
-class CtInputViewSimEmailItem;
+class CtInputViewGenlistItem;
 class CtInputViewSimNameItem;
 
 // The edit form of a contact stored on a SIM card: one name, one number and,
@@ -52,11 +54,15 @@ private:
 	bool __hasEmailRoom();
 	bool __needsEmailItem();
 	Elm_Object_Item* __appendRow(app_assist::WGenlistItem* row, Elm_Object_Item* after = nullptr);
-	void __insertEmailItem();
+	// `stored`: the row shows the stored e-mail (made with the list).
+	void __insertEmailItem(bool stored);
 	void __removeEmailItem();
+	// The field rows, from the first row up to the storage row.
+	std::vector<CtInputViewGenlistItem*> __fieldRows() const;
 	void __updateSaveBtn();
 	void __onAddrbookItemSelectedCb();
 	void __onStorageChosen(int addressbookId);
+	void __moveToOtherCard(int addressbookId);
 	void __askChangeLocation(int addressbookId);
 	void __switchToStorage(int addressbookId);
 	static void __createKeypadTimerCb(void* data);

@@ -88,6 +88,16 @@ TEST(Sim, ConfiguredSimsHaveTheirOwnCapacityAndLimits)
 	EXPECT_EQ(0, unused);
 	EXPECT_EQ(CONTACTS_ERROR_NONE, contacts_sim_insert(makeContact({ "Zwei", "", {}, {}, book2 }).get(), nullptr));
 	contacts_disconnect();
+
+	// The leading plus of an international number takes no digit of the card.
+	std::ofstream(dir.file("sim.conf")) << "[SIM1]\nnumber_max=4\n";
+	ASSERT_EQ(CONTACTS_ERROR_NONE, contacts_connect());
+	EXPECT_EQ(CONTACTS_ERROR_NONE, contacts_sim_insert(makeContact({ "Plus", "", { "+1234" }, {}, book1 }).get(), nullptr));
+	EXPECT_EQ(CONTACTS_ERROR_INVALID_PARAMETER,
+		contacts_sim_insert(makeContact({ "Long", "", { "12345" }, {}, book1 }).get(), nullptr));
+	EXPECT_EQ(CONTACTS_ERROR_INVALID_PARAMETER,
+		contacts_sim_insert(makeContact({ "Plus2", "", { "+12345" }, {}, book1 }).get(), nullptr));
+	contacts_disconnect();
 }
 
 TEST(ContactsCtlContacts, AddListLinkUnlinkAndDeletePersonsFromOutside)

@@ -80,9 +80,11 @@ TEST_F(EditFromDetailTest, TabsOnePerLinkedContactUpToTenExpandingUpToFour)
 		std::vector<bool> first(c.tabs, false);
 		first[0] = true;
 		EXPECT_EQ(first, builtPages(tabs));
-		if (c.linked == 4 || c.linked == 5)
-			m_screen->savePng(actionShotPath("edit-tabs-" + std::to_string(c.linked) + ".png"));
 		EXPECT_TRUE(m_screen->pumpUntil([&] { return builtPages(tabs) == std::vector<bool>(c.tabs, true); }));
+		if (c.linked == 4 || c.linked == 5) {
+			m_screen->pumpUntilIdle();
+			m_screen->savePng(actionShotPath("edit-tabs-" + std::to_string(c.linked) + ".png"));
+		}
 		for (int i = 0; i < c.tabs; ++i)
 			EXPECT_NE(nullptr, tabs->getPage(i)) << i;
 		closeAll();

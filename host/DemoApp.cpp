@@ -3,7 +3,7 @@
 #include "CanvasPng.h"
 #include "ContactsCommon.h"
 #include "ContactsDebug.h"
-#include "CtThemeMgr.h"
+#include "DemoLook.h"
 #include "DemoPictures.h"
 #include "NotificationLog.h"
 #include "PersonListView.h"
@@ -22,44 +22,9 @@ namespace {
 
 constexpr double kFrame = 1.0 / 60.0;
 constexpr int kQuietFramesForIdle = 3;
-const char* const kThemeFiles[] = {"contacts/contacts.edj", "contacts/detail_layout.edj", "contacts/list.edj"};
 // Persons whose detail screens --screenshots saves: picture and favourite,
 // linked contacts, a SIM contact, long texts, a lunar birthday.
 const char* const kScreenshotPersons[] = {"Anna", "Emma", "Taxi", "Maximiliana", "芳"};
-
-void addThemes()
-{
-	for (const char* name : kThemeFiles) {
-		std::string path;
-		if (ContactsCommon::getAppEdjePath(name, path))
-			CtThemeMgr::getInstance()->addExtensionTheme(path.c_str());
-		else
-			WERROR("missing theme %s (resources not built?)", name);
-	}
-}
-
-// The toolkit's own widgets (title bar, window background) in the light
-// palette of the application's themes.
-void applyLightLook()
-{
-	struct ColourClass {
-		const char* name;
-		int r, g, b;
-	};
-	const ColourClass classes[] = {
-		{"/bg/normal/background", 244, 246, 249},
-		{"/bg/normal/naviframe/top", 255, 255, 255},
-		{"/fg/normal/naviframe/text/title", 31, 35, 40},
-		{"/fg/normal/naviframe/text/subtitle", 107, 114, 128},
-		{"/fg/normal/naviframe/top/overlap", 227, 230, 235},
-		{"/bg/normal/button", 255, 255, 255},
-		{"/bg/pressed/button", 225, 238, 252},
-		{"/fg/normal/button", 30, 136, 229},
-		{"/fg/pressed/button", 30, 136, 229},
-	};
-	for (const ColourClass& c : classes)
-		edje_color_class_set(c.name, c.r, c.g, c.b, 255, 0, 0, 0, 0, 0, 0, 0, 0);
-}
 
 void renderPostCb(void* data, Evas*, void*)
 {
@@ -135,10 +100,9 @@ bool DemoApp::__start()
 				getenv("CONTACTS_DATA_DIR") ? getenv("CONTACTS_DATA_DIR") : "the data folder", err);
 		return false;
 	}
-	addThemes();
-	applyLightLook();
-	std::vector<std::string> pictures = DemoPictures::ensure();
-	m_handlers = std::make_unique<DemoAppControlHandlers>(pictures.empty() ? "" : pictures.front());
+	DemoLook::apply();
+	// The gallery, camera and editor stand-ins offer the demo pictures.
+	DemoPictures::ensure();
 
 	m_window = std::make_unique<app_assist::WWindow>("Contacts", kWidth, kHeight);
 	Evas_Object* win = m_window->getEvasObj();
@@ -153,6 +117,7 @@ bool DemoApp::__start()
 	if (!m_naviframe->create(m_window->getBaseLayoutEvasObj(), nullptr))
 		return false;
 	m_naviframeAlive = m_naviframe->getWeakPtr();
+	m_handlers = std::make_unique<DemoAppControlHandlers>(m_naviframe, DemoAppControlHandlers::Folders::defaults());
 	evas_object_smart_callback_add(m_naviframe->getEvasObj(), "transition,finished", transitionFinishedCb, &m_pushing);
 	m_window->setContent(m_naviframe->getEvasObj());
 	m_naviframe->setOnLastViewBack([](bool* popOut) {

@@ -141,6 +141,10 @@ Evas_Object* createPopupList(Evas_Object* parent)
 	elm_object_style_set(list, "popup");
 	elm_genlist_homogeneous_set(list, EINA_TRUE);
 	elm_genlist_mode_set(list, ELM_LIST_COMPRESS);
+	// A popup sizes its content by the content's minimum: the list's rows.
+	elm_scroller_content_min_limit(list, EINA_FALSE, EINA_TRUE);
+	evas_object_size_hint_weight_set(list, EVAS_HINT_EXPAND, EVAS_HINT_EXPAND);
+	evas_object_size_hint_align_set(list, EVAS_HINT_FILL, EVAS_HINT_FILL);
 	return list;
 }
 

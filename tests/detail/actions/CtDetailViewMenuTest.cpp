@@ -107,6 +107,8 @@ TEST_F(DetailActionsTest, DeleteQuestionSaysWhatHappensToSyncedAndReadOnlyContac
 		ASSERT_TRUE(choose(DELETE));
 		EXPECT_EQ((Strings{ContactsCommon::translate(DELETE), ContactsCommon::translate(c.text)}),
 				(Strings{popupText("title,text"), popupText()}));
+		if (c.books.size() == 2 && c.books[1] == ACCOUNT)
+			m_screen->savePng(actionShotPath("detail-delete-popup.png"));
 		EXPECT_TRUE(isLeftOf(m_screen->findButton(ContactsCommon::translate("IDS_PB_BUTTON_CANCEL")),
 				m_screen->findButton(ContactsCommon::translate(DELETE))));
 		EXPECT_TRUE(clickPopupButton("IDS_PB_BUTTON_CANCEL"));
@@ -196,6 +198,8 @@ TEST_F(DetailActionsTest, ShareOffersACardOrTextAndHandsThePersonToTheShareTarge
 		EXPECT_EQ(id, static_cast<int>(reinterpret_cast<intptr_t>(evas_object_data_get(list, "selected_personid"))));
 		std::vector<Elm_Object_Item*> rows = ScreenHarness::genlistItems(list);
 		ASSERT_EQ(2u, rows.size());
+		if (row == 0)
+			m_screen->savePng(actionShotPath("detail-share-popup.png"));
 		EXPECT_EQ(translated({"IDS_PB_OPT_VCARD_HVCF_ABB", "IDS_PB_OPT_TEXT"}),
 				(Strings{ScreenHarness::itemText(rows[0], "elm.text"), ScreenHarness::itemText(rows[1], "elm.text")}));
 		elm_genlist_item_selected_set(rows[row], EINA_TRUE);

@@ -6,6 +6,7 @@
 #include "CtInputView.h"
 #include "CtMyProfileDetailView.h"
 #include "CtMyProfileInputView.h"
+#include "CtProfileWizardView.h"
 #include "CtShareContactView.h"
 
 app_assist::WView* createCtDetailView(int personId, CtLaunchRequest* request)
@@ -50,4 +51,9 @@ app_assist::WView* createCtShareContactView(int personId, CtLaunchRequest* reque
 app_assist::WView* createCtMyProfileInputView(contacts_record_h record, void* hostData)
 {
 	return new CtMyProfileInputView(record, static_cast<CtLaunchRequest*>(hostData));
+}
+
+app_assist::WView* createCtProfileWizardView()
+{
+	return new CtProfileWizardView();
 }

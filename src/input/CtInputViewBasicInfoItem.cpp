@@ -326,7 +326,9 @@ void CtInputViewBasicInfoItem::__entryTextChanged(Field field, Evas_Object* entr
 		return;
 	__writeField(field, value.c_str());
 	m_hasText[field] = !value.empty();
-	setIsChanged(__compareWithOldVal(field, value) || getIsChanged());
+	// Changed is what the fields hold now: a field typed into and emptied again is not.
+	setIsChanged(false);
+	setIsChanged(getIsChanged());
 	if (m_callbacks.changed)
 		m_callbacks.changed();
 	if (field == NAME && m_callbacks.nameChanged)

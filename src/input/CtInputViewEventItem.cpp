@@ -115,6 +115,8 @@ int CtInputViewEventItem::__getType()
 std::string CtInputViewEventItem::getDateText()
 {
 	int date = m_data->getEventEvent(m_record);
+	if (date == 0)
+		return translate("IDS_ST_BODY_SET_DATE"); // a new event waiting for its date
 	int year = date / 10000, month = date % 10000 / 100, day = date % 100;
 	if (date < 0 || month < 1 || month > 12 || day < 1 || day > 31) {
 		WERROR("Invalid date(mon=%d,day=%d)", month, day);

@@ -61,11 +61,18 @@ int CtInputViewMultiImageItem::getPictureCount() const
 	return count < 0 ? 0 : count > kMaxPictures ? kMaxPictures : count;
 }
 
+// After the pictures an empty place takes the next one, until there are five.
+int CtInputViewMultiImageItem::getPlaceCount() const
+{
+	int count = getPictureCount();
+	return count > 0 && count < kMaxPictures ? count + 1 : count;
+}
+
 void CtInputViewMultiImageItem::onSetElmObjectItem(Elm_Object_Item* item)
 {
 	int count = getPictureCount();
 	if (count > 0)
-		elm_object_item_signal_emit(item, ("show," + std::to_string(count) + "icon").c_str(), "");
+		elm_object_item_signal_emit(item, ("show," + std::to_string(getPlaceCount()) + "icon").c_str(), "");
 	elm_object_item_signal_emit(item, count > 0 ? "show,bg" : "hide,bg", "");
 	elm_object_item_signal_emit(item, isPowerSaving() ? "button,disable" : "button,enable", "");
 }
@@ -79,7 +86,7 @@ Evas_Object* CtInputViewMultiImageItem::getContent(Evas_Object* genlist, const c
 		return count == 0 ? __createInvitation(genlist) : nullptr;
 	if (strcmp(part, "elm.button") == 0)
 		return count > 1 ? __createReorderButton(genlist) : nullptr;
-	for (int order = 1; order <= count; ++order)
+	for (int order = 1; order <= getPlaceCount(); ++order)
 		if (strcmp(part, ("elm.icon." + std::to_string(order)).c_str()) == 0)
 			return __createPlace(genlist, order);
 	return nullptr;
@@ -124,7 +131,10 @@ Evas_Object* CtInputViewMultiImageItem::__createPlace(Evas_Object* genlist, int 
 {
 	Evas_Object* layout = ctCommonCreateLayout(genlist, "contacts/contacts.edj", "layout/myprofile/photo");
 	WPRET_VM(!layout, nullptr, "layout is NULL");
-	if (Evas_Object* image = pictureOrPlaceholder(layout, m_data->getImagePath(order)))
+	Evas_Object* image = pictureOrPlaceholder(layout, m_data->getImagePath(order));
+	if (!image)
+		image = ctCommonCreateImage(layout, "contacts/image_layout.edj", "contacts_caller_id_default_02.png");
+	if (image)
 		elm_object_part_content_set(layout, "elm.swallow.content", image);
 	if (order > 1) {
 		Evas_Object* button = uxt_button_add(layout, "transparent");

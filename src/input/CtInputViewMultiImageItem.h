@@ -25,6 +25,9 @@ public:
 	bool isPowerSaving() const;
 	bool tapsAllowed() const;
 	int getPictureCount() const;
+	// Picture places shown under the main picture: one per picture and an
+	// empty one for the next picture while there are fewer than five.
+	int getPlaceCount() const;
 	// Taps the picture of `order` as a person would.
 	void tapPicture(int order);
 

@@ -100,6 +100,20 @@ TEST(DemoCommandLineTest, ScreensByNameOpenThroughTheLibraryOrSayTheyAreMissing)
 	EXPECT_NE(std::string::npos, run.output.find("the wizard screen is not part of this build")) << run.output;
 }
 
+TEST(DemoCommandLineTest, ProfileEditorAndWizardOpenThroughTheirFactories)
+{
+	TempDataDir data;
+	const std::pair<const char*, const char*> cases[] = {
+		{"--screen my-profile-edit", "after holding: CtMyProfileInputView"},
+		{"--screen wizard", "after holding: CtProfileWizardView"},
+	};
+	for (const auto& [args, expected] : cases) {
+		DemoRun run = runDemo(data.path(), std::string(args) + " --hold 0.2");
+		EXPECT_EQ(0, run.exitCode) << run.output;
+		EXPECT_NE(std::string::npos, run.output.find(expected)) << run.output;
+	}
+}
+
 TEST(DemoCommandLineTest, PictureAndMarkAsDefaultScreensAreReachedFromTheDetailScreen)
 {
 	TempDataDir data;

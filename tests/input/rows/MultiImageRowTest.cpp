@@ -75,17 +75,18 @@ TEST_F(MultiImageRowTest, PicturesFillTheirPlacesAndTapsNameTheirOrder)
 	EXPECT_EQ(3, row->getPictureCount());
 	EXPECT_NE(nullptr, content(m_item, "elm.icon.default"));
 	EXPECT_EQ(nullptr, content(m_item, "elm.icon.add"));
-	for (const char* part : {"elm.icon.1", "elm.icon.2", "elm.icon.3"})
-		EXPECT_NE(nullptr, content(m_item, part)) << part;
-	EXPECT_EQ(nullptr, content(m_item, "elm.icon.4"));
+	for (const char* part : {"elm.icon.1", "elm.icon.2", "elm.icon.3", "elm.icon.4"})
+		EXPECT_NE(nullptr, content(m_item, part)) << part << " (the fourth place takes the next picture)";
+	EXPECT_EQ(nullptr, content(m_item, "elm.icon.5"));
 	ScreenHarness::click(elm_object_part_content_get(content(m_item, "elm.icon.default"), "elm.icon"));
 	ScreenHarness::click(elm_object_part_content_get(content(m_item, "elm.icon.3"), "elm.icon"));
+	ScreenHarness::click(elm_object_part_content_get(content(m_item, "elm.icon.4"), "elm.icon"));
 	ASSERT_TRUE(ScreenHarness::click(content(m_item, "elm.button")));
-	EXPECT_EQ((std::vector<int>{1, 3}), m_taps);
+	EXPECT_EQ((std::vector<int>{1, 3, 4}), m_taps);
 	EXPECT_EQ(1, m_reorders);
 
 	vconf_set_int("db/setting/psmode", 1);
 	row->tapPicture(2);
-	EXPECT_EQ(2u, m_taps.size());
+	EXPECT_EQ(3u, m_taps.size());
 	vconf_set_int("db/setting/psmode", 0);
 }

@@ -157,6 +157,7 @@ private:
 
 	// Picture.
 	void __basicInfoItemImageClicked();
+	void __onPictureChoice(int index);
 	void __launchGallery();
 	void __launchCamera();
 	void __launchDecorateContactImage();
@@ -175,7 +176,7 @@ private:
 	// Groups.
 	void __launchGroupsUG();
 	void __onGroupsReply(app_control_h reply);
-	int __createGroup(const std::string& name, const std::string& systemId, int addressbookId);
+	int __createGroup(const std::string& name, int addressbookId);
 	void __addGroupsItem();
 
 	// Event date popup.
@@ -215,6 +216,8 @@ private:
 
 	std::shared_ptr<CtData> m_inputData;
 	CtInputView* m_view;
+	// Expires with the view (which may be gone before this control's onDestroy).
+	std::weak_ptr<app_assist::WControl> m_viewRef;
 	ExistingContactCallback m_onExistingContact;
 	std::function<void()> m_onSelectRelationContact;
 	std::function<void()> m_onKeypadDown;
@@ -233,6 +236,7 @@ private:
 	int m_addedKind = 0;
 	bool m_isRingtonePickerLaunched = false;
 	bool m_isLunarSupported = false;
+	bool m_isPowerSaving = false;
 
 	std::vector<RemainingItem> m_remainingItems;
 	size_t m_remainingIndex = 0;
@@ -253,11 +257,14 @@ private:
 	Elm_Object_Item* m_addressItem = nullptr;
 	contacts_record_h m_addressRecord = nullptr;
 	std::string m_copiedImagePath;
+	bool m_isImageChanged = false;
 
 	std::unique_ptr<CtPredictionListTrigger> m_prediction;
 	std::weak_ptr<app_assist::WControl> m_morePopup;
 	std::weak_ptr<app_assist::WControl> m_picturePopup;
 	std::weak_ptr<app_assist::WControl> m_changeLocationPopup;
+	std::weak_ptr<app_assist::WControl> m_storagePopup;
+	std::weak_ptr<app_assist::WControl> m_datePopup;
 	int m_registryListenerId = 0;
 	// Handed to late callbacks: false once the control is gone.
 	std::shared_ptr<bool> m_alive;

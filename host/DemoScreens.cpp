@@ -138,7 +138,10 @@ const std::vector<DemoScreen>& demoScreens()
 				evas_object_geometry_get(win, nullptr, nullptr, &w, nullptr);
 				tapAt(win, w / 2, 160);
 			}},
-		{"mark-as-default", true, "the choice of a linked person's name and picture (the detail screen's more key)",
+		{"mark-as-default", true, "the choice of a linked person's name and picture (the detail screen's more menu)",
+			[](DemoScreenContext& c) { return make<CreateDetailViewFn>(c.library, "createCtDetailView", c.personId, nullptr); },
+			[](Evas_Object* win) { chooseMenuEntry(win, "IDS_PB_OPT_SET_DEFAULT_CONTACT_INFO_ABB"); }},
+		{"more-menu", true, "the detail screen's more menu",
 			[](DemoScreenContext& c) { return make<CreateDetailViewFn>(c.library, "createCtDetailView", c.personId, nullptr); },
 			[](Evas_Object* win) { pressKey(win, "Menu"); }},
 		{"wizard", false, "the profile set-up wizard",

@@ -12,9 +12,7 @@
 #include "CtContactsAgentMgr.h"
 #include "CtDetailView.h"
 #include "CtDllViewFactory.h"
-#if __has_include("CtEditTabView.h")
 #include "CtEditTabView.h"
-#endif
 #include "CtEsuAgentMgr.h"
 #include "CtInputData.h"
 #include "CtInputViewControl.h"
@@ -515,7 +513,7 @@ app_assist::WControl* CtInputView::getInputControl() const
 void CtInputView::updateSaveBtn(bool disabled)
 {
 	if (m_tabHost) {
-		__updateTabHostSaveBtn(disabled);
+		m_tabHost->updateSaveBtn(disabled);
 		return;
 	}
 	if (m_doneButton)
@@ -1398,11 +1396,3 @@ void CtInputView::__controlUpdateRealizedItems()
 		elm_genlist_realized_items_update(genlist);
 }
 
-void CtInputView::__updateTabHostSaveBtn(bool disabled)
-{
-#if __has_include("CtEditTabView.h")
-	m_tabHost->updateSaveBtn(disabled);
-#else
-	(void)disabled;
-#endif
-}

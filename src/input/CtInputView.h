@@ -164,7 +164,6 @@ private:
 	void __controlCloseHoversel();
 	void __controlUpdateStorageRow();
 	void __controlUpdateRealizedItems();
-	void __updateTabHostSaveBtn(bool disabled);
 
 	void __sendUgResult(const char* key, const char* value, const char* key2 = nullptr, const char* value2 = nullptr);
 	void __sendAppControlReply(const char* key, const char* value, app_control_result_e result);

@@ -50,17 +50,22 @@ protected:
 	}
 };
 
-TEST_F(CtProfileShareWithViewTest, ShowsThreeLevelsWithTheStoredOneChosen)
+TEST_F(CtProfileShareWithViewTest, ShowsThreeLevelsWithTheStoredOneChosenAndNoneForAnUnknownLevel)
 {
-	CtContactsAgentMgr::getInstance()->setPrivacyLevel(2);
-	CtProfileShareWithView* view = show();
-	EXPECT_EQ("Share with", ScreenHarness::naviText(view));
-	std::vector<std::string> texts;
-	for (CtProfileSharingRow* row : rows(view->getGenlist()))
-		texts.push_back(row->getText("elm.text.main.left"));
-	EXPECT_EQ((std::vector<std::string>{"All contacts", "Favourites", "Selected contacts"}), texts);
-	EXPECT_EQ(2, checkedLevel(view));
-	EXPECT_NE(nullptr, evas_object_data_get(view->getGenlist(), "radioGroup"));
+	for (const auto& [stored, checked] : {std::pair{2, 2}, std::pair{9, 0}}) {
+		SCOPED_TRACE(stored);
+		preference_set_int(CT_PREF_PROFILE_PRIVACY_LEVEL, stored);
+		CtProfileShareWithView* view = show();
+		EXPECT_EQ("Share with", ScreenHarness::naviText(view));
+		std::vector<std::string> texts;
+		for (CtProfileSharingRow* row : rows(view->getGenlist()))
+			texts.push_back(row->getText("elm.text.main.left"));
+		EXPECT_EQ((std::vector<std::string>{"All contacts", "Favourites", "Selected contacts"}), texts);
+		EXPECT_EQ(checked, checkedLevel(view));
+		view->popOut();
+		m_screen->pumpUntilIdle();
+	}
+	EXPECT_STREQ("", CtProfileShareWithView::textIdOf(9));
 }
 
 TEST_F(CtProfileShareWithViewTest, ChoosingALevelStoresItRecordsItAndMovesTheRadio)
@@ -130,12 +135,4 @@ TEST_F(CtProfileShareWithViewTest, SettingOfSelectedContactsIsADimmedImageWhileS
 	EXPECT_FALSE(isButton(setting));
 	EXPECT_EQ(nullptr, rowOf(view, 1)->getHeldContent("elm.icon.2"));
 	EXPECT_EQ(0, pickerLaunches());
-}
-
-TEST_F(CtProfileShareWithViewTest, UnknownStoredLevelChecksNoRadio)
-{
-	preference_set_int(CT_PREF_PROFILE_PRIVACY_LEVEL, 9);
-	CtProfileShareWithView* view = show();
-	EXPECT_EQ(0, checkedLevel(view));
-	EXPECT_STREQ("", CtProfileShareWithView::textIdOf(9));
 }

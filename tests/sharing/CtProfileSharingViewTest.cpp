@@ -16,6 +16,8 @@
 #include "CtRegistryMgr.h"
 #include "WToastPopup.h"
 
+#include <numeric>
+
 using namespace ct::test;
 
 class CtProfileSharingViewTest : public SharingScreenTest {
@@ -45,6 +47,13 @@ protected:
 				out.push_back(static_cast<int>(i));
 		return out;
 	}
+	// Every row but the switch (row 0) is disabled.
+	static bool onlySwitchEnabled(CtProfileSharingView* view)
+	{
+		std::vector<int> expected(items(view).size() - 1);
+		std::iota(expected.begin(), expected.end(), 1);
+		return disabledRows(view) == expected;
+	}
 	static int checkedProfileType(CtProfileSharingView* view)
 	{
 		int checked = -1;
@@ -55,7 +64,6 @@ protected:
 		}
 		return checked;
 	}
-	app_assist::WControl* popupOf(CtProfileSharingView* view) { return view->getPopup(); }
 	void touchSwitch(CtProfileSharingView* view)
 	{
 		ASSERT_TRUE(toggle(view->getModeCheck()));
@@ -87,29 +95,25 @@ TEST_F(CtProfileSharingViewTest, ListsModeProfileTypesFieldsAndPreviewInOrder)
 	EXPECT_TRUE(row(view, 2)->isDisplayOnly());
 	EXPECT_TRUE(isOn(view->getModeCheck()));
 	EXPECT_TRUE(disabledRows(view).empty());
-	EXPECT_NE(nullptr, evas_object_data_get(view->getGenlist(), "radioGroup"));
 	shot("sharing-on");
 }
 
-TEST_F(CtProfileSharingViewTest, SharingOnWithoutNetworkOpensOffWithRowsDisabled)
+// Sharing stored on but no network opens off, the stored choice kept.
+TEST_F(CtProfileSharingViewTest, SharingOffOrWithoutNetworkOpensOffWithEveryRowButTheSwitchDisabled)
 {
-	storeSharing(true);
-	setNetwork(false);
-	CtProfileSharingView* view = show();
-	EXPECT_FALSE(isOn(view->getModeCheck()));
-	std::vector<int> disabled = disabledRows(view);
-	ASSERT_FALSE(disabled.empty());
-	EXPECT_EQ(1, disabled.front());
-	EXPECT_EQ(static_cast<int>(items(view).size()) - 1, static_cast<int>(disabled.size()));
-	EXPECT_TRUE(CtEsuAgentMgr::getInstance()->getProfileSharingStatus());
-}
-
-TEST_F(CtProfileSharingViewTest, SharingOffOpensWithEveryRowButTheSwitchDisabled)
-{
-	CtProfileSharingView* view = show();
-	EXPECT_FALSE(isOn(view->getModeCheck()));
-	EXPECT_EQ(static_cast<int>(items(view).size()) - 1, static_cast<int>(disabledRows(view).size()));
-	shot("sharing-off");
+	for (bool stored : {true, false}) {
+		SCOPED_TRACE(stored);
+		storeSharing(stored);
+		setNetwork(!stored);
+		CtProfileSharingView* view = show();
+		EXPECT_FALSE(isOn(view->getModeCheck()));
+		EXPECT_TRUE(onlySwitchEnabled(view));
+		EXPECT_EQ(stored, CtEsuAgentMgr::getInstance()->getProfileSharingStatus());
+		if (!stored)
+			shot("sharing-off");
+		view->popOut();
+		m_screen->pumpUntilIdle();
+	}
 }
 
 TEST_F(CtProfileSharingViewTest, SwitchRefusedWithoutSimOrNetworkLeavesEverythingUnchanged)
@@ -139,18 +143,18 @@ TEST_F(CtProfileSharingViewTest, SwitchRefusedWithoutSimOrNetworkLeavesEverythin
 		EXPECT_FALSE(isOn(view->getModeCheck()));
 		EXPECT_FALSE(CtEsuAgentMgr::getInstance()->getProfileSharingStatus());
 		EXPECT_EQ(logged, usage("CT14").size());
-		app_assist::WControl* popup = popupOf(view);
+		app_assist::WControl* popup = view->getPopup();
 		ASSERT_NE(nullptr, popup);
 		if (!c.sim) {
 			EXPECT_STREQ("WPopup", popup->getClassName());
 			EXPECT_NE(nullptr, m_screen->findButton("OK"));
 			m_screen->sendBackKey();
 			m_screen->pumpUntilIdle();
-			EXPECT_EQ(nullptr, popupOf(view));
+			EXPECT_EQ(nullptr, view->getPopup());
 		} else {
 			EXPECT_NE(nullptr, dynamic_cast<app_assist::WToastPopup*>(popup));
 		}
-		EXPECT_EQ(static_cast<int>(items(view).size()) - 1, static_cast<int>(disabledRows(view).size()));
+		EXPECT_TRUE(onlySwitchEnabled(view));
 		view->popOut();
 		m_screen->pumpUntilIdle();
 	}
@@ -161,7 +165,7 @@ TEST_F(CtProfileSharingViewTest, ProcessingPopupStaysUntilTheAgentConfirms)
 	CtProfileSharingView* view = show();
 	touchSwitch(view);
 	// Nothing has run on the loop yet: the agent's confirmation is pending.
-	auto* popup = dynamic_cast<CtLoadingPopup*>(popupOf(view));
+	auto* popup = dynamic_cast<CtLoadingPopup*>(view->getPopup());
 	ASSERT_NE(nullptr, popup);
 	EXPECT_TRUE(CtEsuAgentMgr::getInstance()->getProfileSharingStatus());
 	ASSERT_FALSE(usage("CT14").empty());
@@ -174,22 +178,22 @@ TEST_F(CtProfileSharingViewTest, ProcessingPopupStaysUntilTheAgentConfirms)
 	Evas* canvas = evas_object_evas_get(m_screen->win());
 	evas_event_feed_key_down(canvas, "Escape", "Escape", nullptr, nullptr, 1, nullptr);
 	evas_event_feed_key_up(canvas, "Escape", "Escape", nullptr, nullptr, 2, nullptr);
-	EXPECT_EQ(popup, popupOf(view));
+	EXPECT_EQ(popup, view->getPopup());
 	EXPECT_EQ(1, m_screen->viewCount());
 
 	m_screen->pumpUntilIdle();
-	EXPECT_EQ(nullptr, popupOf(view));
+	EXPECT_EQ(nullptr, view->getPopup());
 	EXPECT_TRUE(isOn(view->getModeCheck()));
 	EXPECT_TRUE(disabledRows(view).empty());
 
 	touchSwitch(view);
-	EXPECT_NE(nullptr, dynamic_cast<CtLoadingPopup*>(popupOf(view)));
+	EXPECT_NE(nullptr, dynamic_cast<CtLoadingPopup*>(view->getPopup()));
 	m_screen->pumpUntilIdle();
-	EXPECT_EQ(nullptr, popupOf(view));
+	EXPECT_EQ(nullptr, view->getPopup());
 	EXPECT_FALSE(isOn(view->getModeCheck()));
 	EXPECT_FALSE(CtEsuAgentMgr::getInstance()->getProfileSharingStatus());
 	EXPECT_EQ("0", usage("CT14").back().value);
-	EXPECT_EQ(static_cast<int>(items(view).size()) - 1, static_cast<int>(disabledRows(view).size()));
+	EXPECT_TRUE(onlySwitchEnabled(view));
 }
 
 TEST_F(CtProfileSharingViewTest, PrivacyLevelsReadAsTheirTexts)
@@ -232,7 +236,7 @@ TEST_F(CtProfileSharingViewTest, NetworkLostWhileOpenTurnsTheSwitchOffUntilItCom
 	setNetwork(false);
 	m_screen->pumpUntilIdle();
 	EXPECT_FALSE(isOn(view->getModeCheck()));
-	EXPECT_EQ(static_cast<int>(items(view).size()) - 1, static_cast<int>(disabledRows(view).size()));
+	EXPECT_TRUE(onlySwitchEnabled(view));
 	size_t logged = usage("CT0F").size();
 	ScreenHarness::selectItem(row(view, 4)->getElmObjectItem());
 	m_screen->pumpUntilIdle();

@@ -86,9 +86,7 @@ TEST_F(CtProfileSharingViewTest, ListsModeProfileTypesFieldsAndPreviewInOrder)
 	EXPECT_EQ("multiline_sub|", shown[2]);
 	EXPECT_EQ("2line.top|Personal profile", shown[3]);
 	EXPECT_EQ("1line|Business profile", shown[4]);
-	EXPECT_EQ("group_index|Additional info to share", shown[5]);
-	EXPECT_EQ("1line|Email", shown[7]);
-	EXPECT_EQ("1line|Date of birth", shown[10]);
+	// Rows 5 to 10 are the shareable-field block, checked with its control.
 	EXPECT_EQ("group_index|What others will see", shown[11]);
 	EXPECT_EQ("multiline_sub.main.1icon|", shown[12]);
 	EXPECT_TRUE(row(view, 1)->isDisplayOnly());

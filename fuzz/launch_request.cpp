@@ -26,9 +26,11 @@ const char* const kOperations[] = { APP_CONTROL_OPERATION_DEFAULT, APP_CONTROL_O
 const char* const kKeys[] = { "person_id", "ct_person_id", "type", "contact_id", "my_profile", APP_CONTROL_DATA_ID,
 	APP_CONTROL_DATA_TYPE, APP_CONTROL_DATA_NAME, APP_CONTROL_DATA_PHONE, APP_CONTROL_DATA_EMAIL, APP_CONTROL_DATA_URL,
 	APP_CONTROL_DATA_TEXT, APP_CONTROL_DATA_SELECTED, APP_CONTROL_DATA_SOCIAL_ITEM_ID, APP_CONTROL_DATA_SOCIAL_PHONE,
-	APP_CONTROL_DATA_SOCIAL_EMAIL, APP_CONTROL_DATA_SOCIAL_URL };
+	APP_CONTROL_DATA_SOCIAL_EMAIL, APP_CONTROL_DATA_SOCIAL_URL, "number_changing_alert", "name", "previous_number",
+	"new_number", "show_detail", "ct_path" };
 const char* const kValues[] = { "1", "2", "0", "-1", "112", "126", "41", "21", "123", "2147483647",
-	"99999999999999999999", "1e3", " 1", "0x10", "<b>1</b>", "\xC0\xFF", "+1 555 0100", "a@b.c" };
+	"99999999999999999999", "1e3", " 1", "0x10", "<b>1</b>", "\xC0\xFF", "+1 555 0100", "a@b.c", "true", "22",
+	"\xE2\x82", "\xED\xA0\x80" };
 
 void checkAt(bool ok, int line)
 {
@@ -57,8 +59,9 @@ public:
 		std::string out;
 		while (out.size() < length && !empty())
 			out += static_cast<char>(byte());
-		if (byte() % 16 == 0)
-			out = std::string(64 * 1024, out.empty() ? 'x' : out[0]) + out;
+		unsigned grow = byte();
+		if (grow % 16 == 0)
+			out = std::string(grow % 64 == 0 ? 1024 * 1024 : 64 * 1024, out.empty() ? 'x' : out[0]) + out;
 		return out;
 	}
 	// A known value or a text of the input.
@@ -72,6 +75,7 @@ private:
 
 struct World {
 	int personId = 0;
+	int contactId = 0;
 	ct::test::ScreenHarness* screen = nullptr;
 };
 
@@ -95,8 +99,7 @@ World& world()
 		contacts_record_create(_contacts_number._uri, &number);
 		contacts_record_set_str(number, _contacts_number.number, "+15550100");
 		contacts_record_add_child_record(contact, _contacts_contact.number, number);
-		int contactId = 0;
-		check(contacts_db_insert_record(contact, &contactId) == CONTACTS_ERROR_NONE);
+		check(contacts_db_insert_record(contact, &made.contactId) == CONTACTS_ERROR_NONE);
 		contacts_record_get_int(contact, _contacts_contact.person_id, &made.personId);
 		contacts_record_destroy(contact, true);
 		made.screen = new ct::test::ScreenHarness();
@@ -114,6 +117,57 @@ int personIdFrom(Input& in, int stored)
 	case 3: return stored + 1 + static_cast<int>(in.byte());
 	default: return static_cast<int>(in.byte() << 24 | in.byte() << 16 | in.byte() << 8 | in.byte());
 	}
+}
+
+// A contact record for the forms: none, the stored one, a new one with
+// texts of the input, or one that names a storage or contact that is not there.
+contacts_record_h recordFrom(Input& in, int storedContactId)
+{
+	contacts_record_h record = nullptr;
+	switch (in.byte() % 4) {
+	case 0:
+		return nullptr;
+	case 1:
+		contacts_db_get_record(_contacts_contact._uri, storedContactId, &record);
+		return record;
+	case 2: {
+		contacts_record_create(_contacts_contact._uri, &record);
+		contacts_record_h name = nullptr;
+		contacts_record_create(_contacts_name._uri, &name);
+		contacts_record_set_str(name, _contacts_name.first, in.text().c_str());
+		contacts_record_add_child_record(record, _contacts_contact.name, name);
+		contacts_record_h number = nullptr;
+		contacts_record_create(_contacts_number._uri, &number);
+		contacts_record_set_str(number, _contacts_number.number, in.text().c_str());
+		contacts_record_add_child_record(record, _contacts_contact.number, number);
+		return record;
+	}
+	default:
+		contacts_record_create(_contacts_contact._uri, &record);
+		contacts_record_set_int(record, _contacts_contact.address_book_id, static_cast<int>(in.byte()) - 128);
+		return record;
+	}
+}
+
+// What a person does next: nothing, the back key, or a title button.
+void pressTitleButtonOrBack(Input& in, ct::test::ScreenHarness& screen)
+{
+	switch (in.byte() % 4) {
+	case 1:
+		screen.sendBackKey();
+		break;
+	case 2:
+		if (Evas_Object* done = screen.findButton("Done"))
+			ct::test::ScreenHarness::click(done);
+		break;
+	case 3:
+		if (Evas_Object* cancel = screen.findButton("Cancel"))
+			ct::test::ScreenHarness::click(cancel);
+		break;
+	default:
+		return;
+	}
+	screen.pumpFrames(2);
 }
 
 } // namespace
@@ -147,19 +201,28 @@ extern "C" int LLVMFuzzerTestOneInput(const uint8_t* data, size_t size)
 
 	ct::test::ScreenInputs inputs;
 	inputs.personId = personIdFrom(in, w.personId);
+	inputs.record = recordFrom(in, w.contactId);
 	inputs.request = in.byte() % 8 ? &launch : nullptr;
 	inputs.galData = in.byte() % 8 ? &gal : nullptr;
 
 	app_assist::WView* view = made.make(inputs);
 	check(view != nullptr);
+	if (inputs.record && !made.takesRecord)
+		contacts_record_destroy(inputs.record, true);
 	std::weak_ptr<app_assist::WControl> alive;
 	if (w.screen->naviframe()->push(view)) {
 		alive = view->getWeakPtr();
 		w.screen->pumpFrames(3);
+		pressTitleButtonOrBack(in, *w.screen);
 	}
 	if (auto shown = alive.lock()) {
 		shown.reset();
 		view->destroy();
+	}
+	// A save may have opened the saved person's screen.
+	for (int left = 4; left > 0 && w.screen->topView(); --left) {
+		w.screen->topView()->destroy();
+		w.screen->pumpFrames(1);
 	}
 	w.screen->pumpFrames(1);
 	app_control_destroy(request);

@@ -125,7 +125,9 @@ bool DemoApp::__start()
 		elm_exit();
 	});
 
-	auto* list = new PersonListView([this](int personId) { __openPerson(personId); });
+	auto* list = new PersonListView([this](int personId) { __openPerson(personId); },
+		[this] { __pushScreen(*findDemoScreen("create"), 0); },
+		[this](int personId) { __pushScreen(*findDemoScreen("edit"), personId); });
 	if (!m_naviframe->push(list))
 		return false;
 	m_listAlive = list->getWeakPtr();

@@ -14,8 +14,8 @@ namespace ct::demo {
 
 namespace {
 
-// The first contact of a person, for the edit form; the caller keeps it.
-contacts_record_h firstContactOf(int personId, std::vector<std::shared_ptr<void>>& keepAlive)
+// A copy of a person's first contact, for the edit form (which takes it over).
+contacts_record_h firstContactOf(int personId)
 {
 	contacts_query_h query = nullptr;
 	contacts_filter_h filter = nullptr;
@@ -26,15 +26,17 @@ contacts_record_h firstContactOf(int personId, std::vector<std::shared_ptr<void>
 	contacts_filter_add_int(filter, _contacts_contact.person_id, CONTACTS_MATCH_EQUAL, personId);
 	contacts_query_set_filter(query, filter);
 	if (contacts_db_get_records_with_query(query, 0, 1, &list) == CONTACTS_ERROR_NONE) {
+		// A listed record holds no child records: the contact is read whole.
 		contacts_record_h first = nullptr;
+		int contactId = 0;
 		if (contacts_list_get_current_record_p(list, &first) == CONTACTS_ERROR_NONE && first)
-			contacts_record_clone(first, &contact);
+			contacts_record_get_int(first, _contacts_contact.id, &contactId);
 		contacts_list_destroy(list, true);
+		if (contactId > 0 && contacts_db_get_record(_contacts_contact._uri, contactId, &contact) != CONTACTS_ERROR_NONE)
+			contact = nullptr;
 	}
 	contacts_filter_destroy(filter);
 	contacts_query_destroy(query);
-	if (contact)
-		keepAlive.emplace_back(contact, [](void* record) { contacts_record_destroy(static_cast<contacts_record_h>(record), true); });
 	return contact;
 }
 
@@ -111,8 +113,9 @@ const std::vector<DemoScreen>& demoScreens()
 			}},
 		{"edit", true, "the edit form of a person's first contact",
 			[](DemoScreenContext& c) -> app_assist::WView* {
-				contacts_record_h contact = firstContactOf(c.personId, c.keepAlive);
-				return contact ? make<CreateInputViewFn>(c.library, "createCtInputView", contact, nullptr) : nullptr;
+				auto factory = c.library.factory<CreateInputViewFn>("createCtInputView");
+				contacts_record_h contact = factory ? firstContactOf(c.personId) : nullptr;
+				return contact ? factory(contact, nullptr) : nullptr;
 			}},
 		{"my-profile", false, "the user's own profile",
 			[](DemoScreenContext& c) { return make<CreateMyProfileDetailViewFn>(c.library, "createCtMyProfileDetailView"); }},
@@ -135,7 +138,10 @@ const std::vector<DemoScreen>& demoScreens()
 				evas_object_geometry_get(win, nullptr, nullptr, &w, nullptr);
 				tapAt(win, w / 2, 160);
 			}},
-		{"mark-as-default", true, "the choice of a linked person's name and picture (the detail screen's more key)",
+		{"mark-as-default", true, "the choice of a linked person's name and picture (the detail screen's more menu)",
+			[](DemoScreenContext& c) { return make<CreateDetailViewFn>(c.library, "createCtDetailView", c.personId, nullptr); },
+			[](Evas_Object* win) { chooseMenuEntry(win, "IDS_PB_OPT_SET_DEFAULT_CONTACT_INFO_ABB"); }},
+		{"more-menu", true, "the detail screen's more menu",
 			[](DemoScreenContext& c) { return make<CreateDetailViewFn>(c.library, "createCtDetailView", c.personId, nullptr); },
 			[](Evas_Object* win) { pressKey(win, "Menu"); }},
 		{"wizard", false, "the profile set-up wizard",

@@ -1,8 +1,10 @@
 #include "PersonListView.h"
 
+#include "ContactsCommon.h"
 #include "ContactsDebug.h"
 
 #include <contacts.h>
+#include <ui_extension.h>
 
 namespace ct::demo {
 
@@ -51,8 +53,9 @@ std::vector<PersonSummary> loadPersons()
 
 } // namespace
 
-PersonListView::PersonListView(PersonListItem::SelectHandler onSelect)
-	: m_onSelect(std::move(onSelect))
+PersonListView::PersonListView(PersonListItem::SelectHandler onSelect, std::function<void()> onCreate,
+		PersonListItem::SelectHandler onEdit)
+	: m_onSelect(std::move(onSelect)), m_onCreate(std::move(onCreate)), m_onEdit(std::move(onEdit))
 {
 	setTitle("Contacts");
 }
@@ -69,6 +72,8 @@ Evas_Object* PersonListView::onCreate(Evas_Object* parent, void*)
 	elm_genlist_homogeneous_set(m_genlist, EINA_TRUE);
 	evas_object_size_hint_weight_set(m_genlist, EVAS_HINT_EXPAND, EVAS_HINT_EXPAND);
 	evas_object_size_hint_align_set(m_genlist, EVAS_HINT_FILL, EVAS_HINT_FILL);
+	if (m_onEdit)
+		evas_object_smart_callback_add(m_genlist, "longpressed", __longpressedCb, this);
 	__reload();
 	int err = contacts_db_add_changed_cb(_contacts_person._uri, __onPersonsChangedCb, this);
 	if (err == CONTACTS_ERROR_NONE)
@@ -81,6 +86,28 @@ Evas_Object* PersonListView::onCreate(Evas_Object* parent, void*)
 void PersonListView::onPushed(Elm_Object_Item* naviItem)
 {
 	elm_object_item_part_text_set(naviItem, "elm.text.title", getTitle());
+	if (!m_onCreate)
+		return;
+	Evas_Object* create = uxt_button_add(elm_object_parent_widget_get(m_genlist), "naviframe/title_right");
+	elm_object_text_set(create, ContactsCommon::translate("IDS_PB_BUTTON_CREATE_ABB2"));
+	evas_object_smart_callback_add(create, "clicked", __createClickedCb, this);
+	elm_object_item_part_content_set(naviItem, "title_right_btn", create);
+}
+
+void PersonListView::__createClickedCb(void* data, Evas_Object*, void*)
+{
+	auto* view = static_cast<PersonListView*>(data);
+	if (view->m_onCreate)
+		view->m_onCreate();
+}
+
+void PersonListView::__longpressedCb(void* data, Evas_Object*, void* eventInfo)
+{
+	auto* view = static_cast<PersonListView*>(data);
+	auto* row = dynamic_cast<PersonListItem*>(
+		static_cast<app_assist::WGenlistItem*>(elm_object_item_data_get(static_cast<Elm_Object_Item*>(eventInfo))));
+	if (row && view->m_onEdit)
+		view->m_onEdit(row->person().id);
 }
 
 void PersonListView::onDestroy()

@@ -67,6 +67,7 @@ int main(int argc, char** argv)
 	if (const char* longRuns = getenv("CONTACTS_FUZZ_RUNS"))
 		runs = strtol(longRuns, nullptr, 10);
 	printf("seed %lu, %ld random inputs\n", seed, runs);
+	fflush(stdout); // a crash must not lose the seed that repeats it
 	std::mt19937 rng(static_cast<std::mt19937::result_type>(seed));
 	LLVMFuzzerTestOneInput(nullptr, 0);
 	for (long i = 0; i < runs; ++i) {

@@ -14,7 +14,7 @@ struct Entry {
 	std::string text;
 };
 
-// A copy of the lines kept so far (the newest 20000), oldest first.
+// A copy of the lines kept so far (the newest 256 kB of them), oldest first.
 std::vector<Entry> entries();
 // True when a kept line contains `needle`, at `priority` unless that is DLOG_UNKNOWN.
 bool contains(const std::string& needle, log_priority priority = DLOG_UNKNOWN);

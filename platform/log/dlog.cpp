@@ -11,8 +11,12 @@
 
 namespace {
 
-constexpr size_t kMaxKeptLines = 20000;
+// The newest lines are kept up to this size (a ring, as the system log is):
+// a long-running process keeps a bounded tail, not its whole history.
+constexpr size_t kMaxKeptBytes = 256 * 1024;
 constexpr size_t kMaxLineBytes = 4096;
+// What a kept line costs beside its texts (entry, strings, queue slot).
+constexpr size_t kLineOverheadBytes = 96;
 
 std::mutex& sinkMutex()
 {
@@ -24,6 +28,17 @@ std::deque<ct::log::Entry>& sink()
 {
 	static std::deque<ct::log::Entry> lines;
 	return lines;
+}
+
+size_t& keptBytes()
+{
+	static size_t bytes = 0;
+	return bytes;
+}
+
+size_t costOf(const ct::log::Entry& e)
+{
+	return e.tag.size() + e.text.size() + kLineOverheadBytes;
 }
 
 log_priority priorityFromEnv()
@@ -57,9 +72,12 @@ void keep(log_priority prio, const char* tag, const char* text)
 {
 	std::lock_guard<std::mutex> lock(sinkMutex());
 	auto& lines = sink();
-	if (lines.size() >= kMaxKeptLines)
-		lines.pop_front();
 	lines.push_back({prio, tag, text});
+	keptBytes() += costOf(lines.back());
+	while (keptBytes() > kMaxKeptBytes && lines.size() > 1) {
+		keptBytes() -= costOf(lines.front());
+		lines.pop_front();
+	}
 }
 
 bool matches(const ct::log::Entry& e, const std::string& needle, log_priority prio)
@@ -133,6 +151,7 @@ void clear()
 {
 	std::lock_guard<std::mutex> lock(sinkMutex());
 	sink().clear();
+	keptBytes() = 0;
 }
 
 } // namespace ct::log

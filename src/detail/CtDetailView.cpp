@@ -4,12 +4,14 @@
 #include "ContactsAppIds.h"
 #include "ContactsCommon.h"
 #include "ContactsDebug.h"
+#include "CtCommonRecordUtil.h"
 #include "CtCommonTextUtil.h"
 #include "CtCommonUsageLog.h"
 #include "CtCommonWidgetUtil.h"
 #include "CtDetailData.h"
 #include "CtDetailImageView.h"
 #include "CtDetailMarkAsDefaultView.h"
+#include "CtDetailPersonActions.h"
 #include "CtDetailViewAddressItem.h"
 #include "CtDetailViewCtxPopup.h"
 #include "CtDetailViewEmailItem.h"
@@ -27,20 +29,26 @@
 #include "CtDetailViewUtil.h"
 #include "CtDetailViewVideoCallItem.h"
 #include "CtDetailViewWebsiteItem.h"
+#include "CtDllViewFactory.h"
+#include "CtEditTabView.h"
 #include "CtEsuAgentMgr.h"
+#include "CtInputView.h"
 #include "CtRegistryMgr.h"
 #include "CtSimMgr.h"
 #include "CtThemeMgr.h"
+#include "WMenuPopup.h"
 #include "WNaviframe.h"
+#include "WPopup.h"
 
 #include <glib.h>
-#include "WPopup.h"
+#include <notification.h>
 
 #include <app_control.h>
 #include <csc_feature.h>
 #include <ui_extension.h>
 
 #include <cerrno>
+#include <cstdint>
 #include <climits>
 #include <cstdlib>
 #include <cstring>
@@ -71,6 +79,7 @@ constexpr int kFirstFrameRows = 6;
 constexpr double kChangeCoalescingSeconds = 2.0;
 constexpr double kFavoriteSettleSeconds = 0.7;
 constexpr const char* kInputNaviItemKey = "input_navi_item";
+constexpr const char* kSelectedPersonIdKey = "selected_personid";
 
 // Base-10 strtol as the request gives it; a value outside int is no id.
 int parseId(const char* text)
@@ -117,6 +126,43 @@ bool isListKind(int kind)
 bool hasText(const char* text)
 {
 	return text && *text;
+}
+
+// A person of several contacts chooses which one gives the name or picture.
+bool hasDefaultChoice(CtDetailData* data)
+{
+	return eina_list_count(data->getNameList()) >= 2 || eina_list_count(data->getImageList()) >= 2;
+}
+
+// The one-line choice list of a popup.
+Evas_Object* createPopupList(Evas_Object* parent)
+{
+	Evas_Object* list = elm_genlist_add(parent);
+	elm_object_style_set(list, "popup");
+	elm_genlist_homogeneous_set(list, EINA_TRUE);
+	elm_genlist_mode_set(list, ELM_LIST_COMPRESS);
+	// A popup sizes its content by the content's minimum: the list's rows.
+	elm_scroller_content_min_limit(list, EINA_FALSE, EINA_TRUE);
+	evas_object_size_hint_weight_set(list, EVAS_HINT_EXPAND, EVAS_HINT_EXPAND);
+	evas_object_size_hint_align_set(list, EVAS_HINT_FILL, EVAS_HINT_FILL);
+	return list;
+}
+
+// Rows whose data is a translation id.
+const Elm_Genlist_Item_Class* translatedRowClass()
+{
+	static Elm_Genlist_Item_Class itc = [] {
+		Elm_Genlist_Item_Class c = {};
+		c.version = ELM_GENLIST_ITEM_CLASS_VERSION;
+		c.item_style = "1line";
+		c.func.text_get = [](void* data, Evas_Object*, const char* part) -> char* {
+			if (strcmp(part, "elm.text") != 0 || !data)
+				return nullptr;
+			return strdup(ContactsCommon::translate(static_cast<const char*>(data)));
+		};
+		return c;
+	}();
+	return &itc;
 }
 
 } // namespace
@@ -767,10 +813,7 @@ void CtDetailView::__showVideoCallPopup()
 	popup->setOnAddProperties([](Evas_Object* obj) { elm_object_style_set(obj, "theme_bg"); });
 	std::weak_ptr<app_assist::WControl> alive = getWeakPtr();
 	popup->setContent([this, alive](Evas_Object* parent) {
-		Evas_Object* list = elm_genlist_add(parent);
-		elm_object_style_set(list, "popup");
-		elm_genlist_homogeneous_set(list, EINA_TRUE);
-		elm_genlist_mode_set(list, ELM_LIST_COMPRESS);
+		Evas_Object* list = createPopupList(parent);
 		static Elm_Genlist_Item_Class itc = [] {
 			Elm_Genlist_Item_Class c = {};
 			c.version = ELM_GENLIST_ITEM_CLASS_VERSION;
@@ -888,17 +931,180 @@ void CtDetailView::__moreButtonCb(void* data, Evas_Object*, void*)
 {
 	WHIT();
 	WPRET_M(!data, "Invalid param : data");
-	auto* view = static_cast<CtDetailView*>(data);
-	if (!view->m_popup.expired())
+	static_cast<CtDetailView*>(data)->__openMoreMenu();
+}
+
+void CtDetailView::__openMoreMenu()
+{
+	if (!m_popup.expired())
 		return;
-	Eina_List* contacts = view->m_detailData->getContactsList();
-	if (view->m_galData)
-		contacts = nullptr;
+	Eina_List* contacts = m_galData ? nullptr : m_detailData->getContactsList();
 	WPRET_M(!contacts, "list is nullptr");
-	WPRET_M(eina_list_count(contacts) == 0, "contacts list is empty");
-	// Until the more menu lands, the key opens its one screen that exists
-	// when the person offers a choice of default name or picture.
-	WDEBUG("more menu for person %d", view->getPersoinId());
-	if (CtDetailMarkAsDefaultView::hasChoice(view->m_detailData.get()) && view->getNaviframe())
-		view->getNaviframe()->push(new CtDetailMarkAsDefaultView(view->m_detailData.get()));
+	int count = eina_list_count(contacts);
+	WPRET_M(count == 0, "contacts list is empty");
+	bool social = m_detailData->getFacebookMode();
+	auto* menu = new app_assist::WMenuPopup(getWindow(), getNaviframe());
+	menu->setTextTranslatable("contacts");
+	auto append = [this, menu](const char* label, void (CtDetailView::*action)(), const char* usage) {
+		menu->appendItem(label, [this, action, usage] {
+			(this->*action)();
+			ctCommonInsertUsageLog("CT06", usage);
+		});
+	};
+	if (!m_detailData->getReadOnlyMode() || m_isSimContact)
+		append("IDS_PB_OPT_EDIT", &CtDetailView::__onEditCb, "Edit");
+	if (social && count == 1)
+		append("IDS_PB_OPT_HIDE", &CtDetailView::__onHideCb, "Hide");
+	else
+		append("IDS_PB_BUTTON_DELETE_ABB4", &CtDetailView::__onDeleteCb, "Delete");
+	if (!social)
+		append("IDS_PB_OPT_SHARE", &CtDetailView::__onShareCb, "Share");
+	if (count > 1 && hasDefaultChoice(m_detailData.get()))
+		append("IDS_PB_OPT_SET_DEFAULT_CONTACT_INFO_ABB", &CtDetailView::__onMarkAsDefaultCb, "Set_default_contact_info");
+	if (!m_isSimContact && count == 1)
+		append("IDS_PB_TMBODY_LINK_CONTACTS", &CtDetailView::__onLinkCb, "Link");
+	if (!m_isSimContact && count > 1)
+		append("IDS_PB_OPT_MANAGE_LINKED_CONTACTS_ABB2", &CtDetailView::__onManageLinkedContactsCb, "Manage_linked_contacts");
+	attachPopup(menu);
+	m_popup = menu->getWeakPtr();
+}
+
+void CtDetailView::__pushView(app_assist::WView* view)
+{
+	app_assist::WNaviframe* naviframe = getNaviframe();
+	if (!naviframe || !view) {
+		WERROR("no naviframe or view");
+		if (view)
+			view->destroy();
+		return;
+	}
+	naviframe->push(view);
+}
+
+void CtDetailView::__onEditCb()
+{
+	WHIT();
+	Eina_List* contacts = m_detailData->getContactsWithoutFacebook();
+	int count = eina_list_count(contacts);
+	WERROR("count : %d", count);
+	if (count > 1) {
+		__pushView(new CtEditTabView(contacts));
+	} else if (count == 1) {
+		contacts_record_h clone = nullptr;
+		int err = contacts_record_clone(static_cast<contacts_record_h>(eina_list_data_get(contacts)), &clone);
+		if (err != CONTACTS_ERROR_NONE)
+			WWARNING("contacts_record_clone() Failed(%d)", err);
+		else
+			__pushView(new CtInputView(clone));
+	}
+	ctCommonDestroyRecordList(contacts);
+}
+
+void CtDetailView::__onDeleteCb()
+{
+	WHIT();
+	CtDetailPersonActions actions(getPersoinId());
+	const char* textId = CtDetailPersonActions::getDeleteMessageId(actions.isSyncedToAnyAccount(),
+			m_detailData->getReadOnlyMode(), eina_list_count(m_detailData->getContactsList()));
+	__showDeletePopup("IDS_PB_BUTTON_DELETE_ABB4", textId, "IDS_PB_BUTTON_DELETE_ABB4");
+}
+
+void CtDetailView::__onHideCb()
+{
+	WHIT();
+	__showDeletePopup("IDS_PB_OPT_HIDE", "IDS_PB_POP_THIS_ACCOUNT_IS_READ_ONLY_THE_CONTACT_WILL_BE_HIDDEN_FROM_CONTACTS",
+			"IDS_PB_OPT_HIDE");
+}
+
+// After a deletion the popup stays until the store's change closes the
+// screen; a second tap meanwhile finds no person and must not report a failure.
+void CtDetailView::__showDeletePopup(const char* titleId, const char* textId, const char* buttonId)
+{
+	auto* popup = new app_assist::WPopup();
+	popup->setTextTranslatable("contacts");
+	popup->setTitle(titleId);
+	popup->setContent(textId);
+	popup->addButton("IDS_PB_BUTTON_CANCEL", nullptr);
+	popup->addButton(buttonId, [this](bool* destroyPopup) {
+		*destroyPopup = false;
+		if (m_isDeleting)
+			return;
+		*destroyPopup = !__deletePerson();
+	});
+	attachPopup(popup);
+	m_popup = popup->getWeakPtr();
+}
+
+bool CtDetailView::__deletePerson()
+{
+	CtDetailPersonActions actions(getPersoinId());
+	if (actions.deleteContacts() != CONTACTS_ERROR_NONE) {
+		int err = notification_status_message_post(ContactsCommon::translate("IDS_PB_TPOP_FAILED_TO_DELETE_CONTACTS_TRY_AGAIN"));
+		if (err != NOTIFICATION_ERROR_NONE)
+			WWARNING("notification_status_message_post() Failed(%d)", err);
+		return false;
+	}
+	m_isDeleting = true;
+	actions.removeFromPermittedList();
+	return true;
+}
+
+void CtDetailView::__onShareCb()
+{
+	WHIT();
+	__showSelectShareTypePopup(getPersoinId());
+}
+
+void CtDetailView::__showSelectShareTypePopup(int personId)
+{
+	static const char* const labels[] = {"IDS_PB_OPT_VCARD_HVCF_ABB", "IDS_PB_OPT_TEXT"};
+	auto* popup = new app_assist::WPopup();
+	popup->setTextTranslatable("contacts");
+	popup->setTitle("IDS_PB_OPT_SHARE");
+	popup->setOnAddProperties([](Evas_Object* obj) { elm_object_style_set(obj, "theme_bg"); });
+	popup->setContent([this, personId](Evas_Object* parent) {
+		Evas_Object* list = createPopupList(parent);
+		evas_object_data_set(list, kSelectedPersonIdKey, reinterpret_cast<void*>(static_cast<intptr_t>(personId)));
+		for (const char* label : labels)
+			elm_genlist_item_append(list, translatedRowClass(), label, nullptr, ELM_GENLIST_ITEM_NONE, nullptr, nullptr);
+		evas_object_smart_callback_add(list, "selected", [](void* data, Evas_Object* obj, void* eventInfo) {
+			auto* view = static_cast<CtDetailView*>(data);
+			int id = static_cast<int>(reinterpret_cast<intptr_t>(evas_object_data_get(obj, kSelectedPersonIdKey)));
+			bool asCard = elm_genlist_item_index_get(static_cast<Elm_Object_Item*>(eventInfo)) == 1;
+			Evas_Object* owner = view->getEvasObj();
+			view->__closePopup();
+			CtDetailPersonActions actions(id);
+			if (asCard)
+				actions.shareAsVcard(owner);
+			else
+				actions.shareAsText(owner);
+		}, this);
+		return list;
+	});
+	attachPopup(popup);
+	m_popup = popup->getWeakPtr();
+}
+
+void CtDetailView::__onMarkAsDefaultCb()
+{
+	WHIT();
+	__pushView(new CtDetailMarkAsDefaultView(m_detailData.get()));
+}
+
+void CtDetailView::__onLinkCb()
+{
+	WHIT();
+	ctCommonInsertUsageLog("0026", nullptr);
+	app_control_h request = CtDetailPersonActions(getPersoinId()).createLinkRequest(eina_list_count(m_detailData->getContactsList()));
+	WPRET_M(!request, "no link request");
+	ContactsData data = {0, request, nullptr, 0};
+	app_assist::WView* picker = CtDllViewFactory::getInstance()->getCtListViewClass(&data);
+	app_control_destroy(request);
+	__pushView(picker);
+}
+
+void CtDetailView::__onManageLinkedContactsCb()
+{
+	WHIT();
+	__pushView(CtDllViewFactory::getInstance()->getCtListUnlinkContactViewClass(getPersoinId()));
 }

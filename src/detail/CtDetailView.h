@@ -114,6 +114,18 @@ private:
 	void __launchVideoCall(const char* number);
 	void __showVideoCallPopup();
 	void __closePopup();
+	void __openMoreMenu();
+	void __onEditCb();
+	void __onDeleteCb();
+	void __onHideCb();
+	void __onShareCb();
+	void __showSelectShareTypePopup(int personId);
+	void __onMarkAsDefaultCb();
+	void __onLinkCb();
+	void __onManageLinkedContactsCb();
+	void __showDeletePopup(const char* titleId, const char* textId, const char* buttonId);
+	bool __deletePerson();
+	void __pushView(app_assist::WView* view);
 	// Redraws the shown rows with fresh contents (SIM colours, texts).
 	void __refreshRows();
 
@@ -157,6 +169,7 @@ private:
 	app_assist::WUiTimerHandle m_rowAnimator;
 	Evas_Object* m_naviframeObj = nullptr;
 	int m_rebuildCount = 0;
+	bool m_isDeleting = false;
 };
 
 #endif

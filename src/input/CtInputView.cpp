@@ -12,6 +12,7 @@
 #include "CtContactsAgentMgr.h"
 #include "CtDetailView.h"
 #include "CtDllViewFactory.h"
+#include "CtEditTabView.h"
 #include "CtEsuAgentMgr.h"
 #include "CtInputData.h"
 #include "CtInputViewControl.h"
@@ -26,14 +27,17 @@
 
 #include <app_control.h>
 #include <app_preference.h>
+#include <glib.h>
 #include <notification.h>
 #include <ui-gadget.h>
 #include <ui_extension.h>
 
+#include <algorithm>
 #include <cerrno>
 #include <climits>
 #include <cstdlib>
 #include <cstring>
+#include <atomic>
 #include <string>
 
 namespace {
@@ -48,7 +52,6 @@ constexpr const char* kSimPower2Key = "db/telephony/sim_power_state2";
 constexpr const char* kDetailsAppId = "contacts-details";
 constexpr double kStorageQuestionDelay = 0.5;
 constexpr double kDetailsLaunchCloseDelay = 2.0;
-constexpr int kNoSpaceError = -28;
 constexpr int kTypePictureCrop = 41;
 constexpr int kTypePrimaryEdit = 112;
 constexpr int kTypeEmergency = 126;
@@ -90,6 +93,20 @@ std::string readOperation(CtLaunchRequest* request)
 	std::string text = operation ? operation : "";
 	free(operation);
 	return text;
+}
+
+// The toolkit composes popup titles in fixed buffers and aborts on very long
+// ones: texts of a request are made valid UTF-8 and cut before they are shown.
+constexpr glong kShownRequestTextCharacters = 256;
+
+std::string shownMarkup(const std::string& text)
+{
+	gchar* valid = g_utf8_make_valid(text.c_str(), -1);
+	gchar* cut = g_utf8_substring(valid, 0, std::min(g_utf8_strlen(valid, -1), kShownRequestTextCharacters));
+	std::string markup = ctCommonUtf8ToMarkup(cut);
+	g_free(cut);
+	g_free(valid);
+	return markup;
 }
 
 bool isSimName(const std::string& name)
@@ -202,7 +219,7 @@ CtInputView::~CtInputView()
 		ctCommonUnlinkFile(m_tempFile.c_str());
 	ContactsAppControlLauncher::getInstance()->terminate();
 	m_simThread.reset();
-	CtSimMgr::getInstance()->detach(this);
+	__detachFromSim();
 	if (m_listensToSimPower) {
 		CtRegistryMgr::getInstance()->unRegisterVconfChangedCb(kSimPower1Key, __simPowerChangedCb, this);
 		CtRegistryMgr::getInstance()->unRegisterVconfChangedCb(kSimPower2Key, __simPowerChangedCb, this);
@@ -293,8 +310,7 @@ void CtInputView::onDestroy()
 		evas_object_data_del(m_naviframeObj, kInputNaviItemKey);
 	app_assist::WUiTimer::destroy(m_storageTimer);
 	app_assist::WUiTimer::destroy(m_detailTimer);
-	CtSimMgr::getInstance()->detach(this);
-	m_simAttached = false;
+	__detachFromSim();
 	*m_alive = false;
 }
 
@@ -309,8 +325,6 @@ void CtInputView::onPushed(Elm_Object_Item* naviItem)
 	m_isContentMade = true;
 	if (m_isCreateMode && !getPreferenceBool(kHideStoragePopupKey) && m_inputType != kTypeEmergency)
 		__startStorageTimer();
-	if (m_data->checkAddressbookIsSimOrNot(m_storageId))
-		__attachToSimInThread();
 	m_data->attachListener(this);
 	if (m_numberAlert)
 		__showNumberChangingAlert();
@@ -415,13 +429,27 @@ void CtInputView::__applyStorage(int storageId)
 	destroyPopup();
 }
 
+// The worker may still be attaching when the view goes: the view marks
+// itself gone before it detaches, and a worker that attached and then finds
+// the mark takes the attachment back. (No lock: the attachment may wait for
+// the main loop, which may be in the view's destructor.)
+struct CtInputView::SimAttachment {
+	std::atomic<bool> viewAlive{true};
+};
+
 void CtInputView::__attachToSimInThread()
 {
-	if (m_simThread)
+	if (m_simThread || m_simAttachment)
 		return;
-	m_simAttached = true;
-	m_simThread = std::make_unique<CtThread>([this] {
-		CtSimMgr::getInstance()->attach(this);
+	m_simAttachment = std::make_shared<SimAttachment>();
+	std::shared_ptr<SimAttachment> attachment = m_simAttachment;
+	CtSimListener* listener = this;
+	m_simThread = std::make_unique<CtThread>([attachment, listener] {
+		if (!attachment->viewAlive)
+			return;
+		CtSimMgr::getInstance()->attach(listener);
+		if (!attachment->viewAlive)
+			CtSimMgr::getInstance()->detach(listener);
 	}, [this] {
 		m_simThread.reset();
 	});
@@ -432,16 +460,24 @@ void CtInputView::__attachToSimInThread()
 	}
 }
 
+void CtInputView::__detachFromSim()
+{
+	if (m_simAttachment)
+		m_simAttachment->viewAlive = false;
+	CtSimMgr::getInstance()->detach(this);
+}
+
 void CtInputView::__showNumberChangingAlert()
 {
-	std::string name = readExtra(m_request, "name");
+	std::string name = shownMarkup(readExtra(m_request, "name"));
 	if (name.empty())
 		name = "Profile sharing";
-	std::string text = "This contact's mobile phone number has changed from " + readExtra(m_request, "previous_number")
-		+ " to " + readExtra(m_request, "new_number") + ". Tap Update to change number.";
+	std::string text = "This contact's mobile phone number has changed from "
+		+ shownMarkup(readExtra(m_request, "previous_number")) + " to " + shownMarkup(readExtra(m_request, "new_number"))
+		+ ". Tap Update to change number.";
 	auto* popup = new app_assist::WPopup();
-	popup->setTitle(ctCommonUtf8ToMarkup(name.c_str()).c_str());
-	popup->setContent(ctCommonUtf8ToMarkup(text.c_str()).c_str());
+	popup->setTitle(name.c_str());
+	popup->setContent(text.c_str());
 	popup->addButton("Ok", [](bool*) {});
 	attachPopup(popup);
 }
@@ -459,7 +495,10 @@ void CtInputView::createInputViewControl(Evas_Object* layout, bool sim)
 	}
 	m_control.reset();
 	m_simControl.reset();
+	m_storageId = m_data->getAddressbookId();
 	__createControl(layout, sim);
+	if (sim && isCreated())
+		__attachToSimInThread();
 }
 
 app_assist::WControl* CtInputView::getInputControl() const
@@ -474,7 +513,7 @@ app_assist::WControl* CtInputView::getInputControl() const
 void CtInputView::updateSaveBtn(bool disabled)
 {
 	if (m_tabHost) {
-		__updateTabHostSaveBtn(disabled);
+		m_tabHost->updateSaveBtn(disabled);
 		return;
 	}
 	if (m_doneButton)
@@ -608,7 +647,7 @@ void CtInputView::__saveInEditMode(const std::string& storageName)
 			CtContactsAgentMgr::getInstance()->syncDataStart(m_data->getPersonId());
 	} else {
 		WERROR("update failed %d", err);
-		postToast(err == kNoSpaceError ? "IDS_PB_POP_NOT_ENOUGH_MEMORY" : "IDS_PB_POP_FAILED");
+		postToast(err == CONTACTS_ERROR_FILE_NO_SPACE ? "IDS_PB_POP_NOT_ENOUGH_MEMORY" : "IDS_PB_POP_FAILED");
 	}
 	__replyEdit(success);
 	if (!success && !m_request) {
@@ -661,7 +700,7 @@ void CtInputView::__saveInCreateMode(const std::string& storageName)
 	}
 	if (err != CONTACTS_ERROR_NONE) {
 		WERROR("insert failed %d", err);
-		postToast(err == kNoSpaceError ? "IDS_PB_POP_NOT_ENOUGH_MEMORY" : "IDS_PB_POP_FAILED");
+		postToast(err == CONTACTS_ERROR_FILE_NO_SPACE ? "IDS_PB_POP_NOT_ENOUGH_MEMORY" : "IDS_PB_POP_FAILED");
 		__replyCreate(false, 0);
 		if (!m_request)
 			return;   // the form stays, with what was typed, for another try
@@ -1243,9 +1282,6 @@ CtInputViewControl* CtInputView::__control() const
 	return static_cast<CtInputViewControl*>(m_control.lock().get());
 }
 
-// SIM_CONTROL_PENDING: the SIM control is not built yet.
-#define SIM_CONTROL_PENDING 1
-
 CtInputViewSimControl* CtInputView::__simControl() const
 {
 	return static_cast<CtInputViewSimControl*>(m_simControl.lock().get());
@@ -1255,11 +1291,13 @@ void CtInputView::__createControl(Evas_Object* layout, bool sim)
 {
 	app_assist::WControl* control = nullptr;
 	if (sim) {
-		// The SIM form comes with the SIM control; until then a plain list.
-		Evas_Object* genlist = elm_genlist_add(layout);
-		evas_object_size_hint_weight_set(genlist, EVAS_HINT_EXPAND, EVAS_HINT_EXPAND);
-		evas_object_size_hint_align_set(genlist, EVAS_HINT_FILL, EVAS_HINT_FILL);
-		elm_object_part_content_set(layout, "elm.swallow.content", genlist);
+		control = new CtInputViewSimControl(m_data, this);
+		if (!control->create(layout, nullptr)) {
+			WERROR("SIM control not created");
+			return;
+		}
+		m_simControl = control->getWeakPtr();
+		elm_object_part_content_set(layout, "elm.swallow.content", control->getEvasObj());
 		return;
 	}
 	std::weak_ptr<bool> alive = m_alive;
@@ -1288,10 +1326,8 @@ bool CtInputView::__controlIsEmpty()
 {
 	if (CtInputViewControl* control = __control())
 		return control->__checkIsEmpty();
-#if !SIM_CONTROL_PENDING
 	if (CtInputViewSimControl* control = __simControl())
 		return control->getIsEmpty();
-#endif
 	return true;
 }
 
@@ -1299,10 +1335,8 @@ bool CtInputView::__controlIsChanged()
 {
 	if (CtInputViewControl* control = __control())
 		return control->getIsChanged();
-#if !SIM_CONTROL_PENDING
 	if (CtInputViewSimControl* control = __simControl())
 		return control->getIsChanged();
-#endif
 	return false;
 }
 
@@ -1314,17 +1348,17 @@ bool CtInputView::__controlCheckEmergencyGroup()
 
 void CtInputView::__controlUpdateNameRecordForSim()
 {
-#if !SIM_CONTROL_PENDING
 	if (CtInputViewSimControl* control = __simControl())
 		control->updateNameRecordForSim();
-#endif
 }
 
+// The view waits for the keypad to go down before it leaves: the entry that
+// holds it also gives up the focus, so the keypad cannot stay up.
 void CtInputView::__controlHideInputPanel()
 {
 	if (CtInputViewControl* control = __control())
 		control->hideInputPanel();
-	else if (Evas_Object* focused = elm_object_focused_object_get(m_layout))
+	if (Evas_Object* focused = m_layout ? elm_object_focused_object_get(m_layout) : nullptr)
 		elm_object_focus_set(focused, EINA_FALSE);
 }
 
@@ -1338,10 +1372,8 @@ void CtInputView::__controlFocusForRename()
 {
 	if (CtInputViewControl* control = __control())
 		control->focusForRename();
-#if !SIM_CONTROL_PENDING
 	else if (CtInputViewSimControl* control = __simControl())
 		control->focusForRename();
-#endif
 }
 
 void CtInputView::__controlCloseHoversel()
@@ -1352,10 +1384,8 @@ void CtInputView::__controlCloseHoversel()
 
 void CtInputView::__controlUpdateStorageRow()
 {
-#if !SIM_CONTROL_PENDING
 	if (CtInputViewSimControl* control = __simControl())
 		control->updateAddrBookItem();
-#endif
 }
 
 void CtInputView::__controlUpdateRealizedItems()
@@ -1366,7 +1396,3 @@ void CtInputView::__controlUpdateRealizedItems()
 		elm_genlist_realized_items_update(genlist);
 }
 
-void CtInputView::__updateTabHostSaveBtn(bool disabled)
-{
-	(void)disabled;
-}

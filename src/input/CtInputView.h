@@ -117,6 +117,7 @@ private:
 	void __createTitleButtons(Elm_Object_Item* naviItem);
 	void __startStorageTimer();
 	void __attachToSimInThread();
+	void __detachFromSim();
 	void __showNumberChangingAlert();
 	bool __onStorageTimer();
 	void __showDeviceOnlyPopup();
@@ -163,7 +164,6 @@ private:
 	void __controlCloseHoversel();
 	void __controlUpdateStorageRow();
 	void __controlUpdateRealizedItems();
-	void __updateTabHostSaveBtn(bool disabled);
 
 	void __sendUgResult(const char* key, const char* value, const char* key2 = nullptr, const char* value2 = nullptr);
 	void __sendAppControlReply(const char* key, const char* value, app_control_result_e result);
@@ -193,12 +193,13 @@ private:
 	int m_savedPersonId = 0;
 	app_assist::WUiTimerHandle m_detailTimer;
 	app_assist::WUiTimerHandle m_storageIdler;
+	struct SimAttachment;
+	std::shared_ptr<SimAttachment> m_simAttachment;
 	std::unique_ptr<CtThread> m_simThread;
 	std::string m_tempFile;
 	bool m_numberAlert = false;
 	bool m_isClosing = false;
 	bool m_closeAfterKeypad = false;
-	bool m_simAttached = false;
 	bool m_listensToSimPower = false;
 	Evas_Object* m_naviframeObj = nullptr;
 	std::shared_ptr<bool> m_alive;

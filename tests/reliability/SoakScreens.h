@@ -20,7 +20,13 @@ inline std::vector<OpenableScreen> openableScreens(const ScreenInputs& in)
 {
 	std::vector<OpenableScreen> screens;
 	for (const LibraryScreen& screen : libraryScreens())
-		screens.push_back({ screen.factory, [screen, in] { return screen.make(in); } });
+		screens.push_back({ screen.factory, [screen, in] {
+			// A factory that takes a record gets the stored person's contact each time.
+			ScreenInputs made = in;
+			if (screen.takesRecord)
+				made.record = contactOfPerson(in.personId);
+			return screen.make(made);
+		} });
 	screens.push_back({ "host person list", [] { return new ct::demo::PersonListView([](int) {}); } });
 	return screens;
 }

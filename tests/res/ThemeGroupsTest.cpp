@@ -62,6 +62,7 @@ AskedNames scanSources()
 	const char* styleDefinition = R"(::getItemStyle\(\)(?: const)?\s*\{([^}]*)\})";
 	const char* itemClass = R"(createItemClass\(([^;]+)\);)";
 	const char* layout = R"((?:createIconLayout|ctCommonCreateLayout)\([^;{\n]*?("[^"]+")\))";
+	const char* wizardArea = R"(("profile/wizard/[a-z/]+"))";
 	const char* image = R"(("[A-Za-z0-9_]+\.png"))";
 	const char* part = R"(("(?:elm|touch|copy|main|sub|image|favor)\.[a-z0-9._]+"))";
 	AskedNames names;
@@ -76,6 +77,7 @@ AskedNames scanSources()
 			collect(text, styleDefinition, names.styles);
 			collect(text, itemClass, names.styles);
 			collect(text, layout, names.layouts);
+			collect(text, wizardArea, names.layouts);
 			collect(text, image, names.images);
 			for (const std::string& file : captures(text, R"re("contacts/([a-z_]+\.edj)")re"))
 				names.files.insert(file);

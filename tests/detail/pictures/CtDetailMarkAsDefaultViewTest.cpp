@@ -4,6 +4,7 @@
 // screen's entry to it.
 #include "PictureScreenTest.h"
 
+#include "ContactsCommon.h"
 #include "ContactsDetails.h"
 #include "CtDetailData.h"
 #include "CtDetailMarkAsDefaultView.h"
@@ -212,21 +213,27 @@ TEST_F(CtDetailMarkAsDefaultViewTest, ContactUnlinkedWhileOpenIsNotWrittenAndThe
 	EXPECT_EQ(firstImageId(m_benId), defaultProperty(CONTACTS_PERSON_PROPERTY_IMAGE, personId));
 }
 
-TEST_F(CtDetailMarkAsDefaultViewTest, MoreKeyOfTheDetailScreenOpensItOnlyForAPersonWithAChoice)
+TEST_F(CtDetailMarkAsDefaultViewTest, MoreMenuOfTheDetailScreenOffersItOnlyForAPersonWithAChoice)
 {
-	struct Case {
-		bool linked;
-		int views;
-	};
-	for (const Case& c : {Case{true, 2}, Case{false, 1}}) {
-		int personId = c.linked ? storeLinkedPerson() : addSimplePerson("Single");
+	const std::string entry = ContactsCommon::translate("IDS_PB_OPT_SET_DEFAULT_CONTACT_INFO_ABB");
+	for (bool linked : {true, false}) {
+		int personId = linked ? storeLinkedPerson() : addSimplePerson("Single");
 		auto* detail = static_cast<CtDetailView*>(createCtDetailView(personId, nullptr));
 		ASSERT_TRUE(m_screen->push(detail));
 		ASSERT_TRUE(m_screen->pumpUntil([detail] { return !detail->isBuildingRows(); }));
 		m_screen->sendMoreKey();
 		m_screen->pumpUntilIdle();
-		EXPECT_EQ(c.views, m_screen->viewCount()) << c.linked;
-		if (c.linked) {
+		auto menus = m_screen->findWidgets("Elm_Ctxpopup");
+		ASSERT_EQ(1u, menus.size());
+		Elm_Object_Item* found = nullptr;
+		for (Elm_Object_Item* it = elm_ctxpopup_first_item_get(menus[0]); it; it = elm_ctxpopup_item_next_get(it)) {
+			if (entry == elm_object_item_text_get(it))
+				found = it;
+		}
+		EXPECT_EQ(linked, found != nullptr);
+		if (found) {
+			elm_ctxpopup_item_selected_set(found, EINA_TRUE);
+			m_screen->pumpUntilIdle();
 			EXPECT_NE(nullptr, dynamic_cast<CtDetailMarkAsDefaultView*>(m_screen->topView()));
 		}
 		while (m_screen->viewCount() > 0) {

@@ -2,7 +2,7 @@
 // control characters) shown on every screen: nothing crashes, the screen
 // opens and closes, and what it shows is valid UTF-8. Also: every factory
 // the library exports has its line in the screen table.
-#include "../../data/detail/DetailTestStore.h"
+#include "../../data/myprofile/MyProfileTestStore.h"
 #include "../SoakScreens.h"
 #include "../WriterProcess.h"
 #include "ScreenHarness.h"
@@ -59,7 +59,31 @@ int addHostilePerson(const std::string& text)
 	return personOf(store(contact));
 }
 
-// Every text part of every genlist row on the window.
+// The user's own profile, its every text field holding `text` (the one
+// stored before is removed).
+void storeHostileProfile(const std::string& text)
+{
+	contacts_list_h stored = nullptr;
+	if (contacts_db_get_all_records(_contacts_my_profile._uri, 0, 0, &stored) == CONTACTS_ERROR_NONE) {
+		contacts_record_h profile = nullptr;
+		while (contacts_list_get_current_record_p(stored, &profile) == CONTACTS_ERROR_NONE && profile) {
+			int id = 0;
+			contacts_record_get_int(profile, _contacts_my_profile.id, &id);
+			contacts_db_delete_record(_contacts_my_profile._uri, id);
+			if (contacts_list_next(stored) != CONTACTS_ERROR_NONE)
+				break;
+		}
+		contacts_list_destroy(stored, true);
+	}
+	contacts_record_h profile = newProfile(text.c_str());
+	addProfileNumber(profile, text.c_str(), true, text.c_str());
+	addText(profile, _contacts_my_profile.email, _contacts_email._uri, _contacts_email.email, text.c_str());
+	addText(profile, _contacts_my_profile.note, _contacts_note._uri, _contacts_note.note, text.c_str());
+	addText(profile, _contacts_my_profile.address, _contacts_address._uri, _contacts_address.street, text.c_str());
+	storeProfile(profile);
+}
+
+// Every text part of every genlist row on the window, and every entry's text.
 std::vector<std::string> shownTexts(const ScreenHarness& screen)
 {
 	static const char* const parts[] = { "elm.text", "elm.text.sub", "elm.text.main", "elm.text.multiline",
@@ -69,6 +93,10 @@ std::vector<std::string> shownTexts(const ScreenHarness& screen)
 		for (Elm_Object_Item* item : ScreenHarness::genlistItems(genlist))
 			for (const char* part : parts)
 				texts.push_back(ScreenHarness::itemText(item, part));
+	for (Evas_Object* entry : screen.findWidgets("Elm_Entry")) {
+		const char* shown = elm_entry_entry_get(entry);
+		texts.push_back(shown ? shown : "");
+	}
 	return texts;
 }
 
@@ -90,6 +118,7 @@ TEST_F(HostileFieldsTest, EveryScreenShowsHostileStoredTextsAsValidTextWithoutCr
 		ScreenInputs inputs;
 		inputs.personId = addHostilePerson(hostile.text);
 		inputs.galData = &gal;
+		storeHostileProfile(hostile.text);
 		for (const OpenableScreen& shown : openableScreens(inputs)) {
 			SCOPED_TRACE(shown.name + " with " + hostile.what);
 			ScreenHarness screen(360, 640);

@@ -8,6 +8,7 @@
 #include "CtCommonAddressbookUtil.h"
 #include "CtCommonRecordUtil.h"
 #include "CtCommonTextUtil.h"
+#include "CtDatePicker.h"
 #include "CtCommonUsageLog.h"
 #include "CtCommonWidgetUtil.h"
 #include "CtEsuAgentMgr.h"
@@ -44,10 +45,6 @@
 #include <cstring>
 #include <ctime>
 #include <sys/stat.h>
-
-// The datetime is a clock that keeps showing the current time unless paused
-// (a beta interface of the toolkit, declared here).
-extern "C" EAPI void efl_ui_clock_pause_set(Eo* obj, Eina_Bool paused);
 
 namespace {
 
@@ -179,7 +176,7 @@ struct tm today()
 	return date;
 }
 
-// The datetime only takes a date whose week and year days are filled in.
+// The lunar conversion takes a date whose week and year days are filled in.
 struct tm withWeekDays(struct tm date)
 {
 	date.tm_hour = 12;
@@ -1416,6 +1413,15 @@ CtInputViewControl* CtInputViewControl::__fromReply(void* data)
 	return self;
 }
 
+// A picker the person backed out of (or that failed) changes nothing.
+bool CtInputViewControl::__isSuccess(app_control_result_e result)
+{
+	if (result == APP_CONTROL_RESULT_SUCCEEDED)
+		return true;
+	WDEBUG("reply not a success: %d", result);
+	return false;
+}
+
 bool CtInputViewControl::__sendRequest(app_control_h request, app_control_reply_cb replyCb)
 {
 	app_control_set_launch_mode(request, APP_CONTROL_LAUNCH_MODE_GROUP);
@@ -1535,29 +1541,32 @@ void CtInputViewControl::__launchDecorateContactImage()
 	}
 }
 
-void CtInputViewControl::__galleryReplyCb(app_control_h, app_control_h reply, app_control_result_e, void* data)
+void CtInputViewControl::__galleryReplyCb(app_control_h, app_control_h reply, app_control_result_e result, void* data)
 {
 	if (CtInputViewControl* self = __fromReply(data))
-		self->__onPictureReply(reply, APP_CONTROL_DATA_SELECTED, true);
+		self->__onPictureReply(result, reply, APP_CONTROL_DATA_SELECTED, true);
 }
 
-void CtInputViewControl::__cameraReplyCb(app_control_h, app_control_h reply, app_control_result_e, void* data)
+void CtInputViewControl::__cameraReplyCb(app_control_h, app_control_h reply, app_control_result_e result, void* data)
 {
 	if (CtInputViewControl* self = __fromReply(data)) {
 		self->m_isPictureLaunched = true;
-		self->__onPictureReply(reply, APP_CONTROL_DATA_SELECTED, true);
+		self->__onPictureReply(result, reply, APP_CONTROL_DATA_SELECTED, true);
 	}
 }
 
-void CtInputViewControl::__decorateReplyCb(app_control_h, app_control_h reply, app_control_result_e, void* data)
+void CtInputViewControl::__decorateReplyCb(app_control_h, app_control_h reply, app_control_result_e result, void* data)
 {
 	if (CtInputViewControl* self = __fromReply(data))
-		self->__onPictureReply(reply, "path", false);
+		self->__onPictureReply(result, reply, "path", false);
 }
 
-void CtInputViewControl::__onPictureReply(app_control_h reply, const char* key, bool isArray)
+void CtInputViewControl::__onPictureReply(app_control_result_e result, app_control_h reply, const char* key,
+		bool isArray)
 {
 	__setPictureFocus(true);
+	if (!__isSuccess(result))
+		return;
 	std::string path = isArray ? firstOf(reply, key) : extraOf(reply, key);
 	if (path.empty()) {
 		WERROR("no picture in the reply");
@@ -1623,15 +1632,17 @@ void CtInputViewControl::__onRingtoneSelectedCb()
 		WERROR("launch Failed");
 }
 
-void CtInputViewControl::__ringtoneReplyCb(app_control_h, app_control_h reply, app_control_result_e, void* data)
+void CtInputViewControl::__ringtoneReplyCb(app_control_h, app_control_h reply, app_control_result_e result, void* data)
 {
-	if (CtInputViewControl* self = __fromReply(data))
-		self->__onRingtoneReply(reply);
+	if (CtInputViewControl* self = __fromReply(data)) {
+		self->m_isRingtonePickerLaunched = false;
+		if (__isSuccess(result))
+			self->__onRingtoneReply(reply);
+	}
 }
 
 void CtInputViewControl::__onRingtoneReply(app_control_h reply)
 {
-	m_isRingtonePickerLaunched = false;
 	std::string result = extraOf(reply, "result");
 	if (result.empty()) {
 		WERROR("no ringtone in the reply");
@@ -1682,9 +1693,9 @@ void CtInputViewControl::__launchGroupsUG()
 		WERROR("launch Failed");
 }
 
-void CtInputViewControl::__groupsReplyCb(app_control_h, app_control_h reply, app_control_result_e, void* data)
+void CtInputViewControl::__groupsReplyCb(app_control_h, app_control_h reply, app_control_result_e result, void* data)
 {
-	if (CtInputViewControl* self = __fromReply(data))
+	if (CtInputViewControl* self = __fromReply(data); self && __isSuccess(result))
 		self->__onGroupsReply(reply);
 }
 
@@ -1790,29 +1801,19 @@ Evas_Object* CtInputViewControl::__createEventDatePopupContent(Evas_Object* pare
 	m_isLeapMonth = false;
 	Evas_Object* layout = m_isLunarSupported
 		? ctCommonCreateLayout(parent, "contacts/contacts.edj", "popup_input_date") : nullptr;
-	Evas_Object* datetime = elm_datetime_add(layout ? layout : parent);
-	efl_ui_clock_pause_set(datetime, EINA_TRUE);
-	elm_datetime_field_visible_set(datetime, ELM_DATETIME_HOUR, EINA_FALSE);
-	elm_datetime_field_visible_set(datetime, ELM_DATETIME_MINUTE, EINA_FALSE);
-	elm_datetime_field_visible_set(datetime, ELM_DATETIME_AMPM, EINA_FALSE);
-	char* region = vconf_get_str(kRegionFormatKey);
-	if (region && *region)
-		uxt_date_time_set_format_by_locale(datetime, region);
-	free(region);
-	uxt_theme_object_replace_color(datetime, "B0211", "transparent");
-	struct tm start = withWeekDays(today());
-	elm_datetime_value_set(datetime, &start);
-	evas_object_size_hint_weight_set(datetime, EVAS_HINT_EXPAND, EVAS_HINT_EXPAND);
-	evas_object_size_hint_align_set(datetime, EVAS_HINT_FILL, EVAS_HINT_FILL);
-	evas_object_show(datetime);
-	evas_object_smart_callback_add(datetime, "changed", [](void* data, Evas_Object*, void*) {
-		static_cast<CtInputViewControl*>(data)->__datetimeValueChangedCb();
-	}, this);
-	track(&m_datetime, datetime);
+	auto* picker = new CtDatePicker(withWeekDays(today()));
+	std::weak_ptr<bool> alive = m_alive;
+	picker->setChangedCallback([this, alive] {
+		if (!alive.expired() && *alive.lock())
+			__datetimeValueChangedCb();
+	});
+	picker->create(layout ? layout : parent, nullptr);
+	m_datePicker = picker->getWeakPtr();
+	Evas_Object* content = picker->getEvasObj();
 	track(&m_calendarButton, nullptr);
 	if (!layout)
-		return datetime;
-	elm_object_part_content_set(layout, "elm.swallow.content", datetime);
+		return content;
+	elm_object_part_content_set(layout, "elm.swallow.content", content);
 	Evas_Object* button = uxt_button_add(layout, "on_gradient_bg");
 	elm_object_domain_translatable_text_set(button, "contacts", "IDS_PB_ACBUTTON_SOLAR_ABB");
 	evas_object_smart_callback_add(button, "clicked", [](void* data, Evas_Object*, void*) {
@@ -1823,11 +1824,16 @@ Evas_Object* CtInputViewControl::__createEventDatePopupContent(Evas_Object* pare
 	return layout;
 }
 
+CtDatePicker* CtInputViewControl::__datePicker() const
+{
+	return static_cast<CtDatePicker*>(m_datePicker.lock().get());
+}
+
 void CtInputViewControl::__calendarBtnClickedCb()
 {
-	WPRET_M(!m_datetime, "datetime is NULL");
-	struct tm shown = {};
-	elm_datetime_value_get(m_datetime, &shown);
+	CtDatePicker* picker = __datePicker();
+	WPRET_M(!picker, "picker is NULL");
+	struct tm shown = withWeekDays(picker->getDate());
 	struct tm converted = {};
 	int err;
 	if (m_isSolar) {
@@ -1844,10 +1850,7 @@ void CtInputViewControl::__calendarBtnClickedCb()
 		return;
 	}
 	m_isSolar = !m_isSolar;
-	bool leap = m_isLeapMonth;
-	converted = withWeekDays(converted);
-	elm_datetime_value_set(m_datetime, &converted);
-	m_isLeapMonth = leap; // the value change above is not a person's choice
+	picker->setDate(converted);
 	if (m_calendarButton)
 		elm_object_domain_translatable_text_set(m_calendarButton, "contacts",
 				m_isSolar ? "IDS_PB_ACBUTTON_SOLAR_ABB" : "IDS_PB_ACBUTTON_LUNAR_ABB");
@@ -1855,18 +1858,18 @@ void CtInputViewControl::__calendarBtnClickedCb()
 
 void CtInputViewControl::__datetimeValueChangedCb()
 {
-	if (m_isSolar || !m_datetime)
+	CtDatePicker* picker = __datePicker();
+	if (m_isSolar || !picker)
 		return;
-	struct tm value = {};
-	elm_datetime_value_get(m_datetime, &value);
+	struct tm value = picker->getDate();
 	m_isLeapMonth = uxt_util_is_leap_month_possible(UXT_CALENDAR_LUNAR_CHINESE, &value) == 1;
 }
 
 void CtInputViewControl::__onEventDateSet()
 {
-	WPRET_M(!m_datetime, "datetime is NULL");
-	struct tm value = {};
-	elm_datetime_value_get(m_datetime, &value);
+	CtDatePicker* picker = __datePicker();
+	WPRET_M(!picker, "picker is NULL");
+	struct tm value = picker->getDate();
 	__appendEventItem(value.tm_year + 1900, value.tm_mon + 1, value.tm_mday);
 	__updateSaveBtn();
 }
@@ -1959,9 +1962,9 @@ void CtInputViewControl::__launchMapsApp(Elm_Object_Item* item, contacts_record_
 		WERROR("launch Failed");
 }
 
-void CtInputViewControl::__mapsReplyCb(app_control_h, app_control_h reply, app_control_result_e, void* data)
+void CtInputViewControl::__mapsReplyCb(app_control_h, app_control_h reply, app_control_result_e result, void* data)
 {
-	if (CtInputViewControl* self = __fromReply(data))
+	if (CtInputViewControl* self = __fromReply(data); self && __isSuccess(result))
 		self->__onMapsReply(reply);
 }
 

@@ -16,6 +16,7 @@
 #include <utility>
 #include <vector>
 
+class CtDatePicker;
 class CtInputView;
 class CtInputViewGenlistItem;
 class CtInputViewRelationItem;
@@ -162,7 +163,7 @@ private:
 	void __launchCamera();
 	void __launchDecorateContactImage();
 	bool __sendRequest(app_control_h request, app_control_reply_cb replyCb);
-	void __onPictureReply(app_control_h reply, const char* key, bool isArray);
+	void __onPictureReply(app_control_result_e result, app_control_h reply, const char* key, bool isArray);
 	void __updateImageData(const char* path);
 	void __onRemoveSelCb();
 	void __refreshPicture();
@@ -182,6 +183,7 @@ private:
 	// Event date popup.
 	void __createEventDataPopup();
 	Evas_Object* __createEventDatePopupContent(Evas_Object* parent);
+	CtDatePicker* __datePicker() const;
 	void __calendarBtnClickedCb();
 	void __datetimeValueChangedCb();
 	void __onEventDateSet();
@@ -213,6 +215,7 @@ private:
 	static void __groupsReplyCb(app_control_h request, app_control_h reply, app_control_result_e result, void* data);
 	static void __mapsReplyCb(app_control_h request, app_control_h reply, app_control_result_e result, void* data);
 	static CtInputViewControl* __fromReply(void* data);
+	static bool __isSuccess(app_control_result_e result);
 
 	std::shared_ptr<CtData> m_inputData;
 	CtInputView* m_view;
@@ -247,7 +250,7 @@ private:
 	app_assist::WUiTimerHandle m_autoScrollIdler;
 
 	// Event date popup.
-	Evas_Object* m_datetime = nullptr;
+	std::weak_ptr<app_assist::WControl> m_datePicker;
 	Evas_Object* m_calendarButton = nullptr;
 	bool m_isSolar = true;
 	bool m_isLeapMonth = false;

@@ -3,15 +3,12 @@
 #include "ContactsDebug.h"
 #include "CtCommonRecordUtil.h"
 #include "CtCommonWidgetUtil.h"
+#include "CtDatePicker.h"
 #include "CtInputDataTypeCustomPopup.h"
 #include "WPopup.h"
 
 #include <ui_extension.h>
 #include <vconf.h>
-
-// The datetime is a clock that keeps showing the current time unless paused
-// (a beta interface of the toolkit, declared here).
-extern "C" EAPI void efl_ui_clock_pause_set(Eo* obj, Eina_Bool paused);
 
 #include <cstdlib>
 #include <cstring>
@@ -36,7 +33,7 @@ std::string readVconf(const char* key)
 	return out;
 }
 
-// The datetime only takes a date whose week and year days are filled in.
+// The lunar conversion takes a date whose week and year days are filled in.
 struct tm withWeekDays(struct tm tm)
 {
 	tm.tm_hour = 12;
@@ -85,7 +82,7 @@ CtInputViewEventItem::~CtInputViewEventItem()
 	for (const auto& popup : {m_datePopup, m_customPopup})
 		if (auto alive = popup.lock())
 			alive->destroy();
-	for (Evas_Object** slot : {&m_dateButton, &m_hoversel, &m_datetime, &m_calendarButton})
+	for (Evas_Object** slot : {&m_dateButton, &m_hoversel, &m_calendarButton})
 		untrack(slot);
 }
 
@@ -302,30 +299,14 @@ Evas_Object* CtInputViewEventItem::__createDatePopupContent(Evas_Object* parent)
 		m_isLeapMonth = false; // no such leap month that year: keep the ordinary month
 
 	Evas_Object* layout = lunar ? ctCommonCreateLayout(parent, "contacts/contacts.edj", "popup_input_date") : nullptr;
-	Evas_Object* datetime = elm_datetime_add(layout ? layout : parent);
-	efl_ui_clock_pause_set(datetime, EINA_TRUE);
-	elm_datetime_field_visible_set(datetime, ELM_DATETIME_HOUR, EINA_FALSE);
-	elm_datetime_field_visible_set(datetime, ELM_DATETIME_MINUTE, EINA_FALSE);
-	elm_datetime_field_visible_set(datetime, ELM_DATETIME_AMPM, EINA_FALSE);
-	std::string region = readVconf(VCONFKEY_REGIONFORMAT);
-	int time1224 = 0;
-	if (vconf_get_int(VCONFKEY_REGIONFORMAT_TIME1224, &time1224) < 0)
-		WERROR("ret < 0");
-	else if (region.empty())
-		WERROR("regionFmt is NULL");
-	else
-		uxt_date_time_set_format_by_locale(datetime, region.c_str());
-	uxt_theme_object_replace_color(datetime, "B0211", "transparent");
-	evas_object_smart_callback_add(datetime, "changed", __datetimeChangedCb, this);
-	untrack(&m_datetime);
-	track(&m_datetime, datetime);
+	auto* picker = new CtDatePicker(start);
+	picker->setChangedCallback([this] { __onPickerChanged(); });
+	picker->create(layout ? layout : parent, nullptr);
+	m_datePicker = picker->getWeakPtr();
 	untrack(&m_calendarButton);
-	if (!layout) {
-		elm_datetime_value_set(datetime, &start);
-		return datetime;
-	}
-	elm_object_part_content_set(layout, "elm.swallow.content", datetime);
-	elm_datetime_value_set(datetime, &start);
+	if (!layout)
+		return picker->getEvasObj();
+	elm_object_part_content_set(layout, "elm.swallow.content", picker->getEvasObj());
 	Evas_Object* button = uxt_button_add(layout, "on_gradient_bg");
 	evas_object_smart_callback_add(button, "clicked", __calendarClickedCb, this);
 	elm_object_part_content_set(layout, "elm.button", button);
@@ -341,11 +322,16 @@ void CtInputViewEventItem::__updateCalendarButton()
 				m_isSolar ? "IDS_PB_ACBUTTON_SOLAR_ABB" : "IDS_PB_ACBUTTON_LUNAR_ABB");
 }
 
+CtDatePicker* CtInputViewEventItem::__datePicker() const
+{
+	return static_cast<CtDatePicker*>(m_datePicker.lock().get());
+}
+
 void CtInputViewEventItem::__toggleCalendar()
 {
-	WPRET_M(!m_datetime, "datetime is NULL");
-	struct tm shown = {};
-	elm_datetime_value_get(m_datetime, &shown);
+	CtDatePicker* picker = __datePicker();
+	WPRET_M(!picker, "picker is NULL");
+	struct tm shown = withWeekDays(picker->getDate());
 	struct tm converted = {};
 	int err;
 	if (m_isSolar) {
@@ -362,23 +348,20 @@ void CtInputViewEventItem::__toggleCalendar()
 		return;
 	}
 	m_isSolar = !m_isSolar;
-	evas_object_smart_callback_del_full(m_datetime, "changed", __datetimeChangedCb, this);
-	converted = withWeekDays(converted);
-	elm_datetime_value_set(m_datetime, &converted);
-	evas_object_smart_callback_add(m_datetime, "changed", __datetimeChangedCb, this);
+	picker->setDate(converted);
 	__updateCalendarButton();
 }
 
 void CtInputViewEventItem::__setDate()
 {
-	WPRET_M(!m_datetime, "datetime is NULL");
+	CtDatePicker* picker = __datePicker();
+	WPRET_M(!picker, "picker is NULL");
 	if (isLunarSupported()) {
 		m_data->setCalendarType(m_record, m_isSolar ? 0 : 1);
 		if (!m_isSolar)
 			m_data->setIsLeapMonth(m_record, m_isLeapMonth);
 	}
-	struct tm value = {};
-	elm_datetime_value_get(m_datetime, &value);
+	struct tm value = picker->getDate();
 	int date = (value.tm_year + 1900) * 10000 + (value.tm_mon + 1) * 100 + value.tm_mday;
 	m_data->setEventEvent(m_record, date);
 	updateDateText();
@@ -397,14 +380,13 @@ void CtInputViewEventItem::__calendarClickedCb(void* data, Evas_Object*, void*)
 	static_cast<CtInputViewEventItem*>(data)->__toggleCalendar();
 }
 
-void CtInputViewEventItem::__datetimeChangedCb(void* data, Evas_Object* obj, void*)
+void CtInputViewEventItem::__onPickerChanged()
 {
-	auto* self = static_cast<CtInputViewEventItem*>(data);
-	if (self->m_isSolar)
+	CtDatePicker* picker = __datePicker();
+	if (m_isSolar || !picker)
 		return;
-	struct tm value = {};
-	elm_datetime_value_get(obj, &value);
-	self->m_isLeapMonth = uxt_util_is_leap_month_possible(UXT_CALENDAR_LUNAR_CHINESE, &value) == 1;
+	struct tm value = picker->getDate();
+	m_isLeapMonth = uxt_util_is_leap_month_possible(UXT_CALENDAR_LUNAR_CHINESE, &value) == 1;
 }
 
 void CtInputViewEventItem::__deleteClickedCb(void* data, Evas_Object*, void*)

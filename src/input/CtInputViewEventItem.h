@@ -11,6 +11,8 @@
 #include <functional>
 #include <memory>
 
+class CtDatePicker;
+
 // A dated event (birthday, anniversary, other or a custom label): a date
 // button opening a date popup (solar, or lunar where the country uses it),
 // the type selector and a delete button. Birthday is offered only while no
@@ -61,9 +63,10 @@ private:
 	void __toggleCalendar();
 	void __notifyTypesChanged();
 	void __updateCalendarButton();
+	void __onPickerChanged();
+	CtDatePicker* __datePicker() const;
 	static void __dateClickedCb(void* data, Evas_Object* obj, void* eventInfo);
 	static void __calendarClickedCb(void* data, Evas_Object* obj, void* eventInfo);
-	static void __datetimeChangedCb(void* data, Evas_Object* obj, void* eventInfo);
 	static void __deleteClickedCb(void* data, Evas_Object* obj, void* eventInfo);
 
 	std::shared_ptr<CtData> m_data;
@@ -73,7 +76,7 @@ private:
 	std::function<void()> m_typesChanged;
 	Evas_Object* m_dateButton = nullptr;
 	Evas_Object* m_hoversel = nullptr;
-	Evas_Object* m_datetime = nullptr;
+	std::weak_ptr<app_assist::WControl> m_datePicker;
 	Evas_Object* m_calendarButton = nullptr;
 	std::weak_ptr<app_assist::WControl> m_datePopup;
 	std::weak_ptr<app_assist::WControl> m_customPopup;

@@ -3,8 +3,12 @@
 
 #include "WPopup.h"
 
+#include <memory>
+
 #include <ctime>
 #include <functional>
+
+class CtDatePicker;
 
 // The date of a new event of the profile: day, month and year pickers
 // (starting on today) and, where the country uses the lunar calendar, a
@@ -22,29 +26,24 @@ public:
 	// The solar/lunar button; null where the lunar calendar is not used.
 	Evas_Object* getCalendarButton() const { return m_calendarButton; }
 	bool isSolar() const { return m_isSolar; }
+	CtDatePicker* getPicker() const { return __picker(); }
 
 protected:
 	~CtMyProfileDatePopup() override;
 
 private:
 	Evas_Object* __createContent(Evas_Object* parent);
-	Evas_Object* __createPicker(Evas_Object* parent);
-	Evas_Object* __addSpinner(Evas_Object* box, int min, int max, int value);
-	struct tm __shownDate() const;
-	void __showDate(const struct tm& date);
+	CtDatePicker* __picker() const;
 	void __dateChanged();
 	void __toggleCalendar();
 	void __updateCalendarButton();
 	void __set();
 	static void __calendarBtnClickedCb(void* data, Evas_Object* obj, void* eventInfo);
-	static void __spinnerChangedCb(void* data, Evas_Object* obj, void* eventInfo);
 	static void __partDelCb(void* data, Evas* e, Evas_Object* obj, void* eventInfo);
 
 	bool m_lunarAllowed;
 	SetCallback m_onSet;
-	Evas_Object* m_day = nullptr;
-	Evas_Object* m_month = nullptr;
-	Evas_Object* m_year = nullptr;
+	std::weak_ptr<app_assist::WControl> m_picker;
 	Evas_Object* m_calendarButton = nullptr;
 	bool m_isSolar = true;
 	bool m_isLeapMonth = false;

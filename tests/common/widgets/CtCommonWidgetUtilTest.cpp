@@ -93,20 +93,6 @@ TEST_F(WidgetUtilTest, ImageTakesTheColourOfItsCode)
 	EXPECT_FALSE(ctCommonSetImageColor(plain, "NOPE"));
 }
 
-TEST_F(WidgetUtilTest, ButtonAndDeleteButtonCallBackWhenClicked)
-{
-	int clicks = 0;
-	Evas_Object* button = ctCommonCreateButton(parent(), "bottom", "IDS_PB_BUTTON_SHARE_ABB6", countCb, &clicks);
-	ASSERT_NE(nullptr, button);
-	EXPECT_EQ(ContactsCommon::translate("IDS_PB_BUTTON_SHARE_ABB6"), ScreenHarness::buttonLabel(button));
-	evas_object_smart_callback_call(button, "clicked", nullptr);
-	Evas_Object* remove = ctCommonCreateDeleteImage(parent(), countCb, &clicks);
-	ASSERT_NE(nullptr, remove);
-	evas_object_smart_callback_call(remove, "clicked", nullptr);
-	EXPECT_EQ(2, clicks);
-	EXPECT_EQ(nullptr, ctCommonCreateButton(nullptr, nullptr, nullptr, nullptr, nullptr));
-}
-
 TEST_F(WidgetUtilTest, SmallPicturesAreLowSizeAndUnreadableOnesAreNot)
 {
 	EXPECT_TRUE(ctCommonIsLowSizeImage(parent(), picture(120, 120).c_str()));

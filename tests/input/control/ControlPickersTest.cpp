@@ -3,6 +3,7 @@
 // answers ignored), the ringtone, groups (Base64 id lists), the event date
 // with the lunar calendar, and answers that arrive after the form closed.
 #include "ControlTestSupport.h"
+#include "DatePickerProbe.h"
 
 #include "CtInputViewBasicInfoItem.h"
 #include "CtInputViewImportantFieldsItem.h"
@@ -165,6 +166,13 @@ TEST_F(ControlPickersTest, RingtoneAnswersSetOrClearTheRingtoneAndKeepTheRow)
 	EXPECT_EQ("/usr/share/sounds/ringtones/a.ogg", lastExtra("marked_mode"));
 	answer(RINGTONE_PICKER_APP_ID, {});
 	EXPECT_STREQ("/usr/share/sounds/ringtones/a.ogg", m_view->getData()->getRingtone()) << "an empty answer";
+	for (app_control_result_e result : { APP_CONTROL_RESULT_CANCELED, APP_CONTROL_RESULT_FAILED }) {
+		ScreenHarness::selectItem(itemAt("ringtone"));
+		m_screen->pumpUntilIdle();
+		answer(RINGTONE_PICKER_APP_ID, { { "result", "default" } }, {}, result);
+		EXPECT_STREQ("/usr/share/sounds/ringtones/a.ogg", m_view->getData()->getRingtone()) << "backed out: " << result;
+	}
+	EXPECT_FALSE(control()->getIsChanged());
 
 	ScreenHarness::selectItem(itemAt("ringtone"));
 	m_screen->pumpUntilIdle();
@@ -199,11 +207,14 @@ TEST_F(ControlPickersTest, GroupAnswersAreBase64IdListsAndBadOnesChangeNothing)
 		const char* name;
 		std::map<std::string, std::string> extras;
 		std::vector<int> expected;
+		app_control_result_e result = APP_CONTROL_RESULT_SUCCEEDED;
 	} cases[] = {
 		{ "no key", {}, {} },
 		{ "length not a multiple of 4", { { "group_id_list", "AAAAAAA" } }, { family, work } },
 		{ "not Base64", { { "group_id_list", "!!!!" } }, { family, work } },
 		{ "a deleted group", { { "group_id_list", base64Ids({ gone }) } }, { family, work } },
+		{ "backed out", {}, { family, work }, APP_CONTROL_RESULT_CANCELED },
+		{ "failed", { { "group_id_list", base64Ids({ work }) } }, { family, work }, APP_CONTROL_RESULT_FAILED },
 		{ "one group", { { "group_id_list", base64Ids({ work, gone }) } }, { work } },
 	};
 	// "No key" clears, so it goes last.
@@ -215,7 +226,7 @@ TEST_F(ControlPickersTest, GroupAnswersAreBase64IdListsAndBadOnesChangeNothing)
 		EXPECT_EQ("36", lastExtra("type"));
 		std::vector<int32_t> sent = decodeIds(lastExtra("selected_group_id_list"));
 		EXPECT_EQ(groupIds().size(), sent.size());
-		answer(CONTACTS_LIST_APP_ID, c.extras);
+		answer(CONTACTS_LIST_APP_ID, c.extras, {}, c.result);
 		EXPECT_EQ(c.expected, groupIds());
 		EXPECT_NE(nullptr, itemAt("groups"));
 	}
@@ -227,14 +238,7 @@ TEST_F(ControlPickersTest, LunarEventInALeapMonthIsStoredWithItsLeapFlag)
 	vconf_set_str(VCONFKEY_CSC_COUNTRY_ISO, "KR");
 	open(0);
 	chooseFromMore("IDS_PB_OPT_EVENT_HEG_BIRTHDAY_ABB");
-	Evas_Object* datetime = m_screen->findWidgets("Elm_Datetime").front();
-	struct tm day = {};
-	day.tm_year = 2023 - 1900;
-	day.tm_mon = 2;
-	day.tm_mday = 22;
-	day.tm_hour = 12;
-	mktime(&day);
-	elm_datetime_value_set(datetime, &day);
+	turnPicker(*m_screen, 2023, 3, 22);
 	ASSERT_TRUE(ScreenHarness::click(m_screen->findButton(tr("IDS_PB_ACBUTTON_SOLAR_ABB"))));
 	m_screen->pumpUntilIdle();
 	ASSERT_NE(nullptr, m_screen->findButton(tr("IDS_PB_ACBUTTON_LUNAR_ABB")));
@@ -327,4 +331,33 @@ TEST_F(ControlPickersTest, PowerSavingEndsTheRingtonePickerAndDisablesTheRow)
 	vconf_set_int(VCONFKEY_SETAPPL_PSMODE, 0);
 	m_screen->pumpUntilIdle();
 	EXPECT_FALSE(elm_object_item_disabled_get(itemAt("ringtone")));
+}
+
+TEST_F(ControlPickersTest, EventDatePopupStartsTodayAndSetsTheTurnedDateButNo30February)
+{
+	open(0);
+	chooseFromMore("IDS_PB_OPT_EVENT_HEG_BIRTHDAY_ABB");
+	time_t now = time(nullptr);
+	struct tm today = {};
+	localtime_r(&now, &today);
+	EXPECT_EQ(std::to_string(today.tm_year + 1900) + "-" + std::to_string(today.tm_mon + 1) + "-"
+			+ std::to_string(today.tm_mday), shownPickerDate(*m_screen));
+	struct Turn {
+		int year, month, day;
+		const char* shown;
+	};
+	for (const Turn& turn : { Turn{ 1999, 12, 31, "1999-12-31" }, Turn{ 2021, 2, 30, "2021-2-28" },
+			Turn{ 2024, 2, 30, "2024-2-29" }, Turn{ 2024, 4, 31, "2024-4-30" } }) {
+		turnPicker(*m_screen, turn.year, turn.month, turn.day);
+		EXPECT_EQ(turn.shown, shownPickerDate(*m_screen));
+	}
+	// The day follows a later change of the month too.
+	turnPicker(*m_screen, 0, 0, 31);
+	turnPicker(*m_screen, 0, 2, 0);
+	EXPECT_EQ("2024-2-29", shownPickerDate(*m_screen));
+	ASSERT_TRUE(ScreenHarness::click(m_screen->findButton(tr("IDS_PB_SK_SET"))));
+	m_screen->pumpUntilIdle();
+	contacts_record_h event = static_cast<contacts_record_h>(eina_list_data_get(m_view->getData()->getEventList()));
+	ASSERT_NE(nullptr, event);
+	EXPECT_EQ(20240229, m_view->getData()->getEventEvent(event));
 }

@@ -193,7 +193,7 @@ void InputControlTest::standIn(const std::string& appId)
 }
 
 void InputControlTest::answer(const std::string& appId, const std::map<std::string, std::string>& extras,
-		const std::vector<std::string>& arrays)
+		const std::vector<std::string>& arrays, app_control_result_e result)
 {
 	ASSERT_FALSE(m_received[appId].empty()) << appId << " got no request";
 	app_control_h reply = nullptr;
@@ -206,7 +206,7 @@ void InputControlTest::answer(const std::string& appId, const std::map<std::stri
 			app_control_add_extra_data(reply, extra.first.c_str(), extra.second.c_str());
 		}
 	}
-	m_received[appId].back()(reply, APP_CONTROL_RESULT_SUCCEEDED);
+	m_received[appId].back()(reply, result);
 	app_control_destroy(reply);
 	m_screen->pumpUntilIdle();
 }

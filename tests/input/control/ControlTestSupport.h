@@ -63,9 +63,9 @@ protected:
 	// Registers a stand-in for `appId` that keeps each request for the test.
 	void standIn(const std::string& appId);
 	// Answers the newest request to `appId` with `extras` (one-element arrays
-	// for keys in `arrays`), then pumps.
+	// for keys in `arrays`) and `result`, then pumps.
 	void answer(const std::string& appId, const std::map<std::string, std::string>& extras,
-			const std::vector<std::string>& arrays = {});
+			const std::vector<std::string>& arrays = {}, app_control_result_e result = APP_CONTROL_RESULT_SUCCEEDED);
 	std::vector<Received>& received(const std::string& appId) { return m_received[appId]; }
 
 	std::unique_ptr<ScreenHarness> m_screen;

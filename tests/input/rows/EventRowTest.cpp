@@ -3,6 +3,7 @@
 #include "InputRowTestSupport.h"
 
 #include "CtInputViewEventItem.h"
+#include "DatePickerProbe.h"
 
 #include <ui_extension.h>
 
@@ -63,11 +64,6 @@ protected:
 	{
 		return std::to_string(tm.tm_year + 1900) + "-" + std::to_string(tm.tm_mon + 1) + "-" + std::to_string(tm.tm_mday);
 	}
-	Evas_Object* popupDatetime()
-	{
-		auto found = m_screen->findWidgets("Elm_Datetime");
-		return found.empty() ? nullptr : found.front();
-	}
 
 	std::shared_ptr<CtInputData> m_data;
 	std::shared_ptr<bool> m_hasBirthday = std::make_shared<bool>(false);
@@ -89,20 +85,16 @@ TEST_F(EventRowTest, DatesShowWithTheYearOrDayAndMonthOnlyAndThePopupOpensOn1902
 
 	ASSERT_TRUE(ScreenHarness::click(rows[1]->getDateButton()));
 	m_screen->pumpUntilIdle();
-	Evas_Object* datetime = popupDatetime();
-	ASSERT_NE(nullptr, datetime);
-	struct tm shown = {};
-	elm_datetime_value_get(datetime, &shown);
-	EXPECT_EQ("1902-3-15", shownDate(shown));
+	EXPECT_EQ("1902-3-15", shownPickerDate(*m_screen));
 	// Without lunar support there is no calendar button.
 	EXPECT_EQ(nullptr, m_screen->findButton(tr("IDS_PB_ACBUTTON_SOLAR_ABB")));
 
-	shown.tm_year = 1984 - 1900;
-	elm_datetime_value_set(datetime, &shown);
+	turnPicker(*m_screen, 1984, 2, 30);
+	EXPECT_EQ("1984-2-29", shownPickerDate(*m_screen)) << "no 30 February";
 	ASSERT_TRUE(ScreenHarness::click(m_screen->findButton(tr("IDS_PB_SK_SET"))));
 	m_screen->pumpUntilIdle();
-	EXPECT_EQ(19840315, m_data->getEventEvent(rows[1]->getRecord()));
-	EXPECT_EQ("March 15, 1984", ScreenHarness::buttonLabel(rows[1]->getDateButton()));
+	EXPECT_EQ(19840229, m_data->getEventEvent(rows[1]->getRecord()));
+	EXPECT_EQ("February 29, 1984", ScreenHarness::buttonLabel(rows[1]->getDateButton()));
 	EXPECT_TRUE(rows[1]->getIsChanged());
 	EXPECT_EQ(1, m_calls.changed);
 }
@@ -147,10 +139,8 @@ TEST_F(EventRowTest, LunarDateInALeapMonthKeepsCalendarTypeAndLeapFlagAfterSavin
 	ASSERT_TRUE(ScreenHarness::click(toLunar));
 	m_screen->pumpUntilIdle();
 	ASSERT_NE(nullptr, m_screen->findButton(tr("IDS_PB_ACBUTTON_LUNAR_ABB")));
-	struct tm shown = {};
-	elm_datetime_value_get(popupDatetime(), &shown);
 	// 22 March 2023 is the first day of the leap second month of the lunar year 2023.
-	EXPECT_EQ("2023-2-1", shownDate(shown));
+	EXPECT_EQ("2023-2-1", shownPickerDate(*m_screen));
 	ASSERT_TRUE(ScreenHarness::click(m_screen->findButton(tr("IDS_PB_SK_SET"))));
 	m_screen->pumpUntilIdle();
 	ASSERT_EQ(CONTACTS_ERROR_NONE, m_data->updateContact());

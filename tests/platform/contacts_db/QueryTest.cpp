@@ -112,29 +112,3 @@ TEST(Query, NumberFiltersNestingSortOffsetLimitProjectionChildViewsAndBadArgumen
 	contacts_filter_add_str(byNumber.filter, _contacts_number.cleaned_number, CONTACTS_MATCH_STARTSWITH, "+8210");
 	EXPECT_EQ(1u, byNumber.run(_contacts_number.id).size());
 }
-
-TEST(Query, CommonAndRareSearchTextsGiveTheSameFirstPageEitherWay)
-{
-	ConnectedStore store;
-	contacts_list_h list = nullptr;
-	contacts_list_create(&list);
-	ListPtr owner(list);
-	for (int i = 0; i < 700; ++i)
-		contacts_list_add(list, makeContact({ "Anna", "N" + std::to_string(1000 - i) }).release());
-	contacts_list_add(list, makeContact({ "Zanna", "Aaron" }).release());
-	ASSERT_EQ(CONTACTS_ERROR_NONE, contacts_db_insert_records(list, nullptr, nullptr));
-
-	for (auto [text, expected] : { std::pair{ "ann", 701 }, { "anna n30", 9 }, { "Zann", 1 } }) {
-		QueryOwner q(_contacts_person._uri);
-		contacts_filter_add_str(q.filter, _contacts_person.display_name, CONTACTS_MATCH_CONTAINS, text);
-		contacts_query_set_sort(q.query, _contacts_person.display_name, true);
-		std::vector<int> all = q.run(_contacts_person.id);
-		std::vector<int> page = q.run(_contacts_person.id, 0, 10);
-		EXPECT_EQ(expected, static_cast<int>(all.size())) << text;
-		all.resize(std::min<size_t>(all.size(), 10));
-		EXPECT_EQ(all, page) << text;
-		int count = 0;
-		contacts_db_get_count_with_query(q.query, &count);
-		EXPECT_EQ(expected, count) << text;
-	}
-}

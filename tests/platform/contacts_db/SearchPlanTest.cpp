@@ -1,6 +1,6 @@
 // The plan of a limited "display name contains" read: walking in name order
 // when the matches come early, the trigram index when they are few or sort
-// late; either way the same page as an unlimited read.
+// late; either way the same page and count as an unlimited read.
 #include "ContactsConnection.h"
 #include "ContactsSearchPlanner.h"
 #include "ContactsTestSupport.h"
@@ -80,6 +80,9 @@ TEST(SearchPlan, EveryPlanGivesThePageOfTheUnlimitedRead)
 					contacts_query_set_sort(q.query, sort.prop, sort.ascending);
 				contacts_query_set_sort(q.query, _contacts_person.id, true);
 				std::vector<int> all = q.run(_contacts_person.id);
+				int count = -1;
+				EXPECT_EQ(CONTACTS_ERROR_NONE, contacts_db_get_count_with_query(q.query, &count));
+				EXPECT_EQ(static_cast<int>(all.size()), count) << text;
 				std::vector<int> expected(all.begin() + std::min<size_t>(offset, all.size()),
 					all.begin() + std::min<size_t>(offset + 10, all.size()));
 				EXPECT_EQ(expected, q.run(_contacts_person.id, offset, 10))

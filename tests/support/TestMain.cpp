@@ -13,6 +13,11 @@ int main(int argc, char** argv)
 	if (!dir)
 		return 2;
 	setenv("CONTACTS_DATA_DIR", dir, 1);
+	// The toolkit starts a desktop-cache daemon that inherits this program's
+	// output and lives while any program on the same socket folder uses it;
+	// one per run, ending with it, keeps a parallel test runner from waiting
+	// on the daemon long after this program is done.
+	setenv("XDG_RUNTIME_DIR", dir, 1);
 	setenv("ELM_ENGINE", "buffer", 0);
 	setenv("ECORE_EVAS_ENGINE", "buffer", 0);
 	setenv("CONTACTS_LOG_LEVEL", "error", 0);
